@@ -1,0 +1,56 @@
+# ARBOLEX — build, run and test. `make run` and `make test` do all the set-up
+# on a fresh Debian 12 machine (missing packages are installed with apt-get).
+
+BUILD   ?= build
+JOBS    ?= $(shell nproc)
+CMAKE_FLAGS ?=
+GEN     := -G Ninja
+
+.PHONY: all deps build run test bench test-asan test-noqt format format-check ci clean
+
+all: build
+
+deps:
+	@scripts/install-deps.sh
+
+$(BUILD)/build.ninja: | deps
+	@cmake -S . -B $(BUILD) $(GEN) -DCMAKE_BUILD_TYPE=Release -DARBOLEX_WERROR=ON $(CMAKE_FLAGS) >/dev/null
+
+build: deps $(BUILD)/build.ninja
+	@cmake --build $(BUILD) -j $(JOBS)
+
+run: build
+	@scripts/run.sh $(BUILD)/bin
+
+test: build
+	@cd $(BUILD) && ctest --output-on-failure -j $(JOBS)
+
+bench: build
+	@scripts/bench.sh $(BUILD)/bin
+
+# Engine, application and command-line tests under AddressSanitizer and
+# UndefinedBehaviorSanitizer (the windows are left out of this build).
+test-asan: deps
+	@cmake -S . -B build-asan $(GEN) -DCMAKE_BUILD_TYPE=RelWithDebInfo -DARBOLEX_WERROR=ON \
+	    -DARBOLEX_SANITIZE=ON -DARBOLEX_WITH_GUI=OFF -DARBOLEX_BENCH=OFF >/dev/null
+	@cmake --build build-asan -j $(JOBS)
+	@cd build-asan && ctest --output-on-failure -j $(JOBS)
+
+# The engine alone, without Qt: proves it depends on the standard library only.
+test-noqt:
+	@scripts/install-deps.sh --no-gui
+	@cmake -S . -B build-noqt $(GEN) -DCMAKE_BUILD_TYPE=Debug -DARBOLEX_WERROR=ON \
+	    -DARBOLEX_WITH_QT=OFF -DARBOLEX_BENCH=OFF >/dev/null
+	@cmake --build build-noqt -j $(JOBS)
+	@cd build-noqt && ctest --output-on-failure -j $(JOBS)
+
+format:
+	@git ls-files '*.cpp' '*.hpp' | xargs clang-format -i
+
+format-check: deps
+	@git ls-files '*.cpp' '*.hpp' | xargs clang-format --dry-run --Werror
+
+ci: format-check test test-noqt test-asan
+
+clean:
+	@rm -rf $(BUILD) build-asan build-noqt

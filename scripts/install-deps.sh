@@ -1,0 +1,30 @@
+#!/usr/bin/env bash
+# Installs the Debian packages that ARBOLEX needs to build, test and run.
+# Idempotent: prints nothing and touches nothing when every package is present.
+# Usage: scripts/install-deps.sh [--no-gui]   (--no-gui: engine-only build)
+set -euo pipefail
+
+packages=(build-essential cmake ninja-build pkg-config
+          libgtest-dev libgmock-dev libbenchmark-dev clang-format)
+if [[ "${1:-}" != "--no-gui" ]]; then
+    packages+=(qt6-base-dev qt6-multimedia-dev libgl-dev
+               fonts-dejavu-core xvfb xauth)
+fi
+
+missing=()
+for p in "${packages[@]}"; do
+    if ! dpkg-query -W -f='${Status}' "$p" 2>/dev/null | grep -q 'install ok installed'; then
+        missing+=("$p")
+    fi
+done
+[[ ${#missing[@]} -eq 0 ]] && exit 0
+
+echo "Installing missing packages: ${missing[*]}"
+sudo=()
+if [[ $(id -u) -ne 0 ]]; then
+    command -v sudo >/dev/null || { echo "error: not root and sudo is not available" >&2; exit 1; }
+    sudo=(sudo)
+fi
+export DEBIAN_FRONTEND=noninteractive
+"${sudo[@]}" apt-get update -qq
+"${sudo[@]}" apt-get install -y -qq --no-install-recommends "${missing[@]}" >/dev/null
