@@ -6,8 +6,9 @@
 #include "engine/checkedmath.hpp"
 #include "engine/grow.hpp"
 
+#include <array>
+#include <charconv>
 #include <cmath>
-#include <string>
 #include <string_view>
 
 namespace arbolex::engine {
@@ -21,8 +22,12 @@ constexpr std::string_view kSiteScaledModels;
 [[maybe_unused]] constexpr std::string_view kSiteScaleCandidates = "+14+15+20+21+";
 
 bool isSiteScaled(int modelId) {
-    const std::string key = "+" + std::to_string(modelId) + "+";
-    return kSiteScaledModels.find(key) != std::string_view::npos;
+    // The identifier is searched between two "+" signs.
+    std::array<char, 16> key{'+'};
+    char *end = std::to_chars(key.data() + 1, key.data() + key.size() - 1, modelId).ptr;
+    *end++ = '+';
+    const std::string_view needle(key.data(), static_cast<std::size_t>(end - key.data()));
+    return kSiteScaledModels.find(needle) != std::string_view::npos;
 }
 
 } // namespace
