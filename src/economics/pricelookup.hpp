@@ -1,0 +1,60 @@
+#pragma once
+
+#include "economics/pricedata.hpp"
+#include "shell/runtimeerror.hpp"
+
+#include <QLatin1String>
+#include <QLocale>
+
+#include <array>
+
+namespace arbolex::shell {
+class IInteractive;
+}
+
+namespace arbolex::economics {
+
+/// Captions of the 13 mean-tree-volume classes (m³ per tree), shown by the
+/// timber prices window as `lblTimbCat`(0 to 12). The price lookup reads the
+/// class bounds back from these texts, so they are part of the design: the
+/// bounds have three decimals and leave gaps of 0.001 m³ between classes.
+inline constexpr std::array<QLatin1String, kPriceClassCount> kTimberCategoryCaptions = {
+    QLatin1String("Up to .074:"),    QLatin1String(".075 to .124:"), QLatin1String(".125 to .174:"),
+    QLatin1String(".175 to .224:"),  QLatin1String(".225 to .274:"), QLatin1String(".275 to .424:"),
+    QLatin1String(".425 to .499:"),  QLatin1String(".500 to .599:"), QLatin1String(".600 to .699:"),
+    QLatin1String(".700 to .799:"),  QLatin1String(".800 to .899:"), QLatin1String(".900 to .999:"),
+    QLatin1String("1.000 and Over:")};
+
+/// Outcome of walking the class captions for one mean tree volume.
+struct PriceClassWalk {
+    /// Class 0 to 12 that holds the volume; 0 after a failure.
+    int priceClass = 0;
+    /// 13 "Type mismatch" when a caption bound does not convert under the locale.
+    shell::RuntimeError error;
+    /// Statement number of the failing conversion.
+    int line = 0;
+};
+
+/// Finds the class of `meanTreeVolume` (m³ per tree) from the captions, in
+/// ascending order: class 0 when its upper bound is ≥ the volume (so zero and
+/// negative volumes too), class 1 to 11 when lower bound ≤ volume ≤ upper
+/// bound, class 12 for everything else, including volumes that fall in the
+/// 0.001 gaps between two classes (0.0745 is class 12, the top price). The
+/// bounds are read from the captions each time, converted with `locale`.
+PriceClassWalk walkPriceClasses(double meanTreeVolume, const QLocale &locale);
+
+/// Standing price, euro per m³, of a mean tree volume (m³ per tree), always
+/// from the current prices and with its sign, whichever list is in use. When a
+/// caption does not convert under `locale`, shows "Error 13  Type mismatch in
+/// line N in procedure TrouveIndicePrix of Feuille frmMain", logs nothing and
+/// returns 0.
+double TrouveIndicePrix(double meanTreeVolume, const PriceList &current,
+                        shell::IInteractive &interactive,
+                        const QLocale &locale = QLocale::system());
+
+/// Price class 0 to 12 of a mean tree volume, by the same walk; after a caption
+/// that does not convert, shows the same message as TrouveIndicePrix and returns 0.
+int priceClassOf(double meanTreeVolume, shell::IInteractive &interactive,
+                 const QLocale &locale = QLocale::system());
+
+} // namespace arbolex::economics
