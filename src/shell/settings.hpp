@@ -1,0 +1,35 @@
+#pragma once
+
+#include <QRect>
+
+class QSettings;
+
+namespace arbolex::shell {
+
+/// Per-user settings section of the program.
+inline constexpr const char *kSettingsSection = "Settings";
+
+/// Size of the main window when no usable placement is stored, pixels.
+inline constexpr int kDefaultMainWidth = 1100;
+inline constexpr int kDefaultMainHeight = 720;
+
+/// Interest rate when none is stored, percent.
+inline constexpr double kDefaultInterestRate = 5.0;
+
+/// Main window placement from "MainLeft", "MainTop", "MainWidth" and
+/// "MainHeight". When one is missing or not a number, the size is not
+/// positive, or the window would not show at least 100 × 50 pixels of
+/// `availableScreen`, the window gets the default size (shrunk to the screen)
+/// centred on `availableScreen`. A stored size larger than the screen is shrunk to it.
+QRect readMainPlacement(QSettings &settings, const QRect &availableScreen);
+
+/// Stores the main window placement.
+void writeMainPlacement(QSettings &settings, const QRect &placement);
+
+/// Interest rate, percent, from "InterestRate"; kDefaultInterestRate when
+/// missing or not a number.
+double readInterestRate(QSettings &settings);
+
+void writeInterestRate(QSettings &settings, double percent);
+
+} // namespace arbolex::shell
