@@ -1,0 +1,48 @@
+#include "shell/apperror.hpp"
+
+#include <cstdint>
+#include <limits>
+
+namespace arbolex::shell {
+
+QString appFaultDescription(int number) {
+    switch (number) {
+    case kAppInvalidCall:
+        return QStringLiteral("Invalid procedure call or argument");
+    case kAppOverflow:
+        return QStringLiteral("Overflow");
+    case kAppOutOfMemory:
+        return QStringLiteral("Out of memory");
+    case kAppDivisionByZero:
+        return QStringLiteral("Division by zero");
+    case kAppTypeMismatch:
+        return QStringLiteral("Type mismatch");
+    default:
+        return QStringLiteral("Internal error");
+    }
+}
+
+void raiseAppFault(int number, std::source_location where) {
+    throw AppFault{number, appFaultDescription(number), static_cast<int>(where.line())};
+}
+
+QString windowFaultLine(const AppFault &fault, const QString &label) {
+    return QStringLiteral("Error # :") + QString::number(fault.number) + QStringLiteral("  ") +
+           fault.description + QStringLiteral(" in line ") + QString::number(fault.line) + label;
+}
+
+QString moduleFaultLine(const AppFault &fault, const QString &label) {
+    return QStringLiteral("Error ") + QString::number(fault.number) + QLatin1Char(' ') +
+           fault.description + QStringLiteral(" in line ") + QString::number(fault.line) + label;
+}
+
+std::int16_t addInt16(int a, int b, std::source_location where) {
+    const int sum = a + b;
+    if (sum < std::numeric_limits<std::int16_t>::min() ||
+        sum > std::numeric_limits<std::int16_t>::max()) {
+        raiseAppFault(kAppOverflow, where);
+    }
+    return static_cast<std::int16_t>(sum);
+}
+
+} // namespace arbolex::shell

@@ -1,0 +1,129 @@
+#pragma once
+
+// Every text the main window shows, in one place: a changed caption is one edit.
+
+#include <QString>
+
+namespace arbolex::workflow::text {
+
+// Titles
+inline QString titleArbolex() {
+    return QStringLiteral("ARBOLEX --- OSTRAN DYNAMIC YIELD MODELS FOR FOREST MANAGMENT");
+}
+inline QString titleOstran() {
+    return QStringLiteral("OSTRAN DYNAMIC YIELD MODELS FOR FOREST MANAGMENT");
+}
+/// Title of the thinning messages, misspelt as it always was.
+inline QString titleArbolexYeld() {
+    return QStringLiteral("ARBOLEX --- OSTRAN DYNAMIC YELD MODELS FOR FOREST MANAGMENT");
+}
+inline QString captionModelInUse() {
+    return QStringLiteral("   ---- MODEL IN USE :  ");
+}
+
+// Form check of the grow-from fields
+inline QString faultFromAge() {
+    return QStringLiteral("FAULT - Grow From AGE has not been specified correctly.");
+}
+inline QString faultFromStocking() {
+    return QStringLiteral("FAULT - Grow From STOCKING has not been specified correctly.");
+}
+inline QString faultFromHeight() {
+    return QStringLiteral("FAULT - Grow From TOP HEIGHT has not been specified correctly.");
+}
+inline QString faultFromBasalAreaOrDbh() {
+    return QStringLiteral(
+        "FAULT - Grow From BASAL AREA or Mean DBH has not been specified correctly.");
+}
+inline QString faultToAge() {
+    return QStringLiteral("FAULT - Grow To AGE has not been specified correctly.");
+}
+inline QString faultByStep() {
+    return QStringLiteral("FAULT - Grow BY Step AGE has not been specified correctly.");
+}
+
+// Range check
+inline QString rangeAge() {
+    return QStringLiteral("FAULT - Grow From AGE not in acceptable range [10, 60]");
+}
+inline QString rangeStocking() {
+    return QStringLiteral("FAULT - Grow From STOCKING not in acceptable range [100, 5000]");
+}
+inline QString rangeHeightLead() {
+    return QStringLiteral("FAULT - Grow From TOP HEIGHT not in acceptable range [5,");
+}
+inline QString incompatibleBasalAreaDbh() {
+    return QStringLiteral("FAULT - Grow From BASAL AREA & DIAMETER fields are incompatible.");
+}
+inline QString rangeBasalArea() {
+    return QStringLiteral("FAULT - Grow From BASAL AREA not in acceptable range [10, 100]");
+}
+inline QString rangeToAgeLead() {
+    return QStringLiteral("FAULT - Grow To AGE not in acceptable range [10,");
+}
+inline QString maximumHeight() {
+    return QStringLiteral("Maximum height alowed is 49");
+}
+
+// Grow command
+inline QString changesNotAllowed() {
+    return QStringLiteral("Changes are not allowed in the growing process. ") +
+           QStringLiteral("\r\n") +
+           QStringLiteral(" If you wish to have a different projection, ") +
+           QStringLiteral("\r\n") +
+           QStringLiteral("use the Clear All button and enter the new informations.");
+}
+inline QString projectionFailed() {
+    return QStringLiteral("Error - unable to complete Projection (state inversion problem).");
+}
+inline QString transferFailed() {
+    return QStringLiteral("ERROR - difficulty in transferring data.");
+}
+
+// Yield class hints
+inline QString yieldClassInsufficient() {
+    return QStringLiteral("Insufficient data to calculate accurate Yield Class");
+}
+inline QString yieldClassAtClearfell() {
+    return QStringLiteral("Yield Class calculated at clearfell age");
+}
+
+// Row labels
+inline QString rowLabelGrowth() {
+    return QStringLiteral("G yr");
+}
+inline QString rowLabelThinning() {
+    return QStringLiteral("T yr");
+}
+
+// Information
+inline QString speciesNotFound() {
+    return QStringLiteral("Species not found! Please select a model in the Model Menu.");
+}
+inline QString thresholdLead() {
+    return QStringLiteral("The threshold BA for ");
+}
+inline QString thresholdIs() {
+    return QStringLiteral(" is :  ");
+}
+inline QString thresholdNotCalculated() {
+    return QStringLiteral(" is not calculated but would be & vbCrLf & equal or greater then :");
+}
+inline QString warnLead() {
+    return QStringLiteral("Please note the following with regard to use of:");
+}
+
+// Buttons
+inline QString gotoSummary() {
+    return QStringLiteral("GoTo Summary");
+}
+inline QString showTimberPrices() {
+    return QStringLiteral("Show Timber Prices");
+}
+
+/// "O.R." stands in both volume cells when the volume is 0 or less.
+inline QString outOfRange() {
+    return QStringLiteral("O.R.");
+}
+
+} // namespace arbolex::workflow::text

@@ -1,0 +1,155 @@
+#pragma once
+
+// The logic of the main window `frmMain`: the grow-from inputs and their
+// checks, the grow command, the projection table, clearing, the model menu,
+// and the window's load and unload. It talks to its window only through
+// IMainView and asks the user only through IInteractive, so its handlers can
+// call one another with no person at the keyboard.
+
+#include "engine/grow.hpp"
+#include "workflow/imainview.hpp"
+#include "workflow/projectiontable.hpp"
+
+#include <QString>
+
+#include <array>
+#include <cstdint>
+#include <vector>
+
+class QSettings;
+
+namespace arbolex::shell {
+class ErrorLog;
+class IInteractive;
+} // namespace arbolex::shell
+
+namespace arbolex::economics {
+class Prices;
+} // namespace arbolex::economics
+
+namespace arbolex::workflow {
+
+/// The grow-from values as read from the fields.
+struct GrowFrom {
+    float age = 0.0f;       ///< years
+    float stocking = 0.0f;  ///< stems/ha
+    float topHeight = 0.0f; ///< m
+    float basalArea = 0.0f; ///< m²/ha
+    float dbh = 0.0f;       ///< cm
+    float targetAge = 0.0f; ///< years
+    float step = 0.0f;      ///< years
+};
+
+class MainWindowLogic {
+public:
+    MainWindowLogic(engine::Grow &grow, economics::Prices &prices, shell::ErrorLog &log,
+                    QString dataFolder, IMainView &view, shell::IInteractive &interactive);
+
+    // ---- Start-up and exit --------------------------------------------------
+
+    /// The window's load: placement from `settings` (centred on `screen` when
+    /// absent), the start-up file, the stored model, the price lists, captions.
+    void Form_Load(QSettings &settings, const QRect &screen);
+    /// The window's unload: placement, the start-up file, prices and categories.
+    void Form_Unload(QSettings &settings);
+    /// The model chosen in the model-choice window.
+    void SetModelFromfrmModelChoice(int modelId);
+    /// Model menu entry `index` (the model identifier).
+    void mnuModel_Click(int index);
+
+    // ---- Commands -------------------------------------------------------------
+
+    void cmdGrow_Click();
+    void cmdClear_Click();
+    /// Clear All: empties the table and shows the header without money column.
+    void ClearAll();
+    /// Copies the current table row into the grow-from fields.
+    void UseFlxRow();
+    /// Tells the threshold basal area of the active species.
+    void TrhesholdInfo();
+    /// Notes on the valid use of the active model.
+    void Warn();
+    /// Text of the notes shown by Warn().
+    QString warnText() const;
+
+    // ---- Fields -----------------------------------------------------------------
+
+    /// The key filter of every numeric field: digits and the decimal point
+    /// pass; any other character is discarded.
+    static bool KeyFilter(QChar key);
+    /// Types `text` into a field as a user would (each character through the
+    /// key filter of a numeric field), then leaves it.
+    void typeText(MainControl control, const QString &text);
+    /// Leaving a field runs its lost-focus handler.
+    void leaveField(MainControl control);
+    void txtFromA_LostFocus();
+    void txtFromH_LostFocus();
+
+    // ---- Checks and the grow-from values ----------------------------------------
+
+    bool ChkGrowFromFlds();
+    bool ChkGrowFromBnds();
+    bool ChkGrowFromBD();
+    GrowFrom GetGrowFrom() const;
+    /// Writes the grow-from fields in their display formats.
+    bool SetGrowFrom(float age, float basalArea, float stocking, float topHeight, float targetAge,
+                     float step);
+
+    // ---- The projection table -------------------------------------------------------
+
+    /// Appends one row per newly projected state (m_states[m_firstNew..]) of
+    /// `kind`, then refreshes the yield class.
+    void AppendGrid(RowKind kind, const QString &label);
+    const ProjectionTable &table() const { return m_table; }
+    /// Sets the current row and the end of the selection of `flxMain`.
+    void select(int row, int endRow);
+
+    /// Yield class of the rows so far: 0 while the MAI has not culminated.
+    int yieldClass() const;
+    /// Tallest top height the active model accepts, m.
+    float maxTopHeight() const { return m_grow.maxTopHeight(); }
+    /// Oldest target age the active model accepts, years.
+    int maxTargetAge() const;
+    /// Volume per ha of the last growth row, m³/ha.
+    double standingVolume() const { return m_standingVolume; }
+
+    engine::Grow &grow() { return m_grow; }
+    IMainView &view() { return m_view; }
+    shell::IInteractive &interactive() { return m_interactive; }
+    shell::ErrorLog &errorLog() { return m_log; }
+
+private:
+    QString field(MainControl c) const;
+    void message(const QString &title, const QString &text, int style);
+    /// Shows a range fault, moves the focus to `control` and returns false.
+    bool refuse(const QString &title, const QString &text, int style, MainControl control);
+    void showSiteIndex(float age, float topHeight);
+    bool changeCheck() const;
+    void restoreFromRow();
+    void copyRowToFields(int row);
+    void afterClear(HeaderLayout layout);
+    void updateCaption();
+    void updateYieldClassLabel();
+    void buildGrowthCells(TableRow &row, int rowIndex) const;
+    void writeIncrements(int rowIndex);
+    bool continuesFromRow(int row) const;
+    float thresholdBasalArea();
+
+    engine::Grow &m_grow;
+    economics::Prices &m_prices;
+    shell::ErrorLog &m_log;
+    QString m_dataFolder;
+    IMainView &m_view;
+    shell::IInteractive &m_interactive;
+
+    ProjectionTable m_table;
+    /// The states of the last projection and the first of them to append.
+    std::vector<engine::StandState> m_states;
+    std::size_t m_firstNew = 0;
+    /// Volume per ha of the last growth row, m³/ha.
+    double m_standingVolume = 0.0;
+    /// Set by the grow command of an un-thinned model.
+    std::array<bool, 2> m_growing{};
+};
+
+} // namespace arbolex::workflow

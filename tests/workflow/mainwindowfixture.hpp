@@ -1,0 +1,64 @@
+#pragma once
+
+#include "mocks/fakeinteractive.hpp"
+#include "mocks/qtprinters.hpp"
+
+#include "economics/prices.hpp"
+#include "engine/grow.hpp"
+#include "shell/enginereport.hpp"
+#include "shell/errorlog.hpp"
+#include "workflow/headlessmainview.hpp"
+#include "workflow/mainwindowlogic.hpp"
+
+#include <QFile>
+#include <QTemporaryDir>
+
+#include <gtest/gtest.h>
+
+namespace arbolex::testing {
+
+using workflow::MainControl;
+
+/// A main window without a screen over a temporary data folder, with model 0
+/// active and the grow-from fields of a young Sitka spruce stand.
+class MainWindowTest : public ::testing::Test {
+protected:
+    MainWindowTest() {
+        grow.GetModel(0);
+        logic.mnuModel_Click(0);
+    }
+
+    void type(MainControl c, const QString &text) { logic.typeText(c, text); }
+
+    /// Age 15, 2500 stems/ha, 7 m, 20 m²/ha, to `to` by `by`.
+    void typeStand(const QString &to = QStringLiteral("50"),
+                   const QString &by = QStringLiteral("5")) {
+        type(MainControl::txtFromA, QStringLiteral("15"));
+        type(MainControl::txtFromN, QStringLiteral("2500"));
+        type(MainControl::txtFromH, QStringLiteral("7"));
+        type(MainControl::txtFromB, QStringLiteral("20"));
+        type(MainControl::txtToA, to);
+        type(MainControl::txtByA, by);
+    }
+
+    QString cell(int row, int column) const { return logic.table().row(row).cells.value(column); }
+
+    QStringList logLines() const {
+        QFile f(log.path());
+        if (!f.open(QIODevice::ReadOnly)) {
+            return {};
+        }
+        return QString::fromUtf8(f.readAll()).split(QStringLiteral("\r\n"), Qt::SkipEmptyParts);
+    }
+
+    QTemporaryDir dir;
+    shell::ErrorLog log{dir.path()};
+    FakeInteractive interactive;
+    shell::EngineReport report{interactive, log};
+    engine::Grow grow{&report};
+    economics::Prices prices;
+    workflow::HeadlessMainView view;
+    workflow::MainWindowLogic logic{grow, prices, log, dir.path(), view, interactive};
+};
+
+} // namespace arbolex::testing
