@@ -39,7 +39,8 @@ bool Grow::SiteIndex(float A, float H) {
         const double t0 = S(7);
         const double r = checked::div(30.0 - t0, A - t0);
         const double remaining = 1.0 - checked::div(checked::pow(H, b), K);
-        const double si = checked::pow(K * (1.0 - checked::pow(remaining, r)), checked::div(1.0, b));
+        const double si =
+            checked::pow(K * (1.0 - checked::pow(remaining, r)), checked::div(1.0, b));
         m_siteIndex = checked::single(si);
     } catch (const RuntimeFault &fault) {
         // The caller shows an empty site index; the failure goes to the log.
@@ -91,8 +92,8 @@ void Grow::TM(float SI) {
             m_m2[i][2] = checked::single(m_m2[i][2] + checked::div(W[i], s8));
         }
     } catch (const RuntimeFault &fault) {
-        reportFault(fault, titles::kArbolex, "ERROR - Unable to make transition matrix: ",
-                    " in Grow.TM()");
+        reportFault(fault, titles::kArbolex,
+                    "ERROR - Unable to make transition matrix: ", " in Grow.TM()");
     }
 }
 
@@ -167,8 +168,8 @@ void Grow::STATEYR(float &A, float &G, float &N, float &H, float &A2, float &SI)
         N = checked::single(pow(p2, S(20)));
         H = checked::single(pow(p3, 1.0 / S(1)));
     } catch (const RuntimeFault &fault) {
-        reportFault(fault, titles::kArbolex, "ERROR - Unable to convert to nearest year: ",
-                    " in Grow.STATEYR()");
+        reportFault(fault, titles::kArbolex,
+                    "ERROR - Unable to convert to nearest year: ", " in Grow.STATEYR()");
     }
 }
 
@@ -213,9 +214,8 @@ bool Grow::PROJ(float A, float G, float N, float H, float targetAge, float step,
         StandState current = states.back();
         for (long long k = 1; k <= stepCount; ++k) {
             const bool last = k == stepCount;
-            const StepFactors f = (last && lastYears > 0.0)
-                                      ? projectionFactors(direction * lastYears, rho)
-                                      : whole;
+            const StepFactors f =
+                (last && lastYears > 0.0) ? projectionFactors(direction * lastYears, rho) : whole;
             State3 next{};
             applyStep(forward(current.basalArea, current.stocking, current.topHeight), f.f1, f.f2,
                       f.f3, next);
@@ -225,8 +225,9 @@ bool Grow::PROJ(float A, float G, float N, float H, float targetAge, float step,
                 return false;
             }
             const float age =
-                last ? targetAge
-                     : static_cast<float>(startAge + direction * static_cast<double>(k) * stepYears);
+                last
+                    ? targetAge
+                    : static_cast<float>(startAge + direction * static_cast<double>(k) * stepYears);
             current = inverseComplete(next, age);
             current.volume = GetV7(current.basalArea, current.stocking, current.topHeight);
             states.push_back(current);

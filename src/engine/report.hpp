@@ -6,8 +6,8 @@ namespace arbolex::engine {
 
 /// Message-box styles used by the engine (icon plus buttons).
 enum MessageStyle : int {
-    kStyleCritical = 16,         ///< stop icon, OK
-    kStyleExclamation = 48,      ///< exclamation icon, OK
+    kStyleCritical = 16,    ///< stop icon, OK
+    kStyleExclamation = 48, ///< exclamation icon, OK
     kStyleExclamationOkCancel = 49,
     kStyleInformation = 64,
 };

@@ -15,7 +15,8 @@ constexpr std::string_view kParn2b2Lead =
     "ERROR - in calculating Residual Stocking partial derivative. Reason: ";
 constexpr std::string_view kParfb2Lead =
     "ERROR - in calculating Volume Equation partial derivative. Reason: ";
-constexpr std::string_view kNewtonLead = "ERROR - Calculation error in Newton's algorithm. Reason: ";
+constexpr std::string_view kNewtonLead =
+    "ERROR - Calculation error in Newton's algorithm. Reason: ";
 } // namespace
 
 float Grow::nres(float H, float N, float G, float Gr) const {
@@ -61,11 +62,10 @@ double Grow::parfb2(float H, float N, float G, float Nr, float Gr) const {
     const double gr = Gr;
     // Every term is evaluated here, zero coefficients included; V7..V9 do not
     // depend on Gr once multiplied by G.
-    const double d = m_v[0] + m_v[1] * h +
-                     m_v[2] * h * (pow(nr, -0.5) - 0.5 * gr * np * pow(nr, -1.5)) +
-                     m_v[3] * h * np + div(m_v[4], h) +
-                     m_v[5] * h * (div(1.0, nr) - div(gr * np, nr * nr)) +
-                     div(m_v[6] * 2.0 * gr, h);
+    const double d =
+        m_v[0] + m_v[1] * h + m_v[2] * h * (pow(nr, -0.5) - 0.5 * gr * np * pow(nr, -1.5)) +
+        m_v[3] * h * np + div(m_v[4], h) + m_v[5] * h * (div(1.0, nr) - div(gr * np, nr * nr)) +
+        div(m_v[6] * 2.0 * gr, h);
     return checked::finite(-double{m_vcf} * d, checked::Here::current());
 }
 

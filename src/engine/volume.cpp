@@ -39,8 +39,8 @@ float Grow::GetV7(float G, float N, float H) {
     try {
         return getV7(G, N, H);
     } catch (const RuntimeFault &fault) {
-        reportFault(fault, titles::kArbolex, "Unable to complete volume calculation. Reason: ",
-                    " in Grow.GetV7()");
+        reportFault(fault, titles::kArbolex,
+                    "Unable to complete volume calculation. Reason: ", " in Grow.GetV7()");
         return 0.0f;
     }
 }

@@ -15,6 +15,8 @@ void EngineReport::showMessage(std::string_view title, std::string_view text, in
     m_interactive->message(fromUtf8(title), fromUtf8(text), style);
 }
 
-void EngineReport::logError(std::string_view message) { m_log->append(fromUtf8(message)); }
+void EngineReport::logError(std::string_view message) {
+    m_log->append(fromUtf8(message));
+}
 
 } // namespace arbolex::shell

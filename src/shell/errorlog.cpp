@@ -15,8 +15,7 @@ void ErrorLog::append(const QString &message) {
     const QLocale locale = QLocale::system();
     const QString line = message + QLatin1Char(' ') +
                          locale.toString(now.date(), QLocale::ShortFormat) + QLatin1Char(' ') +
-                         now.time().toString(QStringLiteral("HH:mm:ss")) +
-                         QStringLiteral("\r\n");
+                         now.time().toString(QStringLiteral("HH:mm:ss")) + QStringLiteral("\r\n");
     QFile file(m_path);
     if (file.open(QIODevice::WriteOnly | QIODevice::Append)) {
         file.write(line.toUtf8());

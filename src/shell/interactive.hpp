@@ -6,11 +6,11 @@ namespace arbolex::shell {
 
 /// Message-box styles: icon plus buttons, as the messages have always used them.
 enum MessageStyle : int {
-    kCritical = 16,               ///< stop icon, OK
-    kQuestion = 32,               ///< question icon
-    kExclamation = 48,            ///< exclamation icon, OK
-    kExclamationOkCancel = 49,    ///< exclamation icon, OK and Cancel
-    kInformation = 64,            ///< information icon, OK
+    kCritical = 16,            ///< stop icon, OK
+    kQuestion = 32,            ///< question icon
+    kExclamation = 48,         ///< exclamation icon, OK
+    kExclamationOkCancel = 49, ///< exclamation icon, OK and Cancel
+    kInformation = 64,         ///< information icon, OK
 };
 
 /// Message boxes and questions. Window logic asks the user only through this,

@@ -53,11 +53,10 @@ TEST(CatalogueTest, StructuralCoefficients) {
 }
 
 TEST(CatalogueTest, LabelsAndSpotValues) {
-    const std::set<std::string> labels = {"SS - (Thinned)",    "SS - (Un-thinned)",
-                                          "NS - (Thinned)",    "NS - (UnThinned)",
-                                          "DF - (Thinned)",    "DF - (Un-thinned)",
-                                          "LPC - (Thinned)",   "LPC - (Un-Thinned)",
-                                          "SP - (Thinned)",    "SP - (UnThinned)"};
+    const std::set<std::string> labels = {
+        "SS - (Thinned)", "SS - (Un-thinned)", "NS - (Thinned)",  "NS - (UnThinned)",
+        "DF - (Thinned)", "DF - (Un-thinned)", "LPC - (Thinned)", "LPC - (Un-Thinned)",
+        "SP - (Thinned)", "SP - (UnThinned)"};
     for (const auto &e : catalogue()) {
         EXPECT_EQ(labels.count(e.label), 1u) << e.label;
     }

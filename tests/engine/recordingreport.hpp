@@ -58,8 +58,8 @@ inline ::testing::AssertionResult nearRel(double expected, double actual, double
     if (std::fabs(expected - actual) <= rel * scale) {
         return ::testing::AssertionSuccess();
     }
-    return ::testing::AssertionFailure() << actual << " differs from " << expected
-                                         << " by more than " << rel << " relative";
+    return ::testing::AssertionFailure()
+           << actual << " differs from " << expected << " by more than " << rel << " relative";
 }
 
 } // namespace arbolex::engine::testing
