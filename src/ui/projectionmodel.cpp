@@ -1,0 +1,140 @@
+#include "ui/projectionmodel.hpp"
+
+#include <QBrush>
+#include <QColor>
+#include <QFont>
+
+namespace arbolex::ui {
+
+using workflow::RowKind;
+
+namespace {
+
+bool isSeparatorColumn(int tableColumn) {
+    return tableColumn == workflow::kColSeparator1 || tableColumn == workflow::kColSeparator2 ||
+           tableColumn == workflow::kColSeparator3;
+}
+
+/// Thinning rows stand out from the growth rows around them.
+QColor thinningTint() {
+    return {0xf6, 0xe7, 0xc8};
+}
+/// Rows of a projection that failed half-way.
+QColor failedTint() {
+    return {0xf4, 0xd3, 0xd0};
+}
+QColor separatorTint() {
+    return {0xd8, 0xdc, 0xd4};
+}
+
+} // namespace
+
+ProjectionModel::ProjectionModel(const workflow::ProjectionTable &table, QObject *parent)
+    : QAbstractTableModel(parent), m_table(table), m_rows(table.rowCount() - 1),
+      m_columns(table.visibleColumns()) {}
+
+int ProjectionModel::rowCount(const QModelIndex &parent) const {
+    return parent.isValid() ? 0 : m_rows;
+}
+
+int ProjectionModel::columnCount(const QModelIndex &parent) const {
+    return parent.isValid() ? 0 : static_cast<int>(m_columns.size());
+}
+
+QVariant ProjectionModel::data(const QModelIndex &index, int role) const {
+    if (!index.isValid() || index.row() >= m_rows || index.column() >= columnCount()) {
+        return {};
+    }
+    const workflow::TableRow &row = m_table.row(index.row() + 1);
+    const int column = tableColumn(index.column());
+    const bool separator = isSeparator(index.column());
+    switch (role) {
+    case Qt::DisplayRole:
+        return row.cells.value(column);
+    case Qt::TextAlignmentRole:
+        return QVariant::fromValue(Qt::AlignRight | Qt::AlignVCenter);
+    case Qt::BackgroundRole:
+        if (separator) {
+            return QBrush(separatorTint());
+        }
+        if (row.kind == RowKind::Thinning) {
+            return QBrush(thinningTint());
+        }
+        if (row.kind == RowKind::Failed) {
+            return QBrush(failedTint());
+        }
+        return {};
+    case Qt::FontRole:
+        if (row.isText()) {
+            QFont italic;
+            italic.setItalic(true);
+            return italic;
+        }
+        return {};
+    case SeparatorRole:
+        return separator;
+    default:
+        return {};
+    }
+}
+
+bool ProjectionModel::isSeparator(int column) const {
+    // A separator column that the header layout gives a caption of its own
+    // is shown as a column like the others.
+    const int shown = tableColumn(column);
+    return isSeparatorColumn(shown) && m_table.caption(shown).trimmed().isEmpty();
+}
+
+QVariant ProjectionModel::headerData(int section, Qt::Orientation orientation, int role) const {
+    if (orientation == Qt::Vertical) {
+        if (section < 0 || section >= m_rows) {
+            return {};
+        }
+        if (role == Qt::DisplayRole) {
+            return m_table.row(section + 1).label;
+        }
+        if (role == Qt::TextAlignmentRole) {
+            return QVariant::fromValue(Qt::AlignLeft | Qt::AlignVCenter);
+        }
+        return {};
+    }
+    if (section < 0 || section >= columnCount()) {
+        return {};
+    }
+    const int column = tableColumn(section);
+    switch (role) {
+    case Qt::DisplayRole:
+        return m_table.caption(column);
+    case GroupRole:
+        return workflow::ProjectionTable::groupCaption(column);
+    case SeparatorRole:
+        return isSeparator(section);
+    default:
+        return {};
+    }
+}
+
+void ProjectionModel::refresh(int firstRow) {
+    const int rows = m_table.rowCount() - 1;
+    const std::vector<int> columns = m_table.visibleColumns();
+    if (columns != m_columns || rows < m_rows || firstRow <= 1) {
+        beginResetModel();
+        m_rows = rows;
+        m_columns = columns;
+        endResetModel();
+        return;
+    }
+    // Rows the table rewrote in place, then the rows it appended.
+    const int lastKept = std::min(m_rows, rows);
+    if (firstRow - 1 < lastKept) {
+        emit dataChanged(index(firstRow - 1, 0), index(lastKept - 1, columnCount() - 1));
+        emit headerDataChanged(Qt::Vertical, firstRow - 1, lastKept - 1);
+    }
+    if (rows > m_rows) {
+        beginInsertRows({}, m_rows, rows - 1);
+        m_rows = rows;
+        endInsertRows();
+    }
+}
+
+} // namespace arbolex::ui
