@@ -1,0 +1,468 @@
+#include "ui/mainwindow.hpp"
+
+#include "engine/catalogue.hpp"
+#include "ui/groupheaderview.hpp"
+#include "ui/projectionmodel.hpp"
+#include "ui/windowtexts.hpp"
+#include "workflow/mainwindowlogic.hpp"
+
+#include <QAction>
+#include <QActionGroup>
+#include <QApplication>
+#include <QCloseEvent>
+#include <QGridLayout>
+#include <QGroupBox>
+#include <QHBoxLayout>
+#include <QHeaderView>
+#include <QKeyEvent>
+#include <QLabel>
+#include <QLineEdit>
+#include <QMenuBar>
+#include <QMessageBox>
+#include <QPushButton>
+#include <QTableView>
+#include <QVBoxLayout>
+
+namespace arbolex::ui {
+
+using workflow::MainControl;
+
+namespace {
+
+std::size_t slot(MainControl c) {
+    return static_cast<std::size_t>(c);
+}
+
+/// Width of a numeric field, in digits of the window's font.
+constexpr int kFieldDigits = 8;
+
+/// Width of the narrow separator columns of the grid, pixels.
+constexpr int kSeparatorWidth = 10;
+
+} // namespace
+
+MainWindow::MainWindow(QWidget *parent) : QMainWindow(parent) {
+    setObjectName(QStringLiteral("frmMain"));
+    buildMenus();
+
+    auto *central = new QWidget(this);
+    auto *layout = new QVBoxLayout(central);
+    layout->setContentsMargins(12, 10, 12, 12);
+    layout->setSpacing(10);
+    layout->addWidget(buildPanel());
+    buildGrid();
+    layout->addWidget(m_grid, 1);
+    setCentralWidget(central);
+}
+
+MainWindow::~MainWindow() {
+    while (m_busyDepth > 0) {
+        setBusy(false);
+    }
+}
+
+void MainWindow::attach(workflow::MainWindowLogic &logic, QSettings &settings) {
+    m_logic = &logic;
+    m_settings = &settings;
+    m_model = new ProjectionModel(logic.table(), this);
+    m_grid->setModel(m_model);
+    connect(m_model, &QAbstractItemModel::modelReset, this, &MainWindow::fitColumns);
+    connect(m_grid->selectionModel(), &QItemSelectionModel::selectionChanged, this,
+            &MainWindow::selectionToLogic);
+    connect(m_grid->selectionModel(), &QItemSelectionModel::currentRowChanged, this,
+            &MainWindow::selectionToLogic);
+    fitColumns();
+}
+
+void MainWindow::SetModelFromfrmModelChoice(int modelId) {
+    if (m_logic != nullptr) {
+        m_logic->SetModelFromfrmModelChoice(modelId);
+    }
+}
+
+// ---- Building the window ------------------------------------------------------------
+
+void MainWindow::buildMenus() {
+    QMenu *models = menuBar()->addMenu(text::menuModel());
+    models->setObjectName(QStringLiteral("mnuModel"));
+    m_modelActions = new QActionGroup(this);
+    m_modelActions->setExclusive(true);
+    for (int id = 0; id < engine::kModelCount; ++id) {
+        QAction *entry = models->addAction(text::modelEntry(id));
+        entry->setCheckable(true);
+        entry->setData(id);
+        m_modelActions->addAction(entry);
+    }
+    connect(m_modelActions, &QActionGroup::triggered, this, [this](QAction *entry) {
+        if (m_logic == nullptr) {
+            return;
+        }
+        m_logic->mnuModel_Click(entry->data().toInt());
+        // A refused choice leaves the active model where it was.
+        setActiveModel(m_logic->grow().modelId());
+    });
+
+    QMenu *help = menuBar()->addMenu(text::menuHelp());
+    connect(help->addAction(text::menuThreshold()), &QAction::triggered, this, [this] {
+        if (m_logic != nullptr) {
+            m_logic->TrhesholdInfo();
+        }
+    });
+    connect(help->addAction(text::menuNotes()), &QAction::triggered, this, [this] {
+        if (m_logic != nullptr) {
+            m_logic->Warn();
+        }
+    });
+    help->addSeparator();
+    connect(help->addAction(text::menuAbout()), &QAction::triggered, this, &MainWindow::about);
+}
+
+QLineEdit *MainWindow::addField(MainControl control) {
+    auto *field = new QLineEdit(this);
+    field->setObjectName(workflow::controlName(control));
+    field->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
+    field->setFixedWidth(field->fontMetrics().horizontalAdvance(QString(kFieldDigits, u'0')) + 16);
+    field->installEventFilter(this);
+    m_controls.at(slot(control)) = field;
+    return field;
+}
+
+QLabel *MainWindow::addResult(MainControl control) {
+    auto *label = new QLabel(this);
+    label->setObjectName(workflow::controlName(control));
+    label->setTextFormat(Qt::PlainText);
+    label->setFrameStyle(QFrame::StyledPanel | QFrame::Sunken);
+    label->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
+    label->setMinimumWidth(label->fontMetrics().horizontalAdvance(QString(6, u'0')) + 16);
+    label->setTextInteractionFlags(Qt::TextSelectableByMouse);
+    // As tall as the fields beside it, so the rows of every group line up.
+    label->setMinimumHeight(QLineEdit().sizeHint().height());
+    m_controls.at(slot(control)) = label;
+    return label;
+}
+
+QPushButton *MainWindow::addButton(MainControl control, const QString &caption) {
+    auto *button = new QPushButton(caption, this);
+    button->setObjectName(workflow::controlName(control));
+    button->setAutoDefault(false);
+    button->setMinimumWidth(button->fontMetrics().horizontalAdvance(text::buttonClearAll()) + 40);
+    m_controls.at(slot(control)) = button;
+    return button;
+}
+
+QWidget *MainWindow::buildPanel() {
+    auto *panel = new QWidget(this);
+    auto *row = new QHBoxLayout(panel);
+    row->setContentsMargins(0, 0, 0, 0);
+    row->setSpacing(12);
+
+    // A label and its field, in columns (column, column + 1) of a grid.
+    const auto place = [](QGridLayout *grid, int r, int column, const QString &caption,
+                          QWidget *field) {
+        auto *label = new QLabel(caption);
+        label->setBuddy(field);
+        grid->addWidget(label, r, column);
+        grid->addWidget(field, r, column + 1);
+    };
+    const auto group = [this](const QString &title) {
+        auto *box = new QGroupBox(title, this);
+        auto *grid = new QGridLayout(box);
+        grid->setHorizontalSpacing(10);
+        grid->setVerticalSpacing(6);
+        return std::pair{box, grid};
+    };
+
+    auto [from, fromGrid] = group(text::groupGrowFrom());
+    place(fromGrid, 0, 0, text::labelFromA(), addField(MainControl::txtFromA));
+    place(fromGrid, 1, 0, text::labelFromN(), addField(MainControl::txtFromN));
+    place(fromGrid, 2, 0, text::labelFromH(), addField(MainControl::txtFromH));
+    fromGrid->setColumnMinimumWidth(2, 8);
+    place(fromGrid, 0, 3, text::labelFromB(), addField(MainControl::txtFromB));
+    place(fromGrid, 1, 3, text::labelFromD(), addField(MainControl::txtFromD));
+    fromGrid->setRowStretch(3, 1);
+    row->addWidget(from);
+
+    auto [to, toGrid] = group(text::groupGrowTo());
+    place(toGrid, 0, 0, text::labelToA(), addField(MainControl::txtToA));
+    place(toGrid, 1, 0, text::labelByA(), addField(MainControl::txtByA));
+    place(toGrid, 2, 0, text::labelNetArea(), addField(MainControl::txtNetArea));
+    toGrid->setRowStretch(3, 1);
+    row->addWidget(to);
+
+    auto [site, siteGrid] = group(text::groupSite());
+    place(siteGrid, 0, 0, text::labelSI(), addResult(MainControl::lblSI));
+    place(siteGrid, 1, 0, text::labelYC(), addResult(MainControl::lblYC));
+    siteGrid->setRowStretch(2, 1);
+    row->addWidget(site);
+
+    row->addStretch(1);
+
+    auto *commands = new QGridLayout;
+    commands->setSpacing(6);
+    QPushButton *grow = addButton(MainControl::cmdGrow, text::buttonGrow());
+    QFont bold = grow->font();
+    bold.setBold(true);
+    grow->setFont(bold);
+    QPushButton *useRow = addButton(MainControl::cmdUseRow, text::buttonUseRow());
+    useRow->setToolTip(text::hintUseRow());
+    QPushButton *clear = addButton(MainControl::cmdClear, text::buttonClear());
+    QPushButton *clearAll = addButton(MainControl::cmdClearAll, text::buttonClearAll());
+    commands->addWidget(grow, 0, 0);
+    commands->addWidget(useRow, 1, 0);
+    commands->addWidget(clear, 2, 0);
+    commands->addWidget(clearAll, 3, 0);
+    commands->setRowStretch(4, 1);
+    row->addLayout(commands);
+
+    connect(grow, &QPushButton::clicked, this, [this] {
+        if (m_logic != nullptr) {
+            m_logic->cmdGrow_Click();
+        }
+    });
+    connect(useRow, &QPushButton::clicked, this, [this] {
+        if (m_logic != nullptr) {
+            m_logic->UseFlxRow();
+        }
+    });
+    connect(clear, &QPushButton::clicked, this, [this] {
+        if (m_logic != nullptr) {
+            m_logic->cmdClear_Click();
+        }
+    });
+    connect(clearAll, &QPushButton::clicked, this, [this] {
+        if (m_logic != nullptr) {
+            m_logic->ClearAll();
+        }
+    });
+
+    // Keyboard order follows the stand description, then the projection.
+    const MainControl order[] = {
+        MainControl::txtFromA,  MainControl::txtFromN,   MainControl::txtFromH,
+        MainControl::txtFromB,  MainControl::txtFromD,   MainControl::txtToA,
+        MainControl::txtByA,    MainControl::txtNetArea, MainControl::cmdGrow,
+        MainControl::cmdUseRow, MainControl::cmdClear,   MainControl::cmdClearAll};
+    for (std::size_t i = 1; i < std::size(order); ++i) {
+        setTabOrder(control(order[i - 1]), control(order[i]));
+    }
+    return panel;
+}
+
+void MainWindow::buildGrid() {
+    m_grid = new QTableView(this);
+    m_grid->setObjectName(QStringLiteral("flxMain"));
+    m_grid->setHorizontalHeader(new GroupHeaderView(ProjectionModel::GroupRole, m_grid));
+    m_grid->setSelectionBehavior(QAbstractItemView::SelectRows);
+    m_grid->setSelectionMode(QAbstractItemView::ContiguousSelection);
+    m_grid->setEditTriggers(QAbstractItemView::NoEditTriggers);
+    m_grid->setAlternatingRowColors(true);
+    m_grid->setWordWrap(false);
+    m_grid->setCornerButtonEnabled(false);
+    m_grid->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
+    m_grid->verticalHeader()->setDefaultSectionSize(m_grid->fontMetrics().height() + 8);
+    m_grid->verticalHeader()->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
+    m_grid->horizontalHeader()->setMinimumSectionSize(kSeparatorWidth);
+}
+
+void MainWindow::fitColumns() {
+    QHeaderView *header = m_grid->horizontalHeader();
+    const int minimum = m_grid->fontMetrics().horizontalAdvance(QString(4, u'0')) + 10;
+    for (int c = 0; c < m_model->columnCount(); ++c) {
+        if (m_model->isSeparator(c)) {
+            header->setSectionResizeMode(c, QHeaderView::Fixed);
+            header->resizeSection(c, kSeparatorWidth);
+        } else {
+            header->setSectionResizeMode(c, QHeaderView::Interactive);
+            m_grid->resizeColumnToContents(c);
+            header->resizeSection(c, std::max(header->sectionSize(c), minimum));
+        }
+    }
+}
+
+// ---- IMainView --------------------------------------------------------------------------
+
+QWidget *MainWindow::control(MainControl c) const {
+    return m_controls.at(slot(c));
+}
+
+QString MainWindow::text(MainControl c) const {
+    QWidget *w = control(c);
+    if (auto *field = qobject_cast<QLineEdit *>(w)) {
+        return field->text();
+    }
+    if (auto *label = qobject_cast<QLabel *>(w)) {
+        return label->text();
+    }
+    if (auto *button = qobject_cast<QPushButton *>(w)) {
+        return button->text();
+    }
+    return m_absentText.at(slot(c));
+}
+
+void MainWindow::setText(MainControl c, const QString &value) {
+    QWidget *w = control(c);
+    if (auto *field = qobject_cast<QLineEdit *>(w)) {
+        field->setText(value);
+    } else if (auto *label = qobject_cast<QLabel *>(w)) {
+        label->setText(value);
+    } else if (auto *button = qobject_cast<QPushButton *>(w)) {
+        button->setText(value);
+    } else {
+        m_absentText.at(slot(c)) = value;
+    }
+}
+
+void MainWindow::setEnabled(MainControl c, bool enabled) {
+    if (QWidget *w = control(c)) {
+        w->setEnabled(enabled);
+    }
+}
+
+void MainWindow::setHint(MainControl c, const QString &hint) {
+    if (QWidget *w = control(c)) {
+        w->setToolTip(hint);
+    }
+}
+
+void MainWindow::focus(MainControl c) {
+    QWidget *w = control(c);
+    if (w == nullptr) {
+        return;
+    }
+    w->setFocus(Qt::OtherFocusReason);
+    if (auto *field = qobject_cast<QLineEdit *>(w)) {
+        field->selectAll();
+    }
+}
+
+void MainWindow::setCaption(const QString &caption) {
+    setWindowTitle(caption);
+}
+
+void MainWindow::setBusy(bool busy) {
+    if (busy) {
+        QApplication::setOverrideCursor(Qt::WaitCursor);
+        ++m_busyDepth;
+    } else if (m_busyDepth > 0) {
+        QApplication::restoreOverrideCursor();
+        --m_busyDepth;
+    }
+}
+
+void MainWindow::tableChanged(int firstRow) {
+    if (m_model == nullptr) {
+        return;
+    }
+    m_model->refresh(firstRow);
+    selectionFromLogic();
+}
+
+void MainWindow::scrollToRow(int row) {
+    if (m_model == nullptr || row < 1 || row > m_model->rowCount()) {
+        return;
+    }
+    selectionFromLogic();
+    m_grid->scrollTo(m_model->index(row - 1, 0), QAbstractItemView::PositionAtTop);
+}
+
+void MainWindow::setActiveModel(int modelId) {
+    const QList<QAction *> entries = m_modelActions->actions();
+    if (modelId >= 0 && modelId < entries.size()) {
+        entries.at(modelId)->setChecked(true);
+    }
+}
+
+QRect MainWindow::placement() const {
+    return geometry();
+}
+
+void MainWindow::setPlacement(const QRect &placement) {
+    setGeometry(placement);
+}
+
+// ---- Events --------------------------------------------------------------------------------
+
+void MainWindow::closeEvent(QCloseEvent *event) {
+    if (m_logic != nullptr && m_settings != nullptr) {
+        m_logic->Form_Unload(*m_settings);
+    }
+    event->accept();
+}
+
+bool MainWindow::eventFilter(QObject *watched, QEvent *event) {
+    const auto name = workflow::mainControlFromName(watched->objectName());
+    if (!name || !workflow::isNumericField(*name) || control(*name) != watched) {
+        return QMainWindow::eventFilter(watched, event);
+    }
+    if (event->type() == QEvent::KeyPress) {
+        // Typed characters go through the key filter; editing keys and
+        // shortcuts carry no printable text and pass untouched.
+        const auto *key = static_cast<QKeyEvent *>(event);
+        const bool shortcut = key->modifiers() & (Qt::ControlModifier | Qt::AltModifier);
+        if (!shortcut) {
+            for (const QChar c : key->text()) {
+                if (c.isPrint() && !workflow::MainWindowLogic::KeyFilter(c)) {
+                    return true;
+                }
+            }
+        }
+    } else if (event->type() == QEvent::FocusOut && m_logic != nullptr) {
+        // Switching to another window or opening a menu does not leave the field.
+        const Qt::FocusReason reason = static_cast<QFocusEvent *>(event)->reason();
+        if (reason != Qt::ActiveWindowFocusReason && reason != Qt::PopupFocusReason) {
+            m_logic->leaveField(*name);
+        }
+    }
+    return QMainWindow::eventFilter(watched, event);
+}
+
+// ---- The grid's selection -------------------------------------------------------------------
+
+void MainWindow::selectionToLogic() {
+    if (m_followingLogic || m_logic == nullptr) {
+        return;
+    }
+    const QModelIndex current = m_grid->selectionModel()->currentIndex();
+    const int currentRow = current.isValid() ? current.row() + 1 : 0;
+    int first = currentRow;
+    int last = currentRow;
+    const QModelIndexList rows = m_grid->selectionModel()->selectedRows();
+    if (!rows.isEmpty()) {
+        first = rows.front().row() + 1;
+        last = first;
+        for (const QModelIndex &r : rows) {
+            first = std::min(first, r.row() + 1);
+            last = std::max(last, r.row() + 1);
+        }
+    }
+    // The end of the selection is the row farthest from the current one.
+    const int endRow = currentRow == first ? last : first;
+    m_logic->select(currentRow, endRow);
+}
+
+void MainWindow::selectionFromLogic() {
+    if (m_logic == nullptr || m_model == nullptr) {
+        return;
+    }
+    const workflow::ProjectionTable &table = m_logic->table();
+    m_followingLogic = true;
+    QItemSelectionModel *selection = m_grid->selectionModel();
+    const int current = table.currentRow();
+    const int end = table.selectionEnd();
+    if (current >= 1 && current <= m_model->rowCount()) {
+        const int first = std::max(1, std::min(current, end));
+        const int last = std::min(m_model->rowCount(), std::max(current, end));
+        selection->setCurrentIndex(m_model->index(current - 1, 0), QItemSelectionModel::NoUpdate);
+        selection->select(QItemSelection(m_model->index(first - 1, 0),
+                                         m_model->index(last - 1, m_model->columnCount() - 1)),
+                          QItemSelectionModel::ClearAndSelect);
+    } else {
+        selection->clear();
+    }
+    m_followingLogic = false;
+}
+
+void MainWindow::about() {
+    QMessageBox::about(this, text::aboutTitle(), text::aboutText());
+}
+
+} // namespace arbolex::ui

@@ -1,0 +1,95 @@
+#pragma once
+
+#include "workflow/imainview.hpp"
+
+#include <QMainWindow>
+
+#include <array>
+
+class QActionGroup;
+class QLabel;
+class QLineEdit;
+class QPushButton;
+class QSettings;
+class QTableView;
+
+namespace arbolex::workflow {
+class MainWindowLogic;
+}
+
+namespace arbolex::ui {
+
+class ProjectionModel;
+
+/// The main window `frmMain`: the grow-from panel, the commands, the
+/// projection table `flxMain` and the model menu `mnuModel`. Everything it
+/// shows is set by its logic through IMainView; everything the user does goes
+/// straight to the logic's handlers.
+class MainWindow : public QMainWindow, public workflow::IMainView {
+    Q_OBJECT
+public:
+    explicit MainWindow(QWidget *parent = nullptr);
+    ~MainWindow() override;
+
+    /// Binds the window to its logic; `settings` receives the placement when
+    /// the window closes. Both must outlive the window.
+    void attach(workflow::MainWindowLogic &logic, QSettings &settings);
+
+    /// Takes the model chosen in the model choice window.
+    void SetModelFromfrmModelChoice(int modelId);
+
+    /// The widget of a control, nullptr for commands the window does not offer.
+    QWidget *control(workflow::MainControl control) const;
+    QTableView *grid() const { return m_grid; }
+    ProjectionModel *gridModel() const { return m_model; }
+    QActionGroup *modelMenu() const { return m_modelActions; }
+
+    // IMainView
+    QString text(workflow::MainControl control) const override;
+    void setText(workflow::MainControl control, const QString &text) override;
+    using QMainWindow::setEnabled;
+    void setEnabled(workflow::MainControl control, bool enabled) override;
+    void setHint(workflow::MainControl control, const QString &hint) override;
+    void focus(workflow::MainControl control) override;
+    void setCaption(const QString &caption) override;
+    void setBusy(bool busy) override;
+    void tableChanged(int firstRow) override;
+    void scrollToRow(int row) override;
+    void setActiveModel(int modelId) override;
+    QRect placement() const override;
+    void setPlacement(const QRect &placement) override;
+
+protected:
+    void closeEvent(QCloseEvent *event) override;
+    bool eventFilter(QObject *watched, QEvent *event) override;
+
+private:
+    void buildMenus();
+    QWidget *buildPanel();
+    void buildGrid();
+    QLineEdit *addField(workflow::MainControl control);
+    QLabel *addResult(workflow::MainControl control);
+    QPushButton *addButton(workflow::MainControl control, const QString &caption);
+    void fitColumns();
+    /// Tells the logic the grid's current row and the end of its selection.
+    void selectionToLogic();
+    /// Shows the logic's current row and selection in the grid.
+    void selectionFromLogic();
+    void about();
+
+    workflow::MainWindowLogic *m_logic = nullptr;
+    QSettings *m_settings = nullptr;
+
+    std::array<QWidget *, workflow::kMainControlCount> m_controls{};
+    /// Texts of the commands the window does not offer (yet).
+    std::array<QString, workflow::kMainControlCount> m_absentText;
+
+    QActionGroup *m_modelActions = nullptr;
+    QTableView *m_grid = nullptr;
+    ProjectionModel *m_model = nullptr;
+    /// Set while the grid follows the logic, so the change is not sent back.
+    bool m_followingLogic = false;
+    int m_busyDepth = 0;
+};
+
+} // namespace arbolex::ui

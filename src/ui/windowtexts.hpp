@@ -1,0 +1,158 @@
+#pragma once
+
+// Every text the windows `frmMain` and `frmModelChoice` show of their own (the
+// logic writes the captions, messages and results): a changed caption is one edit.
+
+#include "engine/catalogue.hpp"
+
+#include <QString>
+
+namespace arbolex::ui::text {
+
+// ---- Program --------------------------------------------------------------------
+
+inline QString programName() {
+    return QStringLiteral("ARBOLEX");
+}
+inline QString programVersion() {
+    return QStringLiteral("0.1.0");
+}
+inline QString programPurpose() {
+    return QStringLiteral("Growth and yield of even-aged conifer plantations: projects a "
+                          "sub-compartment with a dynamic yield model, through thinnings to the "
+                          "final cut, and values its timber.");
+}
+
+/// Entry of the model menu and the model list: identifier, three blanks and
+/// the catalogue label, so calibrations sharing a label stay apart. A figure
+/// space pads the one-digit identifiers, so the labels line up.
+inline QString modelEntry(int modelId) {
+    return (modelId < 10 ? QStringLiteral("\u2007") : QString()) + QString::number(modelId) +
+           QStringLiteral("   ") +
+           QString::fromLatin1(engine::catalogue().at(static_cast<std::size_t>(modelId)).label);
+}
+
+// ---- Main window ------------------------------------------------------------------
+
+inline QString menuModel() {
+    return QStringLiteral("&Model");
+}
+inline QString menuHelp() {
+    return QStringLiteral("&Help");
+}
+inline QString menuThreshold() {
+    return QStringLiteral("&Threshold basal area\u2026");
+}
+inline QString menuNotes() {
+    return QStringLiteral("&Notes on this model\u2026");
+}
+inline QString menuAbout() {
+    return QStringLiteral("&About ARBOLEX");
+}
+inline QString aboutTitle() {
+    return QStringLiteral("About ARBOLEX");
+}
+inline QString aboutText() {
+    return QStringLiteral("<h3>") + programName() + QStringLiteral("</h3><p>") + programPurpose() +
+           QStringLiteral("</p><p>Version ") + programVersion() + QStringLiteral("</p>");
+}
+
+inline QString groupGrowFrom() {
+    return QStringLiteral("Grow from");
+}
+inline QString groupGrowTo() {
+    return QStringLiteral("Projection");
+}
+inline QString groupSite() {
+    return QStringLiteral("Site");
+}
+
+inline QString labelFromA() {
+    return QStringLiteral("Age (yrs)");
+}
+inline QString labelFromN() {
+    return QStringLiteral("Stocking (N/ha)");
+}
+inline QString labelFromH() {
+    return QStringLiteral("Top height (m)");
+}
+inline QString labelFromB() {
+    return QStringLiteral("Basal area (m\u00b2/ha)");
+}
+inline QString labelFromD() {
+    return QStringLiteral("Mean DBH (cm)");
+}
+inline QString labelToA() {
+    return QStringLiteral("Grow to age");
+}
+inline QString labelByA() {
+    return QStringLiteral("Step (yrs)");
+}
+inline QString labelNetArea() {
+    return QStringLiteral("Net area (ha)");
+}
+inline QString labelSI() {
+    return QStringLiteral("Site index");
+}
+inline QString labelYC() {
+    return QStringLiteral("Yield class");
+}
+
+inline QString buttonGrow() {
+    return QStringLiteral("&Grow");
+}
+inline QString buttonClear() {
+    return QStringLiteral("&Clear");
+}
+inline QString buttonClearAll() {
+    return QStringLiteral("Clear &All");
+}
+inline QString buttonUseRow() {
+    return QStringLiteral("&Use row");
+}
+inline QString hintUseRow() {
+    return QStringLiteral("Continue from the selected row");
+}
+
+// ---- Model choice window ------------------------------------------------------------
+
+inline QString choiceTitle() {
+    return QStringLiteral("ARBOLEX \u2014 Model choice");
+}
+inline QString choiceHeading() {
+    return QStringLiteral("Choose the growth model");
+}
+inline QString choiceIntro() {
+    return QStringLiteral("Each model follows one species under one regime. Thinned models "
+                          "offer thinnings; un-thinned models run to the final cut.");
+}
+inline QString buttonAcceptChoice() {
+    return QStringLiteral("Accept   Choice");
+}
+inline QString illustrationTitle() {
+    return QStringLiteral("ARBOLEX");
+}
+inline QString illustrationSubtitle() {
+    return QStringLiteral("Dynamic yield models for even-aged conifer plantations");
+}
+inline QString illustrationAxisAge() {
+    return QStringLiteral("Age");
+}
+inline QString illustrationAxisHeight() {
+    return QStringLiteral("Top height");
+}
+
+// ---- Media files of the introduction, in the data folder ---------------------------------
+
+inline QString introVideo() {
+    return QStringLiteral("Spruce.avi");
+}
+inline QString introCompletePicture() {
+    return QStringLiteral("Spruce_Complete.jpg");
+}
+/// Picture `n` of the introduction's sequence, relative to the data folder.
+inline QString introSequencePicture(int n) {
+    return QStringLiteral("SpruceImages/Spruce_0") + QString::number(n) + QStringLiteral(".jpg");
+}
+
+} // namespace arbolex::ui::text
