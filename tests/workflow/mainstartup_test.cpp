@@ -1,0 +1,134 @@
+// The main window's load and unload: what a run leaves for the next one.
+#include "mainwindowfixture.hpp"
+
+#include "shell/startupfile.hpp"
+#include "shell/vbtext.hpp"
+#include "workflow/mainmessages.hpp"
+
+#include <QDir>
+#include <QSettings>
+
+namespace arbolex::testing {
+namespace {
+
+using namespace workflow;
+
+const QRect kScreen(0, 0, 1920, 1080);
+
+class MainStartupTest : public MainWindowTest {
+protected:
+    MainStartupTest() {
+        const QDir source(QStringLiteral(ARBOLEX_DATA_SOURCE));
+        for (const QString &name : source.entryList(QDir::Files)) {
+            QFile::copy(source.filePath(name), dir.filePath(name));
+        }
+    }
+
+    QSettings settings{dir.filePath(QStringLiteral("settings.ini")), QSettings::IniFormat};
+};
+
+TEST_F(MainStartupTest, LoadRestoresTheLastRun) {
+    shell::StartupValues stored;
+    stored.modelIndex = 8;
+    stored.age = 22;
+    stored.basalArea = 31.5f;
+    stored.stocking = 1800;
+    stored.topHeight = 9.5f;
+    stored.targetAge = 55;
+    stored.step = 1;
+    stored.netArea = 4.25;
+    ASSERT_TRUE(shell::writeStartupFile(dir.path(), stored, log));
+
+    logic.Form_Load(settings, kScreen);
+    EXPECT_EQ(grow.modelId(), 8);
+    EXPECT_EQ(view.activeModel(), 8);
+    EXPECT_EQ(view.caption(),
+              text::titleArbolex() + text::captionModelInUse() + QStringLiteral("SP - (Thinned)"));
+    EXPECT_EQ(view.text(MainControl::txtFromA), QStringLiteral("22"));
+    EXPECT_EQ(view.text(MainControl::txtFromB), QStringLiteral("31.50"));
+    EXPECT_EQ(view.text(MainControl::txtFromN), QStringLiteral("1800"));
+    EXPECT_EQ(view.text(MainControl::txtFromH), QStringLiteral("9.5"));
+    EXPECT_EQ(view.text(MainControl::txtToA), QStringLiteral("55"));
+    EXPECT_EQ(view.text(MainControl::txtByA), QStringLiteral("1"));
+    EXPECT_EQ(view.text(MainControl::txtNetArea), QStringLiteral("4.25"));
+    EXPECT_FALSE(view.text(MainControl::txtFromD).isEmpty()) << "DBH completed from BA";
+    EXPECT_FALSE(view.text(MainControl::lblSI).isEmpty());
+    EXPECT_GT(prices.pricesInUse()[12], 0.0) << "current prices are in use";
+    // Centred on the screen when no placement was ever saved.
+    EXPECT_EQ(view.placement().center(), kScreen.center());
+    EXPECT_TRUE(logLines().isEmpty());
+}
+
+TEST_F(MainStartupTest, UnloadAndLoadRoundTrip) {
+    logic.Form_Load(settings, kScreen);
+    logic.mnuModel_Click(4);
+    typeStand(QStringLiteral("45"), QStringLiteral("2"));
+    type(MainControl::txtNetArea, QStringLiteral("12.5"));
+    view.setPlacement(QRect(40, 60, 1000, 700));
+    prices.data().userDefined[3] = 17.25;
+    logic.Form_Unload(settings);
+
+    HeadlessMainView nextView;
+    economics::Prices nextPrices;
+    MainWindowLogic next(grow, nextPrices, log, dir.path(), nextView, interactive);
+    next.Form_Load(settings, kScreen);
+    EXPECT_EQ(grow.modelId(), 4);
+    for (MainControl c : {MainControl::txtFromA, MainControl::txtFromN, MainControl::txtFromH,
+                          MainControl::txtFromB, MainControl::txtToA, MainControl::txtByA,
+                          MainControl::txtNetArea}) {
+        // The same values, written back in their display formats.
+        EXPECT_EQ(shell::val(nextView.text(c)), shell::val(view.text(c)))
+            << controlName(c).toStdString();
+    }
+    EXPECT_EQ(nextView.placement(), QRect(40, 60, 1000, 700));
+    EXPECT_EQ(nextPrices.data().userDefined[3], 17.25);
+    EXPECT_TRUE(logLines().isEmpty());
+}
+
+TEST_F(MainStartupTest, MissingFilesStillStartWithDefaults) {
+    QFile::remove(dir.filePath(QStringLiteral("IFPRM1.dat")));
+    QFile::remove(dir.filePath(QStringLiteral("CURPRIC.qdm")));
+    logic.Form_Load(settings, kScreen);
+    EXPECT_EQ(grow.modelId(), 0);
+    EXPECT_EQ(view.text(MainControl::txtFromA), QStringLiteral("15"));
+    EXPECT_TRUE(view.isEnabled(MainControl::cmdGrow));
+    EXPECT_EQ(prices.pricesInUse()[0], 0.0) << "no price list could be read";
+    EXPECT_EQ(logLines().size(), 2) << "one line per missing file";
+    typeStand();
+    logic.cmdGrow_Click();
+    EXPECT_EQ(logic.table().rowCount(), 9) << "the program works without its files";
+}
+
+TEST_F(MainStartupTest, ModelMenuKeepsRowsAndOffersThinningByModel) {
+    logic.Form_Load(settings, kScreen);
+    typeStand();
+    logic.cmdGrow_Click();
+    logic.mnuModel_Click(3);
+    EXPECT_FALSE(view.isEnabled(MainControl::cmdThin));
+    EXPECT_EQ(logic.table().rowCount(), 9);
+    logic.mnuModel_Click(11); // labelled un-thinned, but not found in "1+3+5+7+9"
+    EXPECT_TRUE(view.isEnabled(MainControl::cmdThin));
+    logic.mnuModel_Click(22);
+    ASSERT_EQ(interactive.messages.size(), 1);
+    EXPECT_EQ(interactive.messages[0].text, QStringLiteral("FAULT - Unknown model selection"));
+    EXPECT_EQ(grow.modelId(), 11);
+}
+
+TEST_F(MainStartupTest, InformationBoxes) {
+    logic.Form_Load(settings, kScreen);
+    logic.TrhesholdInfo();
+    logic.mnuModel_Click(1);
+    logic.TrhesholdInfo();
+    logic.Warn();
+    ASSERT_EQ(interactive.messages.size(), 3);
+    EXPECT_TRUE(
+        interactive.messages[0].text.startsWith(QStringLiteral("The threshold BA for SS is :  ")));
+    EXPECT_TRUE(interactive.messages[1].text.startsWith(
+        QStringLiteral("The threshold BA for SS is not calculated but would be & vbCrLf & equal "
+                       "or greater then :")));
+    EXPECT_TRUE(interactive.messages[2].text.startsWith(text::warnLead()));
+    EXPECT_TRUE(interactive.messages[2].text.contains(QStringLiteral("SS - (Un-thinned)")));
+}
+
+} // namespace
+} // namespace arbolex::testing
