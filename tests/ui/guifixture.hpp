@@ -1,0 +1,74 @@
+#pragma once
+
+#include "mocks/fakeinteractive.hpp"
+
+#include "economics/prices.hpp"
+#include "engine/grow.hpp"
+#include "shell/enginereport.hpp"
+#include "shell/errorlog.hpp"
+#include "ui/mainwindow.hpp"
+#include "workflow/mainwindowlogic.hpp"
+
+#include <QApplication>
+#include <QDir>
+#include <QFile>
+#include <QKeyEvent>
+#include <QLineEdit>
+#include <QSettings>
+#include <QTemporaryDir>
+
+#include <gtest/gtest.h>
+
+namespace arbolex::testing {
+
+using workflow::MainControl;
+
+/// Copies the shipped data files into `folder`; true when all were copied.
+inline bool copyShippedData(const QString &folder) {
+    const QDir source(QStringLiteral(ARBOLEX_DATA_SOURCE));
+    bool copied = true;
+    for (const QString &name : source.entryList(QDir::Files)) {
+        copied = QFile::copy(source.filePath(name), QDir(folder).filePath(name)) && copied;
+    }
+    return copied;
+}
+
+/// Presses and releases one key on `widget`, as the keyboard would.
+inline void pressKey(QWidget *widget, int key, const QString &text = {}) {
+    QKeyEvent press(QEvent::KeyPress, key, Qt::NoModifier, text);
+    QApplication::sendEvent(widget, &press);
+    QKeyEvent release(QEvent::KeyRelease, key, Qt::NoModifier, text);
+    QApplication::sendEvent(widget, &release);
+}
+
+/// Types `text` on `widget` one character at a time.
+inline void typeKeys(QWidget *widget, const QString &text) {
+    for (const QChar c : text) {
+        pressKey(widget, c.toUpper().unicode(), QString(c));
+    }
+}
+
+/// The main window on the screen (offscreen) with its logic, loaded from a
+/// temporary copy of the shipped data folder and settings in a temporary file.
+class MainWindowGuiTest : public ::testing::Test {
+protected:
+    MainWindowGuiTest() {
+        window.attach(logic, settings);
+        logic.Form_Load(settings, QRect(0, 0, 1600, 1000));
+    }
+
+    QLineEdit *field(MainControl c) const { return qobject_cast<QLineEdit *>(window.control(c)); }
+
+    QTemporaryDir dir;
+    bool dataCopied = copyShippedData(dir.path());
+    QSettings settings{dir.filePath(QStringLiteral("settings.ini")), QSettings::IniFormat};
+    shell::ErrorLog log{dir.path()};
+    FakeInteractive interactive;
+    shell::EngineReport report{interactive, log};
+    engine::Grow grow{&report};
+    economics::Prices prices;
+    ui::MainWindow window;
+    workflow::MainWindowLogic logic{grow, prices, log, dir.path(), window, interactive};
+};
+
+} // namespace arbolex::testing

@@ -1,0 +1,92 @@
+// The grid's item model over the projection table: appended rows arrive as
+// inserted rows, a cleared table resets the model, and thinning rows stand
+// out from growth rows.
+#include "ui/projectionmodel.hpp"
+
+#include <QBrush>
+
+#include <gtest/gtest.h>
+
+namespace arbolex::testing {
+namespace {
+
+using workflow::ProjectionTable;
+using workflow::RowKind;
+using workflow::TableRow;
+
+TableRow rowOf(RowKind kind, const QString &age) {
+    TableRow row;
+    row.kind = kind;
+    row.cells = QStringList(workflow::kColumnCount, QString());
+    row.cells[workflow::kColAge] = age;
+    return row;
+}
+
+struct Signals {
+    int resets = 0;
+    int insertedFirst = -1;
+    int insertedLast = -1;
+};
+
+void listen(ui::ProjectionModel &model, Signals &seen) {
+    QObject::connect(&model, &QAbstractItemModel::modelReset, [&seen] { ++seen.resets; });
+    QObject::connect(&model, &QAbstractItemModel::rowsInserted,
+                     [&seen](const QModelIndex &, int first, int last) {
+                         seen.insertedFirst = first;
+                         seen.insertedLast = last;
+                     });
+}
+
+TEST(ProjectionModelTest, AppendedRowsAreInsertedAndClearingResets) {
+    ProjectionTable table;
+    table.append(rowOf(RowKind::Growth, QStringLiteral("15")));
+    ui::ProjectionModel model(table);
+    Signals seen;
+    listen(model, seen);
+
+    // The model reports what it told its views until it is refreshed.
+    table.append(rowOf(RowKind::Growth, QStringLiteral("20")));
+    table.append(rowOf(RowKind::Growth, QStringLiteral("25")));
+    EXPECT_EQ(model.rowCount(), 1);
+    model.refresh(2);
+    EXPECT_EQ(model.rowCount(), 3);
+    EXPECT_EQ(seen.resets, 0);
+    EXPECT_EQ(seen.insertedFirst, 1);
+    EXPECT_EQ(seen.insertedLast, 2);
+    EXPECT_EQ(model.data(model.index(2, 0)).toString(), QStringLiteral("25"));
+
+    table.clear(workflow::HeaderLayout::WithoutMoney);
+    model.refresh(1);
+    EXPECT_EQ(seen.resets, 1);
+    EXPECT_EQ(model.rowCount(), 0);
+    EXPECT_EQ(model.columnCount(), workflow::kColumnCount - 1);
+}
+
+TEST(ProjectionModelTest, ThinningRowsAndSeparatorsAreToldApart) {
+    ProjectionTable table;
+    table.append(rowOf(RowKind::Growth, QStringLiteral("30")));
+    table.append(rowOf(RowKind::Thinning, QStringLiteral("30")));
+    ui::ProjectionModel model(table);
+
+    const auto background = [&model](int row, int column) {
+        return model.data(model.index(row, column), Qt::BackgroundRole);
+    };
+    // Growth rows keep the grid's alternating colours; thinning rows are tinted.
+    EXPECT_FALSE(background(0, workflow::kColAge).isValid());
+    ASSERT_TRUE(background(1, workflow::kColAge).canConvert<QBrush>());
+    EXPECT_EQ(model.data(model.index(0, workflow::kColAge), Qt::TextAlignmentRole)
+                      .value<Qt::Alignment>() &
+                  Qt::AlignRight,
+              Qt::AlignRight);
+
+    for (int c = 0; c < model.columnCount(); ++c) {
+        const int column = model.tableColumn(c);
+        const bool separator = column == workflow::kColSeparator1 ||
+                               column == workflow::kColSeparator2 ||
+                               column == workflow::kColSeparator3;
+        EXPECT_EQ(model.isSeparator(c), separator) << "column " << column;
+    }
+}
+
+} // namespace
+} // namespace arbolex::testing

@@ -1,0 +1,48 @@
+// Message boxes: the style of a message picks its icon and buttons, and the
+// CR LF / LF CR line breaks of the messages show as line breaks.
+#include "ui/qtinteractive.hpp"
+
+#include <QMessageBox>
+
+#include <gtest/gtest.h>
+
+namespace arbolex::testing {
+namespace {
+
+using ui::QtInteractive;
+
+TEST(QtInteractiveTest, LineBreaksInEitherOrderBecomeOneBreakEach) {
+    EXPECT_EQ(QtInteractive::lineBreaks(QStringLiteral("a\r\nb\n\rc\rd\ne")),
+              QStringLiteral("a\nb\nc\nd\ne"));
+    EXPECT_EQ(QtInteractive::lineBreaks(QStringLiteral("a\r\n\r\nb")), QStringLiteral("a\n\nb"));
+    EXPECT_EQ(QtInteractive::lineBreaks(QStringLiteral("a\n\r\nb")), QStringLiteral("a\n\nb"));
+    // Text that only names a line break is shown as it stands.
+    EXPECT_EQ(QtInteractive::lineBreaks(QStringLiteral("would be & vbCrLf & equal")),
+              QStringLiteral("would be & vbCrLf & equal"));
+}
+
+TEST(QtInteractiveTest, StylePicksIconAndButtons) {
+    struct Case {
+        int style;
+        QMessageBox::Icon icon;
+        QMessageBox::StandardButtons buttons;
+    };
+    const Case cases[] = {
+        {shell::kCritical, QMessageBox::Critical, QMessageBox::Ok},
+        {shell::kQuestion, QMessageBox::Question, QMessageBox::Ok},
+        {shell::kExclamation, QMessageBox::Warning, QMessageBox::Ok},
+        {shell::kExclamationOkCancel, QMessageBox::Warning, QMessageBox::Ok | QMessageBox::Cancel},
+        {shell::kInformation, QMessageBox::Information, QMessageBox::Ok},
+    };
+    for (const Case &c : cases) {
+        const auto box = QtInteractive::messageBox(nullptr, QStringLiteral("TITLE"),
+                                                   QStringLiteral("one\r\ntwo"), c.style);
+        EXPECT_EQ(box->icon(), c.icon) << c.style;
+        EXPECT_EQ(box->standardButtons(), c.buttons) << c.style;
+        EXPECT_EQ(box->windowTitle(), QStringLiteral("TITLE"));
+        EXPECT_EQ(box->text(), QStringLiteral("one\ntwo"));
+    }
+}
+
+} // namespace
+} // namespace arbolex::testing
