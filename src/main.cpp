@@ -36,32 +36,64 @@ void demoGrow(arbolex::workflow::MainWindowLogic &logic) {
     logic.cmdGrow_Click();
 }
 
-} // namespace
+/// The options of the command line.
+struct Options {
+    explicit Options(QCommandLineParser &parser) {
+        parser.setApplicationDescription(arbolex::ui::text::programPurpose());
+        parser.addHelpOption();
+        parser.addVersionOption();
+        demo.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(dataDir);
+        parser.addOption(noIntro);
+        parser.addOption(demo);
+    }
 
-int main(int argc, char *argv[]) {
-    QApplication app(argc, argv);
+    QCommandLineOption dataDir{QStringLiteral("data-dir"),
+                               QStringLiteral("Folder of the price lists, the user categories, "
+                                              "the start-up file and the error log (default: "
+                                              "ARBOLEX_DATA_DIR, else the program's folder)."),
+                               QStringLiteral("DIR")};
+    QCommandLineOption noIntro{QStringLiteral("no-intro"),
+                               QStringLiteral("Open the main window directly, with the model of "
+                                              "the start-up file.")};
+    QCommandLineOption demo{QStringLiteral("demo-grow")};
+};
+
+void nameApplication() {
     QCoreApplication::setOrganizationName(arbolex::ui::text::programName());
     QCoreApplication::setApplicationName(arbolex::ui::text::programName());
     QCoreApplication::setApplicationVersion(arbolex::ui::text::programVersion());
+}
 
+/// True when the command line asks only for the usage or the version, which
+/// are printed without opening a display.
+bool asksForTextOnly(int argc, char *argv[]) {
+    for (int i = 1; i < argc; ++i) {
+        const QByteArray arg(argv[i]);
+        if (arg == "-h" || arg == "--help" || arg == "--help-all" || arg == "-v" ||
+            arg == "--version") {
+            return true;
+        }
+    }
+    return false;
+}
+
+} // namespace
+
+int main(int argc, char *argv[]) {
+    if (asksForTextOnly(argc, argv)) {
+        QCoreApplication core(argc, argv);
+        nameApplication();
+        QCommandLineParser parser;
+        const Options options(parser);
+        parser.process(core); // prints and ends the program
+        return 0;
+    }
+
+    QApplication app(argc, argv);
+    nameApplication();
     QCommandLineParser parser;
-    parser.setApplicationDescription(arbolex::ui::text::programPurpose());
-    parser.addHelpOption();
-    parser.addVersionOption();
-    const QCommandLineOption dataDir(QStringLiteral("data-dir"),
-                                     QStringLiteral("Folder of the price lists, the user "
-                                                    "categories, the start-up file and the "
-                                                    "error log (default: ARBOLEX_DATA_DIR, "
-                                                    "else the program's folder)."),
-                                     QStringLiteral("DIR"));
-    const QCommandLineOption noIntro(QStringLiteral("no-intro"),
-                                     QStringLiteral("Open the main window directly, with the "
-                                                    "model of the start-up file."));
-    QCommandLineOption demo(QStringLiteral("demo-grow"));
-    demo.setFlags(QCommandLineOption::HiddenFromHelp);
-    parser.addOption(dataDir);
-    parser.addOption(noIntro);
-    parser.addOption(demo);
+    const Options options(parser);
     parser.process(app);
 
     const QString folder =
@@ -79,10 +111,10 @@ int main(int argc, char *argv[]) {
     window.attach(logic, settings);
     logic.Form_Load(settings, QGuiApplication::primaryScreen()->availableGeometry());
 
-    if (parser.isSet(demo)) {
+    if (parser.isSet(options.demo)) {
         QTimer::singleShot(0, &window, [&logic] { demoGrow(logic); });
     }
-    if (parser.isSet(noIntro)) {
+    if (parser.isSet(options.noIntro)) {
         window.show();
     } else {
         arbolex::ui::ModelChoiceDialog choice(window, folder, grow.modelId());

@@ -67,6 +67,7 @@ void MainWindow::attach(workflow::MainWindowLogic &logic, QSettings &settings) {
     m_model = new ProjectionModel(logic.table(), this);
     m_grid->setModel(m_model);
     connect(m_model, &QAbstractItemModel::modelReset, this, &MainWindow::fitColumns);
+    connect(m_model, &QAbstractItemModel::rowsInserted, this, &MainWindow::fitColumns);
     connect(m_grid->selectionModel(), &QItemSelectionModel::selectionChanged, this,
             &MainWindow::selectionToLogic);
     connect(m_grid->selectionModel(), &QItemSelectionModel::currentRowChanged, this,
@@ -260,6 +261,10 @@ void MainWindow::buildGrid() {
     m_grid->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
     m_grid->verticalHeader()->setDefaultSectionSize(m_grid->fontMetrics().height() + 8);
     m_grid->verticalHeader()->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
+    // Wide enough for every row label from the start, so the columns do not
+    // move when the first rows arrive.
+    m_grid->verticalHeader()->setFixedWidth(
+        m_grid->fontMetrics().horizontalAdvance(QStringLiteral("AC yr")) + 16);
     m_grid->horizontalHeader()->setMinimumSectionSize(kSeparatorWidth);
 }
 

@@ -1,0 +1,50 @@
+#!/usr/bin/env bash
+# Screenshots of the desktop program as a user sees it, under a virtual X
+# server: the model choice window, the main window as it opens, and the main
+# window after growing a young Sitka spruce stand (model 0, age 15, 2500
+# stems/ha, 7 m, 20 m²/ha, to 50 by 5).
+#
+#   scripts/screenshot.sh [OUTPUT_FOLDER]      (default /tmp/shots)
+#
+# ARBOLEX_EXE names the program (default build-ui/bin/arbolex). Each run works
+# on a fresh copy of data/ and a throw-away settings folder, so neither the
+# shipped data nor the user's settings change.
+set -euo pipefail
+
+root=$(cd "$(dirname "$0")/.." && pwd)
+exe=${ARBOLEX_EXE:-$root/build-ui/bin/arbolex}
+out=${1:-/tmp/shots}
+screen=${ARBOLEX_SCREEN:-1400x900x24}
+settle=${ARBOLEX_SETTLE:-4}
+
+[ -x "$exe" ] || { echo "no program at $exe (build the target arbolex first)" >&2; exit 1; }
+mkdir -p "$out"
+work=$(mktemp -d)
+trap 'rm -rf "$work"' EXIT
+
+# shoot NAME ARGS...: starts the program with ARGS, waits, saves NAME.png.
+shoot() {
+    local name=$1
+    shift
+    rm -rf "$work/data" "$work/config"
+    cp -r "$root/data" "$work/data"
+    mkdir -p "$work/config"
+    XDG_CONFIG_HOME="$work/config" xvfb-run -a -s "-screen 0 $screen" \
+        bash -c '
+            "$0" "$@" &
+            pid=$!
+            sleep "$SETTLE"
+            import -window root "$SHOT"
+            kill "$pid" 2>/dev/null || true
+            wait "$pid" 2>/dev/null || true
+        ' "$exe" --data-dir "$work/data" "$@"
+    echo "$out/$name.png"
+}
+export SETTLE=$settle
+
+export SHOT="$out/model-choice.png"
+shoot model-choice
+export SHOT="$out/main-start.png"
+shoot main-start --no-intro
+export SHOT="$out/main-grown.png"
+shoot main-grown --no-intro --demo-grow
