@@ -3,6 +3,7 @@
 #include "engine/catalogue.hpp"
 #include "ui/introillustration.hpp"
 #include "ui/mainwindow.hpp"
+#include "ui/pictureview.hpp"
 #include "ui/windowtexts.hpp"
 
 #include <QAudioOutput>
@@ -39,13 +40,14 @@ ModelChoiceDialog::ModelChoiceDialog(MainWindow &main, const QString &dataFolder
     m_intro = new QStackedWidget(this);
     m_illustration = new IntroIllustration(m_intro);
     m_intro->addWidget(m_illustration);
-    m_picture = new QLabel(m_intro);
-    m_picture->setAlignment(Qt::AlignCenter);
+    m_picture = new PictureView(m_intro);
+    m_picture->setObjectName(QStringLiteral("imgComplete"));
     m_intro->addWidget(m_picture);
     m_intro->setCurrentWidget(m_illustration);
     introArea->addWidget(m_intro, 1);
-    m_sequence = new QLabel(this);
-    m_sequence->setAlignment(Qt::AlignCenter);
+    m_sequence = new PictureView(this);
+    m_sequence->setObjectName(QStringLiteral("imgSequence"));
+    m_sequence->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
     m_sequence->setFixedHeight(120);
     m_sequence->hide();
     introArea->addWidget(m_sequence);
@@ -139,21 +141,11 @@ void ModelChoiceDialog::startIntroduction() {
 void ModelChoiceDialog::videoFinished() {
     const QString complete = media(text::introCompletePicture());
     if (QFileInfo::exists(complete)) {
-        showPicture(m_picture, complete);
+        m_picture->setPicture(complete);
         m_intro->setCurrentWidget(m_picture);
     } else {
         m_intro->setCurrentWidget(m_illustration);
     }
-}
-
-void ModelChoiceDialog::showPicture(QLabel *label, const QString &path) {
-    const QPixmap picture(path);
-    const QSize room = label->size().isValid() && !label->size().isEmpty()
-                           ? label->size()
-                           : m_illustration->sizeHint();
-    label->setPixmap(picture.isNull()
-                         ? QPixmap()
-                         : picture.scaled(room, Qt::KeepAspectRatio, Qt::SmoothTransformation));
 }
 
 void ModelChoiceDialog::nextPicture() {
@@ -161,7 +153,7 @@ void ModelChoiceDialog::nextPicture() {
     if (!QFileInfo::exists(media(text::introSequencePicture(m_sequenceNumber)))) {
         m_sequenceNumber = 1;
     }
-    showPicture(m_sequence, media(text::introSequencePicture(m_sequenceNumber)));
+    m_sequence->setPicture(media(text::introSequencePicture(m_sequenceNumber)));
 }
 
 int ModelChoiceDialog::selectedModel() const {

@@ -2,7 +2,6 @@
 
 #include <QDialog>
 
-class QLabel;
 class QListWidget;
 class QMediaPlayer;
 class QPushButton;
@@ -14,6 +13,7 @@ namespace arbolex::ui {
 
 class IntroIllustration;
 class MainWindow;
+class PictureView;
 
 /// The model choice window `frmModelChoice`, shown before the main window: an
 /// introduction (the video and pictures of the data folder when they are
@@ -42,7 +42,6 @@ private:
     QString media(const QString &name) const;
     void startIntroduction();
     void videoFinished();
-    void showPicture(QLabel *label, const QString &path);
     /// Steps the picture sequence to its next picture, back to the first after the last.
     void nextPicture();
 
@@ -52,8 +51,8 @@ private:
     QStackedWidget *m_intro = nullptr;
     IntroIllustration *m_illustration = nullptr;
     QVideoWidget *m_video = nullptr;
-    QLabel *m_picture = nullptr;
-    QLabel *m_sequence = nullptr;
+    PictureView *m_picture = nullptr;
+    PictureView *m_sequence = nullptr;
     QListWidget *m_models = nullptr;
     QPushButton *m_accept = nullptr;
 

@@ -6,6 +6,7 @@
 #include "ui/modelchoicedialog.hpp"
 
 #include <QImage>
+#include <QLabel>
 #include <QListWidget>
 #include <QPushButton>
 #include <QSet>
@@ -32,6 +33,29 @@ TEST_F(ModelChoiceTest, WithoutMediaFilesShowsTheDrawnIllustration) {
         }
     }
     EXPECT_GT(colours.size(), 50);
+}
+
+TEST_F(ModelChoiceTest, PicturesOfTheDataFolderReplaceTheDrawing) {
+    // Pictures of our own in the places the introduction looks for them.
+    QImage picture(64, 48, QImage::Format_RGB32);
+    picture.fill(Qt::darkGreen);
+    ASSERT_TRUE(QDir(dir.path()).mkpath(QStringLiteral("SpruceImages")));
+    ASSERT_TRUE(picture.save(dir.filePath(QStringLiteral("Spruce_Complete.jpg"))));
+    ASSERT_TRUE(picture.save(dir.filePath(QStringLiteral("SpruceImages/Spruce_01.jpg"))));
+
+    ui::ModelChoiceDialog choice(window, dir.path(), 0);
+    choice.show();
+    auto *complete = choice.findChild<QLabel *>(QStringLiteral("imgComplete"));
+    auto *sequence = choice.findChild<QLabel *>(QStringLiteral("imgSequence"));
+    ASSERT_NE(complete, nullptr);
+    ASSERT_NE(sequence, nullptr);
+    EXPECT_EQ(choice.introduction(), complete);
+    EXPECT_FALSE(complete->pixmap().isNull());
+    EXPECT_TRUE(sequence->isVisible());
+    EXPECT_FALSE(sequence->pixmap().isNull());
+    // Both pictures find room inside the window.
+    EXPECT_LE(sequence->geometry().bottom(), choice.rect().bottom());
+    EXPECT_LE(complete->parentWidget()->geometry().bottom(), sequence->geometry().top());
 }
 
 TEST_F(ModelChoiceTest, AcceptHandsTheSelectedModelToTheMainWindow) {
