@@ -110,6 +110,10 @@ public:
 
     float volumeCorrectionFactor() const { return m_vcf; }
 
+    /// How many failures the engine has reported so far: a caller compares
+    /// it before and after a call to learn that the call failed.
+    unsigned faultCount() const { return m_faultCount; }
+
     // ---- Thinning response --------------------------------------------------
 
     /// Residual stocking for a residual basal area Gr.

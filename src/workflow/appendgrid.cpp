@@ -46,11 +46,18 @@ void MainWindowLogic::buildGrowthCells(TableRow &row, int rowIndex) const {
         cells[kColVolumePerHa] = formatNumber(rec.volume, u"###0");
     }
 
+    fillTotalProduction(row, rowIndex);
+}
+
+void MainWindowLogic::fillTotalProduction(TableRow &row, int rowIndex) const {
     // Total production: the standing crop plus everything thinned so far.
+    const RowRecord &rec = row.record;
+    QStringList &cells = row.cells;
     const ProjectionTable::Removals removed = m_table.removalsUpTo(rowIndex - 1);
-    float totalStocking = static_cast<float>(rec.stocking + removed.stocking);
-    float totalBasalArea = static_cast<float>(rec.basalArea + removed.basalArea);
-    const double totalVolume = rec.volume + removed.volume;
+    float totalStocking = static_cast<float>(rec.stocking + rec.removedStocking + removed.stocking);
+    float totalBasalArea =
+        static_cast<float>(rec.basalArea + rec.removedBasalArea + removed.basalArea);
+    const double totalVolume = rec.volume + rec.removedVolume + removed.volume;
     cells[kColTotStocking] = wholeText(totalStocking);
     cells[kColTotBasalArea] = formatNumber(totalBasalArea, u"##0.0");
     cells[kColTotDbh] = formatNumber(dbhFromBasalArea(totalBasalArea, totalStocking), u"##0.0");
@@ -62,18 +69,17 @@ void MainWindowLogic::buildGrowthCells(TableRow &row, int rowIndex) const {
             formatNumber(totalVolume / std::nearbyint(double{totalStocking}), u"#0.000");
         cells[kColTotVolumePerHa] = formatNumber(totalVolume, u"###0");
     }
-    const double area = shell::val(field(MainControl::txtNetArea));
-    cells[kColTotVolume] = formatNumber(totalVolume * area, u"##0");
+    cells[kColTotVolume] = formatNumber(totalVolume * netArea(), u"##0");
 }
 
-void MainWindowLogic::writeIncrements(int rowIndex) {
+void MainWindowLogic::writeIncrements(int rowIndex, bool currentIncrement) {
     TableRow &row = m_table.row(rowIndex);
     // The increment runs from the nearest earlier row that holds a stand.
     int previous = rowIndex - 1;
     while (previous >= 1 && m_table.row(previous).isText()) {
         --previous;
     }
-    if (previous >= 1) {
+    if (currentIncrement && previous >= 1) {
         try {
             const RowNumbers &before = m_table.row(previous).numbers;
             // Volumes and the age difference are rounded to whole numbers and
@@ -92,12 +98,13 @@ void MainWindowLogic::writeIncrements(int rowIndex) {
             m_log.append(shell::moduleFaultLine(fault, QStringLiteral(" in Misc.AppendGrid()")));
         }
     }
-    // Mean annual increment: total production (standing plus everything
-    // removed so far) over age.
+    // Mean annual increment: total production over age. The row's volume
+    // number is the crop before any removal on the row, so the removals of
+    // the rows before it complete the total.
     const double age = row.numbers[kNumAge];
     if (age > 0.0) {
         const double totalProduction =
-            row.numbers[kNumVolume] + m_table.removalsUpTo(rowIndex).volume;
+            row.numbers[kNumVolume] + m_table.removalsUpTo(rowIndex - 1).volume;
         row.numbers[kNumMai] = totalProduction / age;
         row.cells[kColMai] = formatNumber(row.numbers[kNumMai], u"#");
     }
@@ -134,7 +141,7 @@ void MainWindowLogic::AppendGrid(RowKind kind, const QString &label) {
             row.cells[kColAge] = shell::singleText(s.age);
         }
         m_table.append(std::move(row));
-        writeIncrements(index);
+        writeIncrements(index, true);
     }
     updateYieldClassLabel();
     m_view.tableChanged(firstRow);

@@ -4,6 +4,8 @@
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
+#include "shell/vbtext.hpp"
+#include "thinning/thinwindowlogic.hpp"
 #include "workflow/mainmessages.hpp"
 
 #include <cmath>
@@ -44,6 +46,16 @@ void MainWindowLogic::select(int row, int endRow) {
     m_table.select(row, endRow);
 }
 
+double MainWindowLogic::netArea() const {
+    return shell::val(field(MainControl::txtNetArea));
+}
+
+void MainWindowLogic::thinningWritten(int firstRow, double standingVolume) {
+    m_standingVolume = standingVolume;
+    updateYieldClassLabel();
+    m_view.tableChanged(firstRow);
+}
+
 bool MainWindowLogic::changeCheck() const {
     if (m_table.rowCount() <= 1) {
         return false;
@@ -61,6 +73,8 @@ void MainWindowLogic::copyRowToFields(int row) {
     m_view.setText(MainControl::txtFromH, r.cells.value(kColTopHeight));
     m_view.setText(MainControl::txtFromN, r.cells.value(kColStocking));
     m_view.setText(MainControl::txtFromB, r.cells.value(kColBasalArea));
+    // The diameter follows the row too, so the pair never disagrees.
+    m_view.setText(MainControl::txtFromD, r.cells.value(kColDbh));
 }
 
 void MainWindowLogic::restoreFromRow() {
@@ -91,6 +105,9 @@ void MainWindowLogic::cmdGrow_Click() {
             }
         } else {
             m_growing[0] = true;
+        }
+        if (m_thinning != nullptr) {
+            m_thinning->flags().thinnedSinceLastGrow = false;
         }
         const BusyPointer busy(m_view);
         if (!ChkGrowFromFlds() || !ChkGrowFromBnds()) {
@@ -149,6 +166,12 @@ void MainWindowLogic::afterClear(HeaderLayout layout) {
     m_firstNew = 0;
     m_standingVolume = 0.0;
     m_growing = {};
+    m_timberRevenue.clear();
+    if (m_thinning != nullptr) {
+        // A thinning window open on the old rows has nothing left to thin.
+        m_thinning->flags().noThinningYet = true;
+        m_thinning->view().close();
+    }
     updateYieldClassLabel();
     m_view.setEnabled(MainControl::cmdGrow, true);
     m_view.setEnabled(MainControl::cmdClear, true);

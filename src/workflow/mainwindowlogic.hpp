@@ -6,6 +6,7 @@
 // IMainView and asks the user only through IInteractive, so its handlers can
 // call one another with no person at the keyboard.
 
+#include "economics/timberrevenue.hpp"
 #include "engine/grow.hpp"
 #include "workflow/imainview.hpp"
 #include "workflow/projectiontable.hpp"
@@ -26,6 +27,10 @@ class IInteractive;
 namespace arbolex::economics {
 class Prices;
 } // namespace arbolex::economics
+
+namespace arbolex::thinning {
+class ThinWindowLogic;
+} // namespace arbolex::thinning
 
 namespace arbolex::workflow {
 
@@ -60,6 +65,8 @@ public:
     // ---- Commands -------------------------------------------------------------
 
     void cmdGrow_Click();
+    /// Thin: opens the thinning window on the last growth row.
+    void cmdThin_Click();
     void cmdClear_Click();
     /// Clear All: empties the table and shows the header without money column.
     void ClearAll();
@@ -113,7 +120,20 @@ public:
     /// Volume per ha of the last growth row, m³/ha.
     double standingVolume() const { return m_standingVolume; }
 
+    /// The thinning window's logic that the thin command opens.
+    void attachThinning(thinning::ThinWindowLogic *thinning) { m_thinning = thinning; }
+
+    /// The table as the thinning rows change it.
+    ProjectionTable &tableForThinning() { return m_table; }
+    /// Tells the window that rows from `firstRow` on changed, and makes the
+    /// thinned stand the standing crop.
+    void thinningWritten(int firstRow, double standingVolume);
+    economics::TimberRevenue &timberRevenue() { return m_timberRevenue; }
+    /// The net area of the sub-compartment, ha (0 when empty).
+    double netArea() const;
+
     engine::Grow &grow() { return m_grow; }
+    economics::Prices &prices() { return m_prices; }
     IMainView &view() { return m_view; }
     shell::IInteractive &interactive() { return m_interactive; }
     shell::ErrorLog &errorLog() { return m_log; }
@@ -131,7 +151,19 @@ private:
     void updateCaption();
     void updateYieldClassLabel();
     void buildGrowthCells(TableRow &row, int rowIndex) const;
-    void writeIncrements(int rowIndex);
+
+public:
+    /// Writes the total-production and increment cells of row `rowIndex`
+    /// (shared by growth and thinning rows).
+    void fillTotalProduction(TableRow &row, int rowIndex) const;
+
+private:
+public:
+    /// Writes the increments of row `rowIndex`: the mean annual increment,
+    /// and the current one from the row before when `currentIncrement`.
+    void writeIncrements(int rowIndex, bool currentIncrement);
+
+private:
     bool continuesFromRow(int row) const;
     float thresholdBasalArea();
 
@@ -150,6 +182,8 @@ private:
     double m_standingVolume = 0.0;
     /// Set by the grow command of an un-thinned model.
     std::array<bool, 2> m_growing{};
+    thinning::ThinWindowLogic *m_thinning = nullptr;
+    economics::TimberRevenue m_timberRevenue;
 };
 
 } // namespace arbolex::workflow

@@ -62,6 +62,8 @@ struct TableRow {
     QString label; ///< "G yr", "T yr", "AC yr" …
     RowRecord record;
     RowNumbers numbers{};
+    /// Value of the timber removed on this row, euro per ha (thinning rows).
+    double removedValue = 0.0;
 
     bool isGrowth() const { return kind == RowKind::Growth; }
     bool isThinning() const { return kind == RowKind::Thinning; }

@@ -41,6 +41,7 @@ TEST_F(MainWindowTest, GrowAppendsOneGrowthRowPerStep) {
     // A thinned model's fields follow the last row, ready to thin or grow on.
     EXPECT_EQ(view.text(MainControl::txtFromA), QStringLiteral("50"));
     EXPECT_EQ(view.text(MainControl::txtFromB), cell(8, kColBasalArea));
+    EXPECT_EQ(view.text(MainControl::txtFromD), cell(8, kColDbh));
     EXPECT_FALSE(view.isEnabled(MainControl::cmdClear));
     EXPECT_EQ(view.topRow(), 8);
 }

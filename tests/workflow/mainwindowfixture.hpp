@@ -7,6 +7,7 @@
 #include "engine/grow.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
+#include "shell/vbtext.hpp"
 #include "workflow/headlessmainview.hpp"
 #include "workflow/mainwindowlogic.hpp"
 

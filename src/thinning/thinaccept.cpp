@@ -1,0 +1,205 @@
+// Accepting a thinning: the thinning record, the thinning row of the
+// projection table, its value, and the thinned stand as the new grow-from.
+#include "economics/pricelookup.hpp"
+#include "economics/prices.hpp"
+#include "shell/apperror.hpp"
+#include "shell/errorlog.hpp"
+#include "shell/interactive.hpp"
+#include "shell/vbformat.hpp"
+#include "shell/vbtext.hpp"
+#include "thinning/thinmessages.hpp"
+#include "thinning/thinwindowlogic.hpp"
+#include "workflow/mainmessages.hpp"
+#include "workflow/mainwindowlogic.hpp"
+#include "workflow/standmath.hpp"
+
+#include <cmath>
+
+namespace arbolex::thinning {
+
+using shell::formatNumber;
+using workflow::Column;
+using workflow::MainControl;
+
+namespace {
+
+QString wholeText(double value) {
+    return QString::number(static_cast<qint64>(std::nearbyint(value)));
+}
+
+} // namespace
+
+void ThinWindowLogic::cmdAccept_Click() {
+    try {
+        workflow::ProjectionTable &table = m_main.tableForThinning();
+        const int row = table.currentRow();
+        if (row < 1) {
+            return;
+        }
+        const workflow::TableRow &current = table.row(row);
+        const ThinningWork &w = m_work;
+        const bool nothingRemoved = !w.previewed || w.preBasalArea == w.postBasalArea;
+        if (current.isGrowth() && !m_flags.editingExisting && nothingRemoved) {
+            // Nothing removed: no thinning is stored.
+            m_main.SetGrowFrom(0.0f, w.preBasalArea, w.preStocking, w.topHeight, 0.0f, -1.0f);
+            if (!m_flags.loopUnderWay) {
+                m_view.close();
+            }
+            return;
+        }
+        m_main.SetGrowFrom(0.0f, w.postBasalArea, w.postStocking, w.topHeight, 0.0f, -1.0f);
+
+        workflow::RowRecord record;
+        record.age = current.record.age;
+        record.topHeight = w.topHeight;
+        record.basalArea = w.postBasalArea;
+        record.stocking = w.postStocking;
+        record.volume = w.postVolume;
+        // The loop takes the diameter the window shows; both are the same
+        // truncated value.
+        float postB = w.postBasalArea;
+        float postN = w.postStocking;
+        record.dbh = m_flags.loopUnderWay && shell::isNumeric(m_view.text(ThinControl::lblPostD))
+                         ? static_cast<float>(shell::val(m_view.text(ThinControl::lblPostD)))
+                         : workflow::truncateToTenth(workflow::dbhFromBasalArea(postB, postN));
+        record.removedBasalArea = w.preBasalArea - w.postBasalArea;
+        record.removedStocking = w.preStocking - w.postStocking;
+        record.removedVolume = std::fabs(w.preVolume - w.postVolume);
+        record.postDbh = record.dbh;
+
+        int thinRow = row;
+        if (m_flags.editingExisting) {
+            // A second Accept at the same age replaces the old thinning.
+            table.row(row).record = record;
+        } else {
+            workflow::TableRow thinning;
+            thinning.kind = workflow::RowKind::Thinning;
+            thinning.label = workflow::text::rowLabelThinning();
+            thinning.record = record;
+            thinRow = table.append(std::move(thinning));
+        }
+        WriteThinLine(workflow::text::rowLabelThinning(), thinRow);
+        table.select(thinRow, thinRow);
+        SetGrowFromAfterThin();
+        if (!m_flags.loopUnderWay) {
+            m_view.close();
+        }
+    } catch (const shell::AppFault &fault) {
+        m_interactive.message(workflow::text::titleArbolex(), text::acceptFailed(),
+                              shell::kExclamation);
+        m_main.errorLog().append(
+            shell::windowFaultLine(fault, QStringLiteral(" in frmThin.cmdAccept_Click()")));
+    }
+}
+
+void ThinWindowLogic::WriteThinLine(const QString &label, int row) {
+    shell::guard(m_main.errorLog(), QStringLiteral(" in Misc.WriteThinLine()"), [&] {
+        workflow::ProjectionTable &table = m_main.tableForThinning();
+        workflow::TableRow &r = table.row(row);
+        const workflow::RowRecord &rec = r.record;
+        r.kind = workflow::RowKind::Thinning;
+        r.label = label;
+        r.cells = QStringList();
+        for (int c = 0; c < workflow::kColumnCount; ++c) {
+            r.cells.append(QString());
+        }
+        QStringList &cells = r.cells;
+
+        // Main crop: the stand after the thinning.
+        cells[workflow::kColAge] = shell::singleText(rec.age);
+        cells[workflow::kColTopHeight] = formatNumber(rec.topHeight, u"#0.0");
+        cells[workflow::kColStocking] = wholeText(rec.stocking);
+        cells[workflow::kColDbh] = formatNumber(rec.dbh, u"##0.0");
+        cells[workflow::kColBasalArea] = formatNumber(rec.basalArea, u"##0.0");
+        const double postTrees = std::nearbyint(double{rec.stocking});
+        cells[workflow::kColVolumePerTree] =
+            postTrees > 0.0 ? formatNumber(rec.volume / postTrees, u"#0.000") : QString();
+        cells[workflow::kColVolumePerHa] = formatNumber(rec.volume, u"###0");
+
+        // The removal and its value at the price of its mean tree.
+        const float removedTrees = std::fabs(rec.removedStocking);
+        const float removedBasalArea = std::fabs(rec.removedBasalArea);
+        const double roundedTrees = std::nearbyint(double{removedTrees});
+        cells[workflow::kColThinStocking] = formatNumber(removedTrees, u"###0");
+        float b = removedBasalArea;
+        float n = removedTrees;
+        cells[workflow::kColThinDbh] =
+            formatNumber(workflow::truncateToTenth(workflow::dbhFromBasalArea(b, n)), u"##0.0");
+        cells[workflow::kColThinBasalArea] = formatNumber(removedBasalArea, u"##0.0");
+        double meanTree = 0.0;
+        if (rec.removedVolume <= 0.0f) {
+            cells[workflow::kColThinVolumePerTree] = workflow::text::outOfRange();
+            cells[workflow::kColThinVolumePerHa] = workflow::text::outOfRange();
+        } else {
+            meanTree = roundedTrees > 0.0 ? rec.removedVolume / roundedTrees : 0.0;
+            cells[workflow::kColThinVolumePerTree] = formatNumber(meanTree, u"#0.000");
+            cells[workflow::kColThinVolumePerHa] = formatNumber(rec.removedVolume, u"###0");
+        }
+        economics::Prices &prices = m_main.prices();
+        const double price =
+            economics::TrouveIndicePrix(meanTree, prices.data().current, m_interactive);
+        const double valuePerHa = rec.removedVolume * price;
+        cells[workflow::kColValuePerHa] = formatNumber(valuePerHa, u"####0");
+
+        // Cumulative thinning volume and value of the sub-compartment: this
+        // removal and every earlier one, over the net area.
+        double cumulativeVolume = 0.0;
+        double cumulativeValue = 0.0;
+        for (int i = 1; i <= row; ++i) {
+            const workflow::TableRow &earlier = table.row(i);
+            if (earlier.isThinning()) {
+                cumulativeVolume += earlier.record.removedVolume;
+                cumulativeValue += i == row ? valuePerHa : earlier.removedValue;
+            }
+        }
+        const double area = m_main.netArea();
+        cells[workflow::kColThinTotalVolume] = formatNumber(cumulativeVolume * area, u"####0");
+        cells[workflow::kColThinTotalValue] = formatNumber(cumulativeValue * area, u"####0");
+
+        // Numbers: the volume before the thinning, so the next growth row's
+        // increment counts the growth since the thinning; the removal.
+        r.numbers = {};
+        r.numbers[workflow::kNumAge] = rec.age;
+        r.numbers[workflow::kNumVolume] = rec.volume + rec.removedVolume;
+        r.numbers[workflow::kNumRemovedVolume] = rec.removedVolume;
+        r.removedValue = valuePerHa;
+        m_main.fillTotalProduction(r, row);
+        m_main.writeIncrements(row, false);
+
+        // The cash flow values thinnings at long-term average prices.
+        const int priceClass = economics::priceClassOf(meanTree, m_interactive);
+        m_main.timberRevenue().set(static_cast<int>(std::nearbyint(rec.age)),
+                                   rec.removedVolume * prices.data().longTermAverage.at(
+                                                           static_cast<std::size_t>(priceClass)));
+
+        m_flags.noThinningYet = false;
+        m_main.thinningWritten(row, rec.volume);
+    });
+}
+
+void ThinWindowLogic::SetGrowFromAfterThin() {
+    shell::guard(m_main.errorLog(), QStringLiteral(" in Misc.SetGrowFromAfterThin()"), [&] {
+        const workflow::ProjectionTable &table = m_main.table();
+        const int row = table.currentRow();
+        if (row < 1) {
+            return;
+        }
+        const QStringList &cells = table.row(row).cells;
+        workflow::IMainView &main = m_main.view();
+        main.setText(MainControl::txtFromA, cells.value(workflow::kColAge));
+        main.setText(MainControl::txtFromH, cells.value(workflow::kColTopHeight));
+        main.setText(MainControl::txtFromN, cells.value(workflow::kColStocking));
+        main.setText(MainControl::txtFromB, cells.value(workflow::kColBasalArea));
+        main.setText(MainControl::txtFromD, cells.value(workflow::kColDbh));
+        if (m_flags.loopUnderWay) {
+            // The next grow of the loop reaches the next thinning age.
+            const double frequency =
+                std::nearbyint(shell::val(m_view.text(ThinControl::txtThinFreq)));
+            const double age = shell::val(cells.value(workflow::kColAge));
+            main.setText(MainControl::txtToA, formatNumber(age + frequency, u"##0"));
+            main.setText(MainControl::txtByA, formatNumber(frequency, u"##0"));
+        }
+    });
+}
+
+} // namespace arbolex::thinning

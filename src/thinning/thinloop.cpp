@@ -1,0 +1,99 @@
+// The thinning loop: the same volume removal every few years up to an age,
+// driven through the same commands a user would press.
+#include "shell/apperror.hpp"
+#include "shell/interactive.hpp"
+#include "shell/vbformat.hpp"
+#include "shell/vbtext.hpp"
+#include "thinning/thinmessages.hpp"
+#include "thinning/thinwindowlogic.hpp"
+#include "workflow/mainmessages.hpp"
+#include "workflow/mainwindowlogic.hpp"
+
+#include <cmath>
+
+namespace arbolex::thinning {
+
+namespace {
+
+/// Keeps the loop flag set for as long as the loop runs, whatever ends it.
+class LoopUnderWay {
+public:
+    explicit LoopUnderWay(bool &flag) : m_flag(flag) { m_flag = true; }
+    ~LoopUnderWay() { m_flag = false; }
+    LoopUnderWay(const LoopUnderWay &) = delete;
+    LoopUnderWay &operator=(const LoopUnderWay &) = delete;
+
+private:
+    bool &m_flag;
+};
+
+double wholeYears(const QString &text) {
+    return std::nearbyint(shell::val(text));
+}
+
+} // namespace
+
+void ThinWindowLogic::chkActivLoop_Click() {
+    const bool on = m_view.isChecked(ThinControl::chkActivLoop);
+    for (ThinControl c : {ThinControl::fraLoop, ThinControl::txtThinFreq, ThinControl::txtThinUntil,
+                          ThinControl::cmdLoop}) {
+        m_view.setEnabled(c, on);
+    }
+}
+
+bool ThinWindowLogic::loopFieldCheck() {
+    if (field(ThinControl::txtThinFreq).isEmpty()) {
+        return refuse(text::enterFrequency(), ThinControl::txtThinFreq);
+    }
+    if (field(ThinControl::txtThinUntil).isEmpty()) {
+        return refuse(text::enterThinUntil(), ThinControl::txtThinUntil);
+    }
+    return true;
+}
+
+void ThinWindowLogic::resetFields() {
+    for (ThinControl c : {ThinControl::txtRemB, ThinControl::txtRemN, ThinControl::txtRemV,
+                          ThinControl::txtPostB, ThinControl::txtPostN, ThinControl::txtPostV}) {
+        m_view.setText(c, QString());
+    }
+}
+
+void ThinWindowLogic::cmdLoop_Click() {
+    shell::guard(m_main.errorLog(), QStringLiteral(" in frmThin.cmdLoop_Click()"), [&] {
+        if (!loopFieldCheck()) {
+            return;
+        }
+        const QString intensityText = field(ThinControl::txtRemV);
+        if (!shell::isNumeric(intensityText)) {
+            shell::raiseAppFault(shell::kAppTypeMismatch);
+        }
+        const double intensity = shell::val(intensityText);
+        const double age = wholeYears(m_main.view().text(workflow::MainControl::txtFromA));
+        const double until = wholeYears(field(ThinControl::txtThinUntil));
+        const double frequency = wholeYears(field(ThinControl::txtThinFreq));
+        if (frequency == 0.0) {
+            shell::raiseAppFault(shell::kAppDivisionByZero);
+        }
+        // n + 1 passes: the last one leaves a previewed thinning in the window.
+        const auto passes = static_cast<long>(std::nearbyint((until - age) / frequency));
+        const LoopUnderWay underWay(m_flags.loopUnderWay);
+        for (long i = 0; i <= passes; ++i) {
+            cmdAccept_Click();
+            const int rowsBefore = m_main.table().rowCount();
+            m_main.cmdGrow_Click();
+            if (m_main.table().rowCount() == rowsBefore) {
+                break; // the grow was refused or failed: stop with the rows so far
+            }
+            m_main.cmdThin_Click();
+            resetFields();
+            m_view.setText(ThinControl::txtRemV, shell::generalNumber(intensity));
+            cmdThin_Click();
+            if (!m_work.previewed) {
+                break;
+            }
+        }
+    });
+    m_view.showCentred();
+}
+
+} // namespace arbolex::thinning

@@ -1,0 +1,46 @@
+#pragma once
+
+#include "workflow/mainwindowfixture.hpp"
+
+#include "economics/pricedata.hpp"
+#include "shell/vbformat.hpp"
+#include "thinning/headlessthinview.hpp"
+#include "thinning/thinwindowlogic.hpp"
+
+#include <QDir>
+
+namespace arbolex::testing {
+
+using thinning::ThinControl;
+
+/// The main window with a thinning window attached, the shipped price lists,
+/// and model 0 grown from age 15 to `to`.
+class ThinningTest : public MainWindowTest {
+protected:
+    ThinningTest() {
+        const QDir source(QStringLiteral(ARBOLEX_DATA_SOURCE));
+        economics::GetPricesFromFiles(source.path(), prices.data(), log);
+        logic.attachThinning(&thin);
+    }
+
+    void growTo(const QString &to, const QString &by = QStringLiteral("5")) {
+        typeStand(to, by);
+        logic.cmdGrow_Click();
+    }
+
+    /// Grows to `to` and opens the thinning window on the last row.
+    void openThinning(const QString &to = QStringLiteral("30")) {
+        growTo(to);
+        logic.cmdThin_Click();
+    }
+
+    void typeThin(ThinControl c, const QString &text) { thin.typeText(c, text); }
+    float number(ThinControl c) const { return static_cast<float>(shell::val(thinView.text(c))); }
+
+    const workflow::TableRow &lastRow() const { return logic.table().row(logic.table().lastRow()); }
+
+    thinning::HeadlessThinView thinView;
+    thinning::ThinWindowLogic thin{logic, thinView, interactive};
+};
+
+} // namespace arbolex::testing
