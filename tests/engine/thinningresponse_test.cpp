@@ -1,0 +1,120 @@
+// The thinning response: residual stocking, residual basal area and the Newton
+// solve for a residual volume.
+#include "recordingreport.hpp"
+
+#include <cmath>
+
+namespace arbolex::engine::testing {
+namespace {
+
+/// A stand ready for thinning: age 30, 2000 stems/ha, top height 13 m, 40 m²/ha.
+constexpr float kStocking = 2000.0f;
+constexpr float kHeight = 13.0f;
+constexpr float kBasalArea = 40.0f;
+
+class ThinningResponseTest : public EngineTest, public ::testing::WithParamInterface<int> {
+protected:
+    void SetUp() override {
+        ASSERT_TRUE(grow.GetModel(static_cast<std::int16_t>(GetParam())));
+        grow.GetVCF();
+        ASSERT_TRUE(grow.SiteIndex(30.0f, kHeight));
+    }
+};
+
+TEST_P(ThinningResponseTest, ResidualStockingAndBasalAreaAreInverse) {
+    EXPECT_EQ(grow.NRES(kHeight, kStocking, kBasalArea, kBasalArea), kStocking);
+    EXPECT_TRUE(nearRel(kBasalArea, grow.BRES(kHeight, kStocking, kBasalArea, kStocking), 1e-12));
+    float previous = kStocking;
+    for (float gr : {35.0f, 30.0f, 22.5f, 15.0f}) {
+        const float nr = grow.NRES(kHeight, kStocking, kBasalArea, gr);
+        EXPECT_LT(nr, previous) << gr; // less basal area left, fewer stems left
+        previous = nr;
+        EXPECT_TRUE(nearRel(gr, grow.BRES(kHeight, kStocking, kBasalArea, nr), 1e-6)) << gr;
+    }
+}
+
+TEST_P(ThinningResponseTest, NewtonKeepsAStandAtItsOwnVolume) {
+    const float v = grow.GetV7(kBasalArea, kStocking, kHeight);
+    float nr = 0.0f, gr = 0.0f;
+    ASSERT_TRUE(grow.NEWTON(kStocking, kBasalArea, kHeight, v, nr, gr));
+    EXPECT_NEAR(gr, kBasalArea, 1e-3);
+    EXPECT_TRUE(nearRel(kStocking, nr, 1e-6));
+}
+
+TEST_P(ThinningResponseTest, NewtonRemovesAQuarterOfTheVolume) {
+    const float vt = 0.75f * grow.GetV7(kBasalArea, kStocking, kHeight);
+    float nr = 0.0f, gr = 0.0f;
+    ASSERT_TRUE(grow.NEWTON(kStocking, kBasalArea, kHeight, vt, nr, gr));
+    EXPECT_LT(gr, kBasalArea);
+    EXPECT_LT(nr, kStocking);
+    // Nr belongs to the basal area one Newton step before Gr; the volume of
+    // the returned basal area on the response curve is on target.
+    EXPECT_NEAR(grow.GetV7(gr, grow.NRES(kHeight, kStocking, kBasalArea, gr), kHeight), vt, 0.01);
+}
+
+/// The catalogue entries with a thinning response.
+INSTANTIATE_TEST_SUITE_P(Grow, ThinningResponseTest,
+                         ::testing::Values(0, 2, 4, 6, 8, 10, 12, 14, 16, 19, 21));
+
+using ThinningFailureTest = EngineTest;
+
+TEST_F(ThinningFailureTest, ModelWithoutResponseDividesByZero) {
+    ASSERT_TRUE(grow.GetModel(1)); // a = 0
+    EXPECT_EQ(grow.NRES(kHeight, kStocking, kBasalArea, 30.0f), 0.0f);
+    EXPECT_EQ(grow.BRES(kHeight, kStocking, kBasalArea, 1500.0f), 0.0);
+    ASSERT_EQ(report.messages.size(), 2u);
+    ASSERT_EQ(report.logLines.size(), 2u);
+    EXPECT_EQ(report.messages[0].title, titles::kArbolex);
+    EXPECT_EQ(report.messages[0].text,
+              "ERROR - in residual stocking calculation. Reason: Division by zero");
+    EXPECT_EQ(report.messages[1].text,
+              "ERROR - in residual Basal Area calculation. Reason: Division by zero");
+    for (const std::string &line : report.logLines) {
+        EXPECT_TRUE(line.starts_with("Error # :11  Division by zero in line ")) << line;
+    }
+    // The residual stocking's mark has never carried parentheses.
+    EXPECT_TRUE(report.logLines[0].ends_with(" in Grow.NRES")) << report.logLines[0];
+    EXPECT_TRUE(report.logLines[1].ends_with(" in Grow.BRES()")) << report.logLines[1];
+    report.clear();
+}
+
+TEST_F(ThinningFailureTest, UnreachableVolumeTripsTheIterationLimit) {
+    // Along the response curve of this lodgepole pine stand the volume peaks
+    // just under its present volume, so asking for 1% more makes Newton's
+    // method oscillate around the peak.
+    ASSERT_TRUE(grow.GetModel(6));
+    ASSERT_TRUE(grow.SiteIndex(30.0f, 15.0f));
+    const float vt = 1.01f * grow.GetV7(20.0f, 2500.0f, 15.0f);
+    float nr = -1.0f, gr = -1.0f;
+    EXPECT_FALSE(grow.NEWTON(2500.0f, 20.0f, 15.0f, vt, nr, gr));
+    EXPECT_EQ(gr, 0.0f);
+    EXPECT_EQ(nr, 0.0f);
+    ASSERT_EQ(report.messages.size(), 1u);
+    EXPECT_EQ(report.messages[0].title, titles::kOstran);
+    EXPECT_EQ(report.messages[0].text, "ERROR - Exceed iteration limit in Newton's Algorithm.");
+    EXPECT_EQ(report.messages[0].style, 48);
+    EXPECT_TRUE(report.logLines.empty());
+    report.clear();
+}
+
+TEST_F(ThinningFailureTest, NonPositiveVolumeFailsInAPowerAndIsReportedOnce) {
+    ASSERT_TRUE(grow.GetModel(0));
+    ASSERT_TRUE(grow.SiteIndex(30.0f, kHeight));
+    // Vt = 0 starts Newton at Gr = 0 (0^−a divides by zero); Vt < 0 at a
+    // negative Gr (a negative base to a fractional power).
+    for (const float vt : {0.0f, -50.0f}) {
+        float nr = -1.0f, gr = -1.0f;
+        EXPECT_FALSE(grow.NEWTON(kStocking, kBasalArea, kHeight, vt, nr, gr));
+        EXPECT_EQ(gr, 0.0f);
+        EXPECT_EQ(nr, 0.0f);
+        ASSERT_EQ(report.messages.size(), 1u) << vt;
+        ASSERT_EQ(report.logLines.size(), 1u) << vt;
+        EXPECT_TRUE(report.messages[0].text.starts_with(
+            "ERROR - in residual stocking calculation. Reason: "));
+        EXPECT_TRUE(report.logLines[0].ends_with(" in Grow.NRES"));
+        report.clear();
+    }
+}
+
+} // namespace
+} // namespace arbolex::engine::testing
