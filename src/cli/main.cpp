@@ -1,0 +1,81 @@
+// arbolex-cli: the engine without a screen. One word selects a subcommand from
+// the table below; every subcommand lives in a file of its own.
+#include "cli/command.hpp"
+#include "shell/datafolder.hpp"
+
+#include <QCoreApplication>
+
+#include <algorithm>
+#include <vector>
+
+namespace {
+
+using arbolex::cli::Command;
+
+/// The subcommands, in the order the help lists them. A new command is one
+/// entry here (and its file).
+const std::vector<Command> &commands() {
+    static const std::vector<Command> table = {
+        arbolex::cli::projectCommand(),
+        arbolex::cli::thinCommand(),
+    };
+    return table;
+}
+
+QString overview() {
+    QString text = QStringLiteral("usage: arbolex-cli <command> [options]\n"
+                                  "       arbolex-cli <command> --help\n"
+                                  "\n"
+                                  "commands:\n");
+    for (const Command &c : commands()) {
+        text += QStringLiteral("  ") + c.name.leftJustified(10) + c.summary + QLatin1Char('\n');
+    }
+    text += QStringLiteral(
+        "\n"
+        "Engine messages and failure lines go to stderr as MSG<TAB>title<TAB>text<TAB>style\n"
+        "and LOG<TAB>line; failure lines are also appended to ErrorLog.txt in the data\n"
+        "folder: --data-dir DIR, else $ARBOLEX_DATA_DIR, else the program's folder.\n"
+        "Exit status: 0 done, 1 the engine failed, 2 the command line is wrong.\n");
+    return text;
+}
+
+bool isHelp(const QString &word) {
+    return word == QLatin1String("--help") || word == QLatin1String("-h");
+}
+
+} // namespace
+
+int main(int argc, char *argv[]) {
+    QCoreApplication application(argc, argv);
+    QTextStream out(stdout);
+    QTextStream err(stderr);
+    const QStringList arguments = QCoreApplication::arguments().mid(1);
+
+    if (arguments.isEmpty()) {
+        err << overview();
+        return arbolex::cli::kExitBadArguments;
+    }
+    if (isHelp(arguments.first())) {
+        out << overview();
+        for (const Command &c : commands()) {
+            out << '\n' << c.name << ":\n" << c.help;
+        }
+        return arbolex::cli::kExitSuccess;
+    }
+    for (const Command &c : commands()) {
+        if (c.name != arguments.first()) {
+            continue;
+        }
+        const QStringList rest = arguments.mid(1);
+        if (std::any_of(rest.begin(), rest.end(), isHelp)) {
+            out << c.help;
+            return arbolex::cli::kExitSuccess;
+        }
+        arbolex::cli::CommandContext context{
+            rest, arbolex::shell::dataFolder(rest, QCoreApplication::applicationDirPath()), out,
+            err};
+        return c.run(context);
+    }
+    err << "arbolex-cli: unknown command \"" << arguments.first() << "\"\n\n" << overview();
+    return arbolex::cli::kExitBadArguments;
+}

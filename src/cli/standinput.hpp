@@ -1,0 +1,77 @@
+#pragma once
+
+// What the projection and thinning commands share: the stand typed on the
+// command line, the engine's reports on stderr and in the error log, and the
+// way numbers are written.
+
+#include "cli/options.hpp"
+#include "engine/grow.hpp"
+#include "shell/errorlog.hpp"
+
+#include <QTextStream>
+
+#include <cstdint>
+#include <vector>
+
+namespace arbolex::cli {
+
+/// The engine's message boxes and failure lines as lines on stderr,
+/// "MSG<TAB>title<TAB>text<TAB>style" and "LOG<TAB>line" (CR and LF written as
+/// \r and \n); the failure lines are appended to the error log as well.
+class StreamReport : public engine::IEngineReport {
+public:
+    StreamReport(QTextStream &err, const QString &dataFolder) : m_err(err), m_log(dataFolder) {}
+
+    void showMessage(std::string_view title, std::string_view text, int style) override;
+    void logError(std::string_view message) override;
+
+    /// Messages and failure lines so far: any of them means the engine failed.
+    int reports() const { return m_reports; }
+
+private:
+    QTextStream &m_err;
+    shell::ErrorLog m_log;
+    int m_reports = 0;
+};
+
+/// A sub-compartment as typed: model, age (years), stocking (stems/ha), top
+/// height (m) and basal area (m²/ha), the latter given directly or from the
+/// mean diameter.
+struct StandInput {
+    std::int16_t model = 0;
+    float age = 0.0f;
+    float stocking = 0.0f;
+    float height = 0.0f;
+    float basalArea = 0.0f;
+};
+
+/// The option names of the stand, without their dashes.
+std::vector<const char *> standOptionNames();
+
+/// Help lines of the stand options.
+QString standOptionsHelp();
+
+/// Reads the stand; --basal-area and --dbh exclude each other. Throws UsageError.
+StandInput readStand(const Options &options);
+
+/// Mean diameter at breast height, cm: 200·√(G / (N·π)), N ≤ 0 taken as 1 and
+/// G < 0 as 0.
+float diameterOf(float basalArea, float stocking);
+
+/// Basal area, m²/ha, of N stems of diameter D cm: N·π·D² / 40000.
+float basalAreaOf(float stocking, float diameter);
+
+/// A number as the tables print it ("%.9g": every single-precision value
+/// comes back exactly).
+QString formatNumber(double x);
+
+/// Makes the stand's model active with its volume correction factor, as the
+/// model menu does, then computes the site index. Returns the site index's
+/// success.
+bool selectModelAndSiteIndex(engine::Grow &grow, const StandInput &stand);
+
+/// The "# site_index" and "# model" lines; the site index is left empty when
+/// it could not be computed.
+void writePreamble(QTextStream &out, const engine::Grow &grow, bool siteIndexOk);
+
+} // namespace arbolex::cli
