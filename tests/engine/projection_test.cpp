@@ -139,19 +139,6 @@ INSTANTIATE_TEST_SUITE_P(Grow, StateYearTest,
                          ::testing::Values(Rounding{12.5f, 12.0f}, Rounding{13.5f, 14.0f},
                                            Rounding{12.6f, 13.0f}, Rounding{13.4f, 13.0f}));
 
-TEST_F(ProjectionTest, FractionalAgeMovesLikeTheClosedHeightCurve) {
-    select(0);
-    float a = 12.6f, g = kBasalArea, n = kStocking, h = kHeight, target = 40.0f;
-    float si = grow.siteIndex();
-    grow.STATEYR(a, g, n, h, target, si);
-    // H^b − K shrinks by exp(−Δ) with Δ = 0.4 years · ρ.
-    const double b = grow.S(1), K = grow.S(6);
-    const double delta = (13.0 - double{12.6f}) * grow.rate(si);
-    const double expected =
-        std::pow(K + (std::pow(double{kHeight}, b) - K) * std::exp(-delta), 1.0 / b);
-    EXPECT_TRUE(nearRel(expected, h, 1e-6));
-}
-
 TEST_F(ProjectionTest, StateYearReportsAStandThatCannotBeInverted) {
     // A seedling stand taken back to its first year leaves the transform's domain.
     ASSERT_TRUE(grow.GetModel(0));
