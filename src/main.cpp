@@ -1,14 +1,16 @@
-// ARBOLEX: the desktop program. Builds the engine, the prices and the main
-// window with its logic, loads the main window, then lets the user choose the
-// model in the model choice window.
+// ARBOLEX: the desktop program. Builds the engine, the prices, the main window
+// and the thinning window with their logic, loads the main window, then lets
+// the user choose the model in the model choice window.
 #include "economics/prices.hpp"
 #include "engine/grow.hpp"
 #include "shell/datafolder.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
+#include "thinning/thinwindowlogic.hpp"
 #include "ui/mainwindow.hpp"
 #include "ui/modelchoicedialog.hpp"
 #include "ui/qtinteractive.hpp"
+#include "ui/thinwindow.hpp"
 #include "ui/windowtexts.hpp"
 #include "workflow/mainwindowlogic.hpp"
 
@@ -20,20 +22,55 @@
 
 namespace {
 
+using arbolex::thinning::ThinControl;
+using arbolex::thinning::ThinWindowLogic;
 using arbolex::workflow::MainControl;
+using arbolex::workflow::MainWindowLogic;
 
-/// Grows a young Sitka spruce stand with model 0, as a user would type it:
-/// a way to look at a filled main window without a keyboard.
-void demoGrow(arbolex::workflow::MainWindowLogic &logic) {
+/// Grows a young Sitka spruce stand with model 0 (age 15, 2500 stems/ha, 7 m,
+/// 20 m²/ha) to `to` by 5 years, as a user would type it: a way to look at a
+/// filled main window without a keyboard.
+void demoGrow(MainWindowLogic &logic, const QString &to = QStringLiteral("50")) {
     logic.mnuModel_Click(0);
     logic.typeText(MainControl::txtFromA, QStringLiteral("15"));
     logic.typeText(MainControl::txtFromN, QStringLiteral("2500"));
     logic.typeText(MainControl::txtFromH, QStringLiteral("7"));
     logic.typeText(MainControl::txtFromB, QStringLiteral("20"));
     logic.typeText(MainControl::txtFromD, QString());
-    logic.typeText(MainControl::txtToA, QStringLiteral("50"));
+    logic.typeText(MainControl::txtToA, to);
     logic.typeText(MainControl::txtByA, QStringLiteral("5"));
     logic.cmdGrow_Click();
+}
+
+/// The thinning demonstrations, each from the same young stand:
+///   open     the thinning window just opened on the last row, at 30;
+///   preview  the same after previewing a removal of 60 m³/ha;
+///   loop     30 m³/ha thinned at 20, then every 5 years until 50, and the
+///            thinning window left, so the table is in view.
+/// False for an unknown stage.
+bool demoThin(MainWindowLogic &logic, ThinWindowLogic &thin, const QString &stage) {
+    if (stage == QLatin1String("open") || stage == QLatin1String("preview")) {
+        demoGrow(logic, QStringLiteral("30"));
+        logic.cmdThin_Click();
+        if (stage == QLatin1String("preview")) {
+            thin.typeText(ThinControl::txtRemV, QStringLiteral("60"));
+            thin.press(ThinControl::cmdThin);
+        }
+        return true;
+    }
+    if (stage == QLatin1String("loop")) {
+        demoGrow(logic, QStringLiteral("20"));
+        logic.cmdThin_Click();
+        thin.typeText(ThinControl::txtRemV, QStringLiteral("30"));
+        thin.press(ThinControl::cmdThin);
+        thin.press(ThinControl::chkActivLoop);
+        thin.typeText(ThinControl::txtThinFreq, QStringLiteral("5"));
+        thin.typeText(ThinControl::txtThinUntil, QStringLiteral("50"));
+        thin.press(ThinControl::cmdLoop);
+        thin.press(ThinControl::cmdCancel);
+        return true;
+    }
+    return false;
 }
 
 /// The options of the command line.
@@ -46,6 +83,8 @@ struct Options {
         parser.addOption(dataDir);
         parser.addOption(noIntro);
         parser.addOption(demo);
+        demoThin.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(demoThin);
     }
 
     QCommandLineOption dataDir{QStringLiteral("data-dir"),
@@ -57,6 +96,7 @@ struct Options {
                                QStringLiteral("Open the main window directly, with the model of "
                                               "the start-up file.")};
     QCommandLineOption demo{QStringLiteral("demo-grow")};
+    QCommandLineOption demoThin{QStringLiteral("demo-thin"), QString(), QStringLiteral("STAGE")};
 };
 
 void nameApplication() {
@@ -107,11 +147,24 @@ int main(int argc, char *argv[]) {
 
     arbolex::ui::MainWindow window;
     interactive.setParentWidget(&window);
-    arbolex::workflow::MainWindowLogic logic(grow, prices, log, folder, window, interactive);
+    MainWindowLogic logic(grow, prices, log, folder, window, interactive);
     window.attach(logic, settings);
+    // The thinning window opens over the main window; the main window's thin
+    // command reaches it through its logic.
+    arbolex::ui::ThinWindow thinWindow(&window);
+    ThinWindowLogic thinLogic(logic, thinWindow, interactive);
+    thinWindow.attach(thinLogic);
+    logic.attachThinning(&thinLogic);
     logic.Form_Load(settings, QGuiApplication::primaryScreen()->availableGeometry());
 
-    if (parser.isSet(options.demo)) {
+    if (parser.isSet(options.demoThin)) {
+        const QString stage = parser.value(options.demoThin);
+        QTimer::singleShot(0, &window, [&logic, &thinLogic, stage] {
+            if (!demoThin(logic, thinLogic, stage)) {
+                qWarning("unknown thinning demonstration: %s", qPrintable(stage));
+            }
+        });
+    } else if (parser.isSet(options.demo)) {
         QTimer::singleShot(0, &window, [&logic] { demoGrow(logic); });
     }
     if (parser.isSet(options.noIntro)) {

@@ -204,20 +204,29 @@ QWidget *MainWindow::buildPanel() {
     QFont bold = grow->font();
     bold.setBold(true);
     grow->setFont(bold);
+    // Only thinned models offer the thin command: the logic enables it.
+    QPushButton *thin = addButton(MainControl::cmdThin, text::buttonThin());
+    thin->setToolTip(text::hintThin());
     QPushButton *useRow = addButton(MainControl::cmdUseRow, text::buttonUseRow());
     useRow->setToolTip(text::hintUseRow());
     QPushButton *clear = addButton(MainControl::cmdClear, text::buttonClear());
     QPushButton *clearAll = addButton(MainControl::cmdClearAll, text::buttonClearAll());
     commands->addWidget(grow, 0, 0);
-    commands->addWidget(useRow, 1, 0);
-    commands->addWidget(clear, 2, 0);
-    commands->addWidget(clearAll, 3, 0);
-    commands->setRowStretch(4, 1);
+    commands->addWidget(thin, 1, 0);
+    commands->addWidget(useRow, 2, 0);
+    commands->addWidget(clear, 3, 0);
+    commands->addWidget(clearAll, 4, 0);
+    commands->setRowStretch(5, 1);
     row->addLayout(commands);
 
     connect(grow, &QPushButton::clicked, this, [this] {
         if (m_logic != nullptr) {
             m_logic->cmdGrow_Click();
+        }
+    });
+    connect(thin, &QPushButton::clicked, this, [this] {
+        if (m_logic != nullptr) {
+            m_logic->cmdThin_Click();
         }
     });
     connect(useRow, &QPushButton::clicked, this, [this] {
@@ -238,10 +247,11 @@ QWidget *MainWindow::buildPanel() {
 
     // Keyboard order follows the stand description, then the projection.
     const MainControl order[] = {
-        MainControl::txtFromA,  MainControl::txtFromN,   MainControl::txtFromH,
-        MainControl::txtFromB,  MainControl::txtFromD,   MainControl::txtToA,
-        MainControl::txtByA,    MainControl::txtNetArea, MainControl::cmdGrow,
-        MainControl::cmdUseRow, MainControl::cmdClear,   MainControl::cmdClearAll};
+        MainControl::txtFromA,   MainControl::txtFromN,   MainControl::txtFromH,
+        MainControl::txtFromB,   MainControl::txtFromD,   MainControl::txtToA,
+        MainControl::txtByA,     MainControl::txtNetArea, MainControl::cmdGrow,
+        MainControl::cmdThin,    MainControl::cmdUseRow,  MainControl::cmdClear,
+        MainControl::cmdClearAll};
     for (std::size_t i = 1; i < std::size(order); ++i) {
         setTabOrder(control(order[i - 1]), control(order[i]));
     }

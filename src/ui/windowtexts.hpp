@@ -1,7 +1,8 @@
 #pragma once
 
-// Every text the windows `frmMain` and `frmModelChoice` show of their own (the
-// logic writes the captions, messages and results): a changed caption is one edit.
+// Every text the windows `frmMain`, `frmThin` and `frmModelChoice` show of their
+// own (the logic writes the captions, messages and results): a changed caption is
+// one edit.
 
 #include "engine/catalogue.hpp"
 
@@ -112,6 +113,87 @@ inline QString buttonUseRow() {
 }
 inline QString hintUseRow() {
     return QStringLiteral("Continue from the selected row");
+}
+inline QString buttonThin() {
+    return QStringLiteral("&Thin");
+}
+inline QString hintThin() {
+    return QStringLiteral("Mark or edit thinning.");
+}
+
+// ---- Thinning window ----------------------------------------------------------------
+
+/// Title until the window is loaded on a row (the load writes the age in).
+inline QString thinTitle() {
+    return QStringLiteral("ARBOLEX \u2014 Thinning");
+}
+inline QString groupThinDetails() {
+    return QStringLiteral("Thinning details");
+}
+inline QString columnPreThin() {
+    return QStringLiteral("Pre-thin");
+}
+inline QString columnThinning() {
+    return QStringLiteral("Thinning");
+}
+inline QString columnPostThin() {
+    return QStringLiteral("Post-thin");
+}
+inline QString rowThinStocking() {
+    return QStringLiteral("Stocking (N/ha)");
+}
+inline QString rowThinBasalArea() {
+    return QStringLiteral("Basal Area (m2/ha)");
+}
+inline QString rowThinVolume() {
+    return QStringLiteral("Volume (m3/ha)");
+}
+inline QString rowThinMeanDbh() {
+    return QStringLiteral("Mean DBH (cm)");
+}
+inline QString rowThinMeanVolume() {
+    return QStringLiteral("Mean Vol. (m3)");
+}
+
+inline QString buttonThinClear() {
+    return QStringLiteral("&Clear");
+}
+inline QString hintThinClear() {
+    return QStringLiteral("Clear Thinning removals & Post thin columns.");
+}
+inline QString buttonThinThin() {
+    return QStringLiteral("&Thin");
+}
+inline QString hintThinThin() {
+    return QStringLiteral("Calculate Thinning by any of four methods.");
+}
+inline QString buttonThinCancel() {
+    return QStringLiteral("&Cancel");
+}
+inline QString hintThinCancel() {
+    return QStringLiteral("Exit Thinning without performing any new thinning.");
+}
+inline QString buttonThinAccept() {
+    return QStringLiteral("&Accept");
+}
+inline QString hintThinAccept() {
+    return QStringLiteral("Exit Thinning by Saving new thinning or overwriting old thinning.");
+}
+
+inline QString groupLoop() {
+    return QStringLiteral("Loop");
+}
+inline QString checkActivLoop() {
+    return QStringLiteral("Activate Loop");
+}
+inline QString labelThinFreq() {
+    return QStringLiteral("Thinning Frequence");
+}
+inline QString labelThinUntil() {
+    return QStringLiteral("Thin Until");
+}
+inline QString buttonLoop() {
+    return QStringLiteral("Loop");
 }
 
 // ---- Model choice window ------------------------------------------------------------

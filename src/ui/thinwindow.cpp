@@ -1,0 +1,389 @@
+#include "ui/thinwindow.hpp"
+
+#include "thinning/thinwindowlogic.hpp"
+#include "ui/windowtexts.hpp"
+#include "workflow/mainwindowlogic.hpp"
+
+#include <QCheckBox>
+#include <QCloseEvent>
+#include <QGridLayout>
+#include <QGroupBox>
+#include <QHBoxLayout>
+#include <QKeyEvent>
+#include <QLabel>
+#include <QLineEdit>
+#include <QPushButton>
+#include <QScreen>
+#include <QVBoxLayout>
+
+namespace arbolex::ui {
+
+using thinning::ThinControl;
+using thinning::ThinWindowLogic;
+
+namespace {
+
+std::size_t slot(ThinControl c) {
+    return static_cast<std::size_t>(c);
+}
+
+/// Width of a stand value (field or label), in digits of the window's font:
+/// room for "99999.00".
+constexpr int kValueDigits = 8;
+/// Width of a loop field, in digits: years.
+constexpr int kLoopDigits = 4;
+
+/// Rows of the details frame: the quantity and its control in each column
+/// (Pre-thin, Thinning, Post-thin).
+struct DetailRow {
+    QString caption;
+    std::array<ThinControl, 3> controls;
+};
+
+} // namespace
+
+ThinWindow::ThinWindow(QWidget *main) : QDialog(main) {
+    setObjectName(QStringLiteral("frmThin"));
+    setWindowTitle(text::thinTitle());
+    setModal(false);
+    setSizeGripEnabled(false);
+
+    auto *left = new QVBoxLayout;
+    left->setSpacing(10);
+    left->addWidget(buildDetails());
+    left->addWidget(buildLoop());
+
+    auto *layout = new QHBoxLayout(this);
+    layout->setContentsMargins(12, 10, 12, 12);
+    layout->setSpacing(12);
+    layout->addLayout(left);
+    layout->addLayout(buildCommands());
+    // The window is as large as its contents, no larger.
+    layout->setSizeConstraint(QLayout::SetFixedSize);
+
+    // Keyboard order: down each column as a forester fills a prescription,
+    // then the loop, then the commands.
+    const ThinControl order[] = {
+        ThinControl::txtRemN,      ThinControl::txtRemB,      ThinControl::txtRemV,
+        ThinControl::txtPostN,     ThinControl::txtPostB,     ThinControl::txtPostV,
+        ThinControl::cmdThin,      ThinControl::cmdClear,     ThinControl::cmdAccept,
+        ThinControl::cmdCancel,    ThinControl::chkActivLoop, ThinControl::txtThinFreq,
+        ThinControl::txtThinUntil, ThinControl::cmdLoop};
+    for (std::size_t i = 1; i < std::size(order); ++i) {
+        setTabOrder(control(order[i - 1]), control(order[i]));
+    }
+}
+
+void ThinWindow::attach(ThinWindowLogic &logic) {
+    m_logic = &logic;
+}
+
+// ---- Building the window ------------------------------------------------------------
+
+QLineEdit *ThinWindow::addField(ThinControl control, int digits) {
+    auto *field = new QLineEdit(this);
+    field->setObjectName(thinning::controlName(control));
+    field->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
+    field->setFixedWidth(field->fontMetrics().horizontalAdvance(QString(digits, u'0')) + 16);
+    field->installEventFilter(this);
+    m_controls.at(slot(control)) = field;
+    return field;
+}
+
+QLabel *ThinWindow::addResult(ThinControl control) {
+    auto *label = new QLabel(this);
+    label->setObjectName(thinning::controlName(control));
+    label->setTextFormat(Qt::PlainText);
+    label->setFrameStyle(QFrame::StyledPanel | QFrame::Sunken);
+    label->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
+    label->setTextInteractionFlags(Qt::TextSelectableByMouse);
+    // As wide and tall as the fields beside it, so rows and columns line up.
+    const QLineEdit probe;
+    label->setFixedWidth(label->fontMetrics().horizontalAdvance(QString(kValueDigits, u'0')) + 16);
+    label->setFixedHeight(probe.sizeHint().height());
+    label->setIndent(4);
+    m_controls.at(slot(control)) = label;
+    return label;
+}
+
+QPushButton *ThinWindow::addButton(ThinControl control, const QString &caption,
+                                   const QString &hint) {
+    auto *button = new QPushButton(caption, this);
+    button->setObjectName(thinning::controlName(control));
+    button->setToolTip(hint);
+    button->setAutoDefault(false);
+    button->setMinimumWidth(button->fontMetrics().horizontalAdvance(text::buttonThinAccept()) + 40);
+    m_controls.at(slot(control)) = button;
+    return button;
+}
+
+void ThinWindow::run(void (ThinWindowLogic::*handler)()) {
+    if (m_logic != nullptr) {
+        (m_logic->*handler)();
+    }
+}
+
+QWidget *ThinWindow::buildDetails() {
+    auto *box = new QGroupBox(text::groupThinDetails(), this);
+    box->setObjectName(QStringLiteral("fraThinDetails"));
+    auto *grid = new QGridLayout(box);
+    grid->setHorizontalSpacing(10);
+    grid->setVerticalSpacing(6);
+
+    const QString columns[] = {text::columnPreThin(), text::columnThinning(),
+                               text::columnPostThin()};
+    for (int c = 0; c < 3; ++c) {
+        auto *heading = new QLabel(columns[c], box);
+        QFont bold = heading->font();
+        bold.setBold(true);
+        heading->setFont(bold);
+        heading->setAlignment(Qt::AlignCenter);
+        grid->addWidget(heading, 0, c + 1);
+    }
+    auto *rule = new QFrame(box);
+    rule->setFrameShape(QFrame::HLine);
+    rule->setFrameShadow(QFrame::Sunken);
+    grid->addWidget(rule, 1, 0, 1, 4);
+
+    const DetailRow rows[] = {
+        {text::rowThinStocking(),
+         {ThinControl::lblPreN, ThinControl::txtRemN, ThinControl::txtPostN}},
+        {text::rowThinBasalArea(),
+         {ThinControl::lblPreB, ThinControl::txtRemB, ThinControl::txtPostB}},
+        {text::rowThinVolume(),
+         {ThinControl::lblPreV, ThinControl::txtRemV, ThinControl::txtPostV}},
+        {text::rowThinMeanDbh(),
+         {ThinControl::lblPreD, ThinControl::lblRemD, ThinControl::lblPostD}},
+        {text::rowThinMeanVolume(),
+         {ThinControl::lblPreMV, ThinControl::lblRemMV, ThinControl::lblPostMV}}};
+    int r = 2;
+    for (const DetailRow &row : rows) {
+        grid->addWidget(new QLabel(row.caption, box), r, 0);
+        for (std::size_t c = 0; c < row.controls.size(); ++c) {
+            const ThinControl control = row.controls.at(c);
+            QWidget *cell = thinning::isThinField(control)
+                                ? static_cast<QWidget *>(addField(control, kValueDigits))
+                                : static_cast<QWidget *>(addResult(control));
+            grid->addWidget(cell, r, static_cast<int>(c) + 1, Qt::AlignHCenter);
+        }
+        ++r;
+    }
+    grid->setColumnMinimumWidth(0, box->fontMetrics().horizontalAdvance(text::rowThinBasalArea()) +
+                                       12);
+    return box;
+}
+
+QWidget *ThinWindow::buildLoop() {
+    auto *box = new QGroupBox(text::groupLoop(), this);
+    box->setObjectName(thinning::controlName(ThinControl::fraLoop));
+    m_controls.at(slot(ThinControl::fraLoop)) = box;
+    auto *row = new QHBoxLayout(box);
+    row->setSpacing(8);
+
+    auto *activate = new QCheckBox(text::checkActivLoop(), box);
+    activate->setObjectName(thinning::controlName(ThinControl::chkActivLoop));
+    m_controls.at(slot(ThinControl::chkActivLoop)) = activate;
+    // Only the user's click reaches the handler; the logic setting the box
+    // calls the handler itself.
+    connect(activate, &QCheckBox::clicked, this,
+            [this] { run(&ThinWindowLogic::chkActivLoop_Click); });
+    row->addWidget(activate);
+    row->addSpacing(16);
+
+    const auto place = [&](std::size_t index, const QString &caption, ThinControl control) {
+        auto *label = new QLabel(caption, box);
+        QLineEdit *field = addField(control, kLoopDigits);
+        label->setBuddy(field);
+        m_loopCaptions.at(index) = label;
+        row->addWidget(label);
+        row->addWidget(field);
+        row->addSpacing(10);
+    };
+    place(0, text::labelThinFreq(), ThinControl::txtThinFreq);
+    place(1, text::labelThinUntil(), ThinControl::txtThinUntil);
+    row->addStretch(1);
+
+    QPushButton *loop = addButton(ThinControl::cmdLoop, text::buttonLoop(), QString());
+    connect(loop, &QPushButton::clicked, this, [this] { run(&ThinWindowLogic::cmdLoop_Click); });
+    row->addWidget(loop);
+    return box;
+}
+
+QLayout *ThinWindow::buildCommands() {
+    auto *commands = new QVBoxLayout;
+    commands->setSpacing(6);
+    QPushButton *thin =
+        addButton(ThinControl::cmdThin, text::buttonThinThin(), text::hintThinThin());
+    // Enter in a field previews the thinning.
+    thin->setDefault(true);
+    QPushButton *clear =
+        addButton(ThinControl::cmdClear, text::buttonThinClear(), text::hintThinClear());
+    QPushButton *accept =
+        addButton(ThinControl::cmdAccept, text::buttonThinAccept(), text::hintThinAccept());
+    QPushButton *cancel =
+        addButton(ThinControl::cmdCancel, text::buttonThinCancel(), text::hintThinCancel());
+    // The group box title sits above its first row: start the commands level
+    // with the first row of values.
+    commands->addSpacing(fontMetrics().height() + 6);
+    commands->addWidget(thin);
+    commands->addWidget(clear);
+    commands->addStretch(1);
+    commands->addWidget(accept);
+    commands->addWidget(cancel);
+
+    connect(thin, &QPushButton::clicked, this, [this] { run(&ThinWindowLogic::cmdThin_Click); });
+    connect(clear, &QPushButton::clicked, this, [this] { run(&ThinWindowLogic::cmdClear_Click); });
+    connect(accept, &QPushButton::clicked, this,
+            [this] { run(&ThinWindowLogic::cmdAccept_Click); });
+    connect(cancel, &QPushButton::clicked, this,
+            [this] { run(&ThinWindowLogic::cmdCancel_Click); });
+    return commands;
+}
+
+// ---- IThinView ------------------------------------------------------------------------------
+
+QWidget *ThinWindow::control(ThinControl c) const {
+    return m_controls.at(slot(c));
+}
+
+QString ThinWindow::text(ThinControl c) const {
+    QWidget *w = control(c);
+    if (auto *field = qobject_cast<QLineEdit *>(w)) {
+        return field->text();
+    }
+    if (auto *label = qobject_cast<QLabel *>(w)) {
+        return label->text();
+    }
+    if (auto *button = qobject_cast<QAbstractButton *>(w)) {
+        return button->text();
+    }
+    if (auto *box = qobject_cast<QGroupBox *>(w)) {
+        return box->title();
+    }
+    return {};
+}
+
+void ThinWindow::setText(ThinControl c, const QString &value) {
+    QWidget *w = control(c);
+    if (auto *field = qobject_cast<QLineEdit *>(w)) {
+        field->setText(value);
+    } else if (auto *label = qobject_cast<QLabel *>(w)) {
+        label->setText(value);
+    } else if (auto *button = qobject_cast<QAbstractButton *>(w)) {
+        button->setText(value);
+    } else if (auto *box = qobject_cast<QGroupBox *>(w)) {
+        box->setTitle(value);
+    }
+}
+
+void ThinWindow::setEnabled(ThinControl c, bool enabled) {
+    if (c == ThinControl::fraLoop) {
+        // The frame holds the switch that enables it: grey its captions, keep
+        // the switch live.
+        for (QLabel *caption : m_loopCaptions) {
+            caption->setEnabled(enabled);
+        }
+        return;
+    }
+    if (QWidget *w = control(c)) {
+        w->setEnabled(enabled);
+    }
+}
+
+bool ThinWindow::isChecked(ThinControl c) const {
+    auto *box = qobject_cast<QCheckBox *>(control(c));
+    return box != nullptr && box->isChecked();
+}
+
+void ThinWindow::setChecked(ThinControl c, bool checked) {
+    if (auto *box = qobject_cast<QCheckBox *>(control(c))) {
+        box->setChecked(checked);
+    }
+}
+
+void ThinWindow::focus(ThinControl c) {
+    QWidget *w = control(c);
+    if (w == nullptr) {
+        return;
+    }
+    w->setFocus(Qt::OtherFocusReason);
+    if (auto *field = qobject_cast<QLineEdit *>(w)) {
+        field->selectAll();
+    }
+}
+
+void ThinWindow::setCaption(const QString &caption) {
+    setWindowTitle(caption);
+}
+
+void ThinWindow::showCentred() {
+    adjustSize();
+    const QWidget *main = parentWidget();
+    const QScreen *where = main != nullptr ? main->screen() : screen();
+    const QRect available = where->availableGeometry();
+    const QRect over = main != nullptr && main->isVisible() ? main->frameGeometry() : available;
+    // Before its first showing the window has no frame yet: take the main
+    // window's, which the window manager draws alike.
+    QSize frame = frameGeometry().size();
+    if (!isVisible() && main != nullptr && main->isVisible()) {
+        frame += main->frameGeometry().size() - main->size();
+    }
+    QRect placed(QPoint(0, 0), frame);
+    placed.moveCenter(over.center());
+    // Never partly off the screen, whatever the main window's placement.
+    placed.moveLeft(std::clamp(placed.left(), available.left(),
+                               std::max(available.left(), available.right() - placed.width())));
+    placed.moveTop(std::clamp(placed.top(), available.top(),
+                              std::max(available.top(), available.bottom() - placed.height())));
+    move(placed.topLeft());
+    show();
+    raise();
+    activateWindow();
+}
+
+void ThinWindow::close() {
+    hide();
+}
+
+bool ThinWindow::isShown() const {
+    return isVisible();
+}
+
+// ---- Closing ---------------------------------------------------------------------------------
+
+void ThinWindow::reject() {
+    if (m_logic != nullptr) {
+        m_logic->cmdCancel_Click();
+    } else {
+        QDialog::reject();
+    }
+}
+
+void ThinWindow::closeEvent(QCloseEvent *event) {
+    if (m_logic != nullptr && isVisible()) {
+        m_logic->cmdCancel_Click();
+    }
+    event->accept();
+}
+
+bool ThinWindow::eventFilter(QObject *watched, QEvent *event) {
+    if (event->type() == QEvent::KeyPress) {
+        const auto name = thinning::thinControlFromName(watched->objectName());
+        if (name && thinning::isThinField(*name) && control(*name) == watched) {
+            // Typed characters go through the key filter; editing keys and
+            // shortcuts carry no printable text and pass untouched.
+            const auto *key = static_cast<QKeyEvent *>(event);
+            const bool shortcut = key->modifiers() & (Qt::ControlModifier | Qt::AltModifier);
+            if (!shortcut) {
+                for (const QChar c : key->text()) {
+                    if (c.isPrint() && !workflow::MainWindowLogic::KeyFilter(c)) {
+                        return true;
+                    }
+                }
+            }
+        }
+    }
+    return QDialog::eventFilter(watched, event);
+}
+
+} // namespace arbolex::ui

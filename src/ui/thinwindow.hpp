@@ -1,0 +1,79 @@
+#pragma once
+
+#include "thinning/ithinview.hpp"
+
+#include <QDialog>
+
+#include <array>
+
+class QGridLayout;
+class QLabel;
+class QLineEdit;
+class QPushButton;
+
+namespace arbolex::thinning {
+class ThinWindowLogic;
+}
+
+namespace arbolex::ui {
+
+/// The thinning window `frmThin`: the stand before the thinning, the removal
+/// and the stand after it side by side, the commands and the loop frame
+/// `fraLoop`. It is not modal, so the projection table stays in view while a
+/// thinning is prescribed. Everything it shows is set by its logic through
+/// IThinView; everything the user does goes straight to the logic's handlers.
+class ThinWindow : public QDialog, public thinning::IThinView {
+    Q_OBJECT
+public:
+    /// `main` is the window it opens over.
+    explicit ThinWindow(QWidget *main = nullptr);
+
+    /// Binds the window to its logic, which must outlive the window.
+    void attach(thinning::ThinWindowLogic &logic);
+
+    /// The widget of a control (the group box for `fraLoop`).
+    QWidget *control(thinning::ThinControl control) const;
+
+    // IThinView
+    QString text(thinning::ThinControl control) const override;
+    void setText(thinning::ThinControl control, const QString &text) override;
+    using QDialog::setEnabled;
+    void setEnabled(thinning::ThinControl control, bool enabled) override;
+    bool isChecked(thinning::ThinControl control) const override;
+    void setChecked(thinning::ThinControl control, bool checked) override;
+    void focus(thinning::ThinControl control) override;
+    void setCaption(const QString &caption) override;
+    /// Shows the window centred over the main window and brings it to the front.
+    void showCentred() override;
+    /// Hides the window; the logic has already done what closing means.
+    void close() override;
+    bool isShown() const override;
+
+    /// Escape: the same as Cancel.
+    void reject() override;
+
+protected:
+    /// The title bar's close button: the same as Cancel.
+    void closeEvent(QCloseEvent *event) override;
+    /// Typed characters of the fields go through the numeric key filter.
+    bool eventFilter(QObject *watched, QEvent *event) override;
+
+private:
+    QWidget *buildDetails();
+    QWidget *buildLoop();
+    QLayout *buildCommands();
+    QLineEdit *addField(thinning::ThinControl control, int digits);
+    QLabel *addResult(thinning::ThinControl control);
+    QPushButton *addButton(thinning::ThinControl control, const QString &caption,
+                           const QString &hint);
+    /// Runs `handler` of the logic, once it is attached.
+    void run(void (thinning::ThinWindowLogic::*handler)());
+
+    thinning::ThinWindowLogic *m_logic = nullptr;
+    std::array<QWidget *, thinning::kThinControlCount> m_controls{};
+    /// Captions inside the loop frame, greyed with the frame (the switch
+    /// itself stays live, or the loop could never be switched on again).
+    std::array<QLabel *, 2> m_loopCaptions{};
+};
+
+} // namespace arbolex::ui
