@@ -1,8 +1,11 @@
 #!/usr/bin/env bash
 # Screenshots of the desktop program as a user sees it, under a virtual X
-# server: the model choice window, the main window as it opens, and the main
+# server: the model choice window, the main window as it opens, the main
 # window after growing a young Sitka spruce stand (model 0, age 15, 2500
-# stems/ha, 7 m, 20 m²/ha, to 50 by 5).
+# stems/ha, 7 m, 20 m²/ha, to 50 by 5), the thinning window opened on the
+# same stand grown to 30 before and after previewing a removal of 60 m³/ha
+# (the whole screen, and the thinning window alone), and the main window
+# after a thinning loop: 30 m³/ha at 20, then every 5 years until 50.
 #
 #   scripts/screenshot.sh [OUTPUT_FOLDER]      (default /tmp/shots)
 #
@@ -22,7 +25,9 @@ mkdir -p "$out"
 work=$(mktemp -d)
 trap 'rm -rf "$work"' EXIT
 
-# shoot NAME ARGS...: starts the program with ARGS, waits, saves NAME.png.
+# shoot NAME ARGS...: starts the program with ARGS, waits, saves NAME.png
+# (the whole screen). With WINDOW_TITLE set, the top-level window whose title
+# contains it is saved as well, alone, as NAME-window.png.
 shoot() {
     local name=$1
     shift
@@ -35,12 +40,20 @@ shoot() {
             pid=$!
             sleep "$SETTLE"
             import -window root "$SHOT"
+            if [ -n "${WINDOW_TITLE:-}" ]; then
+                id=$(xwininfo -root -tree | grep -F "$WINDOW_TITLE" | head -n 1 | awk "{print \$1}")
+                [ -n "$id" ] && import -window "$id" "${SHOT%.png}-window.png"
+            fi
             kill "$pid" 2>/dev/null || true
             wait "$pid" 2>/dev/null || true
         ' "$exe" --data-dir "$work/data" "$@"
     echo "$out/$name.png"
+    if [ -n "${WINDOW_TITLE:-}" ] && [ -f "$out/$name-window.png" ]; then
+        echo "$out/$name-window.png"
+    fi
 }
 export SETTLE=$settle
+export WINDOW_TITLE=
 
 export SHOT="$out/model-choice.png"
 shoot model-choice
@@ -48,3 +61,14 @@ export SHOT="$out/main-start.png"
 shoot main-start --no-intro
 export SHOT="$out/main-grown.png"
 shoot main-grown --no-intro --demo-grow
+
+export WINDOW_TITLE="Thinning at age"
+export SHOT="$out/thin-open.png"
+rm -f "${SHOT%.png}-window.png"
+shoot thin-open --no-intro --demo-thin open
+export SHOT="$out/thin-preview.png"
+rm -f "${SHOT%.png}-window.png"
+shoot thin-preview --no-intro --demo-thin preview
+export WINDOW_TITLE=
+export SHOT="$out/main-thin-loop.png"
+shoot main-thin-loop --no-intro --demo-thin loop
