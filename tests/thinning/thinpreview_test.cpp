@@ -86,7 +86,7 @@ INSTANTIATE_TEST_SUITE_P(Faults, ThinFieldTest, ::testing::Values(
     FieldFault{"RemoveAllBasalArea", ThinControl::txtRemB, "999", tt::removalLeavesNoBasalArea()},
     FieldFault{"RemoveAllStocking", ThinControl::txtRemN, "99999", tt::removalLeavesNoStocking()},
     FieldFault{"RemoveAllVolume", ThinControl::txtRemV, "99999", tt::removalLeavesNoVolume()}),
-    [](const auto &info) { return std::string(info.param.name); });
+    [](const auto &test) { return std::string(test.param.name); });
 // clang-format on
 
 TEST_F(ThinningTest, NothingPrescribedExplainsTheFourMethods) {

@@ -56,7 +56,7 @@ INSTANTIATE_TEST_SUITE_P(Faults, GrowFromCheckTest, ::testing::Values(
     CheckCase{"HeightAboveAsymptote", MainControl::txtFromH, "49.4", text::rangeHeightLead() + QStringLiteral("49.35]"), 49, MainControl::txtFromH},
     CheckCase{"BasalAreaBelow", MainControl::txtFromB, "9.99", text::rangeBasalArea(), 49, MainControl::txtFromB},
     CheckCase{"TargetAbove", MainControl::txtToA, "61", text::rangeToAgeLead() + QStringLiteral("60]"), 49, MainControl::txtToA}),
-    [](const auto &info) { return std::string(info.param.name); });
+    [](const auto &test) { return std::string(test.param.name); });
 // clang-format on
 
 TEST_F(MainWindowTest, RangeBoundsAreInclusive) {
