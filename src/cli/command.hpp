@@ -44,5 +44,7 @@ struct Command {
 
 Command projectCommand();
 Command thinCommand();
+Command growCommand();
+Command runCommand();
 
 } // namespace arbolex::cli

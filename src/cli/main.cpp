@@ -18,6 +18,8 @@ const std::vector<Command> &commands() {
     static const std::vector<Command> table = {
         arbolex::cli::projectCommand(),
         arbolex::cli::thinCommand(),
+        arbolex::cli::growCommand(),
+        arbolex::cli::runCommand(),
     };
     return table;
 }

@@ -63,6 +63,15 @@ void ThinWindowLogic::cmdLoop_Click() {
         if (!loopFieldCheck()) {
             return;
         }
+        // The last previewed thinning waits in the window for the user.
+        struct ShowWhenDone {
+            IThinView &view;
+            ~ShowWhenDone() {
+                if (!view.isShown()) {
+                    view.showCentred();
+                }
+            }
+        } showWhenDone{m_view};
         const QString intensityText = field(ThinControl::txtRemV);
         if (!shell::isNumeric(intensityText)) {
             shell::raiseAppFault(shell::kAppTypeMismatch);
@@ -93,7 +102,6 @@ void ThinWindowLogic::cmdLoop_Click() {
             }
         }
     });
-    m_view.showCentred();
 }
 
 } // namespace arbolex::thinning

@@ -79,6 +79,17 @@ void MainWindowLogic::Form_Unload(QSettings &settings) {
     economics::WriteUserDefinedAssortmentsInFile(m_dataFolder, m_prices.data(), m_log);
 }
 
+void MainWindowLogic::cmdChangePrices_Click() {
+    shell::guard(m_log, QStringLiteral(" in frmMain.cmdChangePrices_Click()"), [&] {
+        if (!m_prices.priceChanges()) {
+            m_prices.setPriceChanges(true);
+            return;
+        }
+        m_prices.setPriceChanges(false);
+        m_view.setText(MainControl::cmdShowTimberPrice, text::showTimberPrices());
+    });
+}
+
 void MainWindowLogic::SetModelFromfrmModelChoice(int modelId) {
     mnuModel_Click(modelId);
 }

@@ -68,6 +68,8 @@ public:
     /// Thin: opens the thinning window on the last growth row.
     void cmdThin_Click();
     void cmdClear_Click();
+    /// Allows or ends changes to the user-defined prices.
+    void cmdChangePrices_Click();
     /// Clear All: empties the table and shows the header without money column.
     void ClearAll();
     /// Copies the current table row into the grow-from fields.

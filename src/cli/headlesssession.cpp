@@ -1,0 +1,33 @@
+#include "cli/headlesssession.hpp"
+
+namespace arbolex::cli {
+
+QString PrintingInteractive::escaped(QString text) {
+    return text.replace(QLatin1Char('\r'), QStringLiteral("\\r"))
+        .replace(QLatin1Char('\n'), QStringLiteral("\\n"));
+}
+
+void PrintingInteractive::message(const QString &title, const QString &text, int style) {
+    ++m_messages;
+    m_out << "MSG\t" << escaped(title) << '\t' << escaped(text) << '\t' << style << '\n';
+}
+
+bool PrintingInteractive::askYesNo(const QString &title, const QString &text) {
+    if (m_answers.isEmpty()) {
+        throw ScriptStop{QStringLiteral("no answer queued for the question \"") + escaped(text) +
+                         QLatin1Char('"')};
+    }
+    const bool yes = m_answers.takeFirst();
+    m_out << "ASK\t" << escaped(title) << '\t' << escaped(text) << '\t' << (yes ? "yes" : "no")
+          << '\n';
+    return yes;
+}
+
+HeadlessSession::HeadlessSession(const QString &dataFolder, QTextStream &out)
+    : m_log(dataFolder), m_interactive(out), m_report(m_interactive, m_log), m_grow(&m_report),
+      m_main(m_grow, m_prices, m_log, dataFolder, m_mainView, m_interactive),
+      m_thin(m_main, m_thinView, m_interactive) {
+    m_main.attachThinning(&m_thin);
+}
+
+} // namespace arbolex::cli

@@ -1,0 +1,72 @@
+#pragma once
+
+// A whole program without a screen: the engine, the prices, the error log and
+// the main window's logic over a headless view. The runner and the grow
+// shortcut of the command-line program drive it.
+
+#include "economics/prices.hpp"
+#include "engine/grow.hpp"
+#include "shell/enginereport.hpp"
+#include "shell/errorlog.hpp"
+#include "shell/interactive.hpp"
+#include "thinning/headlessthinview.hpp"
+#include "thinning/thinwindowlogic.hpp"
+#include "workflow/headlessmainview.hpp"
+#include "workflow/mainwindowlogic.hpp"
+
+#include <QList>
+#include <QTextStream>
+
+namespace arbolex::cli {
+
+/// Raised when a script cannot go on (a question nobody answered). It is not
+/// a run-time failure of the program, so handlers let it through.
+struct ScriptStop {
+    QString reason;
+};
+
+/// Message boxes become lines on the output: "MSG<TAB>title<TAB>text<TAB>style"
+/// and "ASK<TAB>title<TAB>text<TAB>answer", CR and LF written as \r and \n.
+/// Questions take their answers from a queue.
+class PrintingInteractive : public shell::IInteractive {
+public:
+    explicit PrintingInteractive(QTextStream &out) : m_out(out) {}
+
+    void message(const QString &title, const QString &text, int style) override;
+    bool askYesNo(const QString &title, const QString &text) override;
+
+    void queueAnswer(bool yes) { m_answers.append(yes); }
+    int messagesShown() const { return m_messages; }
+
+    static QString escaped(QString text);
+
+private:
+    QTextStream &m_out;
+    QList<bool> m_answers;
+    int m_messages = 0;
+};
+
+/// The objects of one run of the program.
+class HeadlessSession {
+public:
+    HeadlessSession(const QString &dataFolder, QTextStream &out);
+
+    workflow::MainWindowLogic &main() { return m_main; }
+    workflow::HeadlessMainView &mainView() { return m_mainView; }
+    thinning::ThinWindowLogic &thinning() { return m_thin; }
+    thinning::HeadlessThinView &thinView() { return m_thinView; }
+    PrintingInteractive &interactive() { return m_interactive; }
+
+private:
+    shell::ErrorLog m_log;
+    PrintingInteractive m_interactive;
+    shell::EngineReport m_report;
+    engine::Grow m_grow;
+    economics::Prices m_prices;
+    workflow::HeadlessMainView m_mainView;
+    workflow::MainWindowLogic m_main;
+    thinning::HeadlessThinView m_thinView;
+    thinning::ThinWindowLogic m_thin;
+};
+
+} // namespace arbolex::cli

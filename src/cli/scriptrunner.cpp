@@ -1,0 +1,214 @@
+#include "cli/scriptrunner.hpp"
+
+#include <QFile>
+#include <QSettings>
+#include <QTemporaryDir>
+
+namespace arbolex::cli {
+
+using workflow::MainControl;
+
+ScriptRunner::ScriptRunner(HeadlessSession &session, QTextStream &out)
+    : m_session(session), m_out(out) {
+    workflow::MainWindowLogic &main = session.main();
+    m_commands = {
+        {QStringLiteral("cmdGrow"),
+         [&main] {
+             main.cmdGrow_Click();
+         }},
+        {QStringLiteral("cmdThin"),
+         [&main] {
+             main.cmdThin_Click();
+         }},
+        {QStringLiteral("cmdClear"),
+         [&main] {
+             main.cmdClear_Click();
+         }},
+        {QStringLiteral("cmdClearAll"),
+         [&main] {
+             main.ClearAll();
+         }},
+        {QStringLiteral("cmdUseRow"),
+         [&main] {
+             main.UseFlxRow();
+         }},
+        {QStringLiteral("cmdChangePrices"),
+         [&main] {
+             main.cmdChangePrices_Click();
+         }},
+        {QStringLiteral("mnuThreshold"),
+         [&main] {
+             main.TrhesholdInfo();
+         }},
+        {QStringLiteral("mnuWarn"),
+         [&main] {
+             main.Warn();
+         }},
+    };
+}
+
+ScriptRunner::Outcome ScriptRunner::run(const QStringList &lines) {
+    for (int i = 0; i < lines.size(); ++i) {
+        QString error;
+        try {
+            error = runLine(lines.at(i));
+        } catch (const ScriptStop &stop) {
+            error = stop.reason;
+        }
+        if (!error.isEmpty()) {
+            return {i + 1, error};
+        }
+    }
+    return {};
+}
+
+QString ScriptRunner::runLine(const QString &rawLine) {
+    QString line = rawLine;
+    const qsizetype hash = line.indexOf(QLatin1Char('#'));
+    if (hash >= 0) {
+        line.truncate(hash);
+    }
+    line = line.trimmed();
+    if (line.isEmpty()) {
+        return {};
+    }
+    const QString command = line.section(QLatin1Char(' '), 0, 0, QString::SectionSkipEmpty);
+    const QString rest = line.mid(command.size()).trimmed();
+    const QString control = rest.section(QLatin1Char(' '), 0, 0, QString::SectionSkipEmpty);
+    const QString text = rest.mid(control.size()).trimmed();
+
+    if (command == QLatin1String("model")) {
+        bool ok = false;
+        const int id = rest.toInt(&ok);
+        if (!ok) {
+            return QStringLiteral("model needs a number");
+        }
+        m_session.main().mnuModel_Click(id);
+        return {};
+    }
+    if (command == QLatin1String("set")) {
+        return set(control, text);
+    }
+    if (command == QLatin1String("press")) {
+        return press(control);
+    }
+    if (command == QLatin1String("print")) {
+        return print(control);
+    }
+    if (command == QLatin1String("select")) {
+        const QStringList rows = rest.split(QLatin1Char(' '), Qt::SkipEmptyParts);
+        bool ok1 = false;
+        bool ok2 = true;
+        const int row = rows.value(0).toInt(&ok1);
+        const int end = rows.size() > 1 ? rows.value(1).toInt(&ok2) : row;
+        if (rows.isEmpty() || rows.size() > 2 || !ok1 || !ok2) {
+            return QStringLiteral("select needs ROW [ENDROW]");
+        }
+        m_session.main().select(row, end);
+        return {};
+    }
+    if (command == QLatin1String("answer")) {
+        if (rest != QLatin1String("yes") && rest != QLatin1String("no")) {
+            return QStringLiteral("answer needs yes or no");
+        }
+        m_session.interactive().queueAnswer(rest == QLatin1String("yes"));
+        return {};
+    }
+    return QStringLiteral("unknown command '") + command + QLatin1Char('\'');
+}
+
+namespace {
+constexpr QLatin1String kThinWindow("frmThin.");
+
+/// The thinning-window control `name` names ("frmThin.txtRemV"), if any.
+std::optional<thinning::ThinControl> thinControl(const QString &name) {
+    if (!name.startsWith(kThinWindow)) {
+        return std::nullopt;
+    }
+    return thinning::thinControlFromName(name.mid(kThinWindow.size()));
+}
+} // namespace
+
+QString ScriptRunner::set(const QString &control, const QString &text) {
+    if (const auto thin = thinControl(control)) {
+        if (!thinning::isThinField(*thin)) {
+            return QStringLiteral("no field named '") + control + QLatin1Char('\'');
+        }
+        m_session.thinning().typeText(*thin, text);
+        return {};
+    }
+    const auto main = workflow::mainControlFromName(control);
+    if (!main || !workflow::isNumericField(*main)) {
+        return QStringLiteral("no field named '") + control + QLatin1Char('\'');
+    }
+    m_session.main().typeText(*main, text);
+    return {};
+}
+
+QString ScriptRunner::press(const QString &control) {
+    if (const auto thin = thinControl(control)) {
+        if (!m_session.thinning().press(*thin)) {
+            return QStringLiteral("no command named '") + control + QLatin1Char('\'');
+        }
+        return {};
+    }
+    const auto found = m_commands.find(control);
+    if (found == m_commands.end()) {
+        return QStringLiteral("no command named '") + control + QLatin1Char('\'');
+    }
+    found->second();
+    return {};
+}
+
+QString ScriptRunner::print(const QString &control) {
+    if (control == QLatin1String("flxMain")) {
+        for (const QStringList &row : m_session.main().table().visibleGrid()) {
+            m_out << row.join(QLatin1Char('\t')) << '\n';
+        }
+        return {};
+    }
+    if (const auto thin = thinControl(control)) {
+        thinning::HeadlessThinView &view = m_session.thinView();
+        if (*thin == thinning::ThinControl::chkActivLoop) {
+            m_out << (view.isChecked(*thin) ? "1" : "0") << '\n';
+        } else {
+            m_out << view.text(*thin) << '\n';
+        }
+        return {};
+    }
+    const auto main = workflow::mainControlFromName(control);
+    if (!main) {
+        return QStringLiteral("no control named '") + control + QLatin1Char('\'');
+    }
+    m_out << m_session.mainView().text(*main) << '\n';
+    return {};
+}
+
+int runScriptFile(const QString &scriptPath, const QString &dataFolder, QTextStream &out,
+                  QTextStream &err) {
+    QFile file(scriptPath);
+    if (!file.open(QIODevice::ReadOnly | QIODevice::Text)) {
+        err << "arbolex-cli: cannot read the script " << scriptPath << '\n';
+        return 2;
+    }
+    const QStringList lines = QString::fromUtf8(file.readAll()).split(QLatin1Char('\n'));
+
+    HeadlessSession session(dataFolder, out);
+    // A run without a screen has no window placement worth keeping: its
+    // settings live in a scratch file, never in the user's own settings.
+    QTemporaryDir scratch;
+    QSettings settings(scratch.filePath(QStringLiteral("settings.ini")), QSettings::IniFormat);
+    session.main().Form_Load(settings, QRect(0, 0, 1280, 800));
+
+    ScriptRunner runner(session, out);
+    const ScriptRunner::Outcome outcome = runner.run(lines);
+    out.flush();
+    if (!outcome.ok()) {
+        err << scriptPath << ':' << outcome.line << ": " << outcome.error << '\n';
+        return 2;
+    }
+    session.main().Form_Unload(settings);
+    return 0;
+}
+
+} // namespace arbolex::cli

@@ -1,0 +1,54 @@
+#pragma once
+
+// The script language of the headless runner, one command per line:
+//   model N                  choose model menu entry N
+//   set CONTROL TEXT         type TEXT into a field as a user would, then leave it
+//   press CONTROL            press a button or menu command
+//   select ROW [ENDROW]      current row and end of the selection of flxMain
+//   answer yes|no            the answer to the next question
+//   print flxMain | CONTROL  the grid (header row first) or the text of a control
+// '#' starts a comment. Controls of other windows are named "window.name".
+
+#include "cli/headlesssession.hpp"
+
+#include <QStringList>
+#include <QTextStream>
+
+#include <functional>
+#include <map>
+
+namespace arbolex::cli {
+
+class ScriptRunner {
+public:
+    ScriptRunner(HeadlessSession &session, QTextStream &out);
+
+    /// Where and why a script stopped; `line` 0 when it ran to its end.
+    struct Outcome {
+        int line = 0;
+        QString error;
+        bool ok() const { return line == 0; }
+    };
+
+    /// Runs the lines in order and stops at the first line that is wrong.
+    Outcome run(const QStringList &lines);
+
+    /// Runs one line; returns an error text, empty when the line was fine.
+    QString runLine(const QString &line);
+
+private:
+    QString set(const QString &control, const QString &text);
+    QString press(const QString &control);
+    QString print(const QString &control);
+
+    HeadlessSession &m_session;
+    QTextStream &m_out;
+    std::map<QString, std::function<void()>> m_commands;
+};
+
+/// Runs SCRIPT against the data folder: the main window's load, the script,
+/// the unload. Returns the exit status (0, or 2 for an error of the script).
+int runScriptFile(const QString &scriptPath, const QString &dataFolder, QTextStream &out,
+                  QTextStream &err);
+
+} // namespace arbolex::cli

@@ -1,0 +1,201 @@
+// The headless runner's script language and the grow shortcut.
+#include "mocks/qtprinters.hpp"
+
+#include "cli/scriptrunner.hpp"
+
+#include <QDir>
+#include <QFile>
+#include <QProcess>
+#include <QTemporaryDir>
+
+#include <gtest/gtest.h>
+
+namespace arbolex::testing {
+namespace {
+
+class RunnerTest : public ::testing::Test {
+protected:
+    /// Runs `lines` against a fresh session; returns what it printed.
+    cli::ScriptRunner::Outcome run(const QStringList &lines) {
+        outcome = runner.run(lines);
+        out.flush();
+        return outcome;
+    }
+    QStringList printed() const { return output.split(QLatin1Char('\n'), Qt::SkipEmptyParts); }
+
+    QTemporaryDir dir;
+    QString output;
+    QTextStream out{&output};
+    cli::HeadlessSession session{dir.path(), out};
+    cli::ScriptRunner runner{session, out};
+    cli::ScriptRunner::Outcome outcome;
+};
+
+TEST_F(RunnerTest, TypesPressesAndPrintsAsAUserWould) {
+    ASSERT_TRUE(run({QStringLiteral("model 0  # Sitka spruce"), QStringLiteral(""),
+                     QStringLiteral("set txtFromA 1x5"), QStringLiteral("set txtFromN 2500"),
+                     QStringLiteral("set txtFromH 7"), QStringLiteral("set txtFromB 20"),
+                     QStringLiteral("set txtToA 25"), QStringLiteral("set txtByA 5"),
+                     QStringLiteral("press cmdGrow"), QStringLiteral("print txtFromA"),
+                     QStringLiteral("print lblSI"), QStringLiteral("print flxMain")})
+                    .ok());
+    const QStringList lines = printed();
+    ASSERT_EQ(lines.size(), 2 + 4) << output.toStdString(); // two fields, header, three rows
+    EXPECT_EQ(lines[0], QStringLiteral("25")) << "the key filter dropped the x";
+    EXPECT_EQ(lines[1], QStringLiteral("16.0"));
+    EXPECT_TRUE(lines[2].startsWith(QStringLiteral("Age\tTop Ht\tN/ha\tDBH\t BA")));
+    EXPECT_EQ(lines[2].count(QLatin1Char('\t')), 25);
+    EXPECT_TRUE(lines[3].startsWith(QStringLiteral("15\t7.0\t2500\t10.1\t20.0\t")));
+}
+
+TEST_F(RunnerTest, MessagesAndQuestionsArePrintedInOrder) {
+    ASSERT_TRUE(run({QStringLiteral("set txtFromH 52"), QStringLiteral("press cmdGrow")}).ok());
+    const QStringList lines = printed();
+    ASSERT_EQ(lines.size(), 2);
+    EXPECT_EQ(lines[0], QStringLiteral("MSG\tOSTRAN DYNAMIC YIELD MODELS FOR FOREST MANAGMENT\t"
+                                       "Maximum height alowed is 49\t48"));
+    EXPECT_TRUE(lines[1].startsWith(QStringLiteral("MSG\t")));
+    EXPECT_TRUE(lines[1].contains(QStringLiteral("Grow From AGE")));
+}
+
+TEST_F(RunnerTest, AWholeThinnedRotationCanBeScripted) {
+    const QStringList script = {
+        QStringLiteral("model 0"), QStringLiteral("set txtFromA 15"),
+        QStringLiteral("set txtFromN 2500"), QStringLiteral("set txtFromH 7"),
+        QStringLiteral("set txtFromB 20"), QStringLiteral("set txtToA 30"),
+        QStringLiteral("set txtByA 5"), QStringLiteral("press cmdGrow"),
+        QStringLiteral("press cmdThin"), QStringLiteral("set frmThin.txtRemV 40"),
+        QStringLiteral("press frmThin.cmdThin"), QStringLiteral("print frmThin.txtRemV"),
+        QStringLiteral("press frmThin.cmdAccept"),
+        // A second thinning window offers the loop: the question needs an answer.
+        QStringLiteral("answer no"), QStringLiteral("press cmdThin"),
+        QStringLiteral("print frmThin.chkActivLoop"), QStringLiteral("press frmThin.cmdCancel"),
+        QStringLiteral("print flxMain")};
+    ASSERT_TRUE(run(script).ok()) << outcome.error.toStdString();
+    const QStringList lines = printed();
+    EXPECT_EQ(lines[0], QStringLiteral("40.00"));
+    EXPECT_TRUE(lines[1].startsWith(QStringLiteral("ASK\t")));
+    EXPECT_TRUE(lines[1].endsWith(QStringLiteral("\tno")));
+    EXPECT_TRUE(lines[1].contains(QStringLiteral("thinning only once\\r\\nOR ")));
+    EXPECT_EQ(lines[2], QStringLiteral("0"));
+    EXPECT_TRUE(lines.last().startsWith(QStringLiteral("30\t16.0\t"))) << "the thinning row";
+    EXPECT_TRUE(lines.last().contains(QStringLiteral("\t40\t")));
+}
+
+TEST_F(RunnerTest, ScriptErrorsNameTheirLine) {
+    struct Case {
+        QStringList lines;
+        int line;
+    };
+    const Case cases[] = {
+        {{QStringLiteral("model 0"), QStringLiteral("jump 3")}, 2},
+        {{QStringLiteral("set txtNothing 5")}, 1},
+        {{QStringLiteral("press frmThin.lblPreN")}, 1},
+        {{QStringLiteral("select")}, 1},
+        {{QStringLiteral("answer maybe")}, 1},
+        {{QStringLiteral("print nowhere")}, 1},
+    };
+    for (const Case &c : cases) {
+        EXPECT_EQ(run(c.lines).line, c.line) << c.lines.join(QLatin1Char('|')).toStdString();
+        EXPECT_FALSE(outcome.error.isEmpty());
+    }
+}
+
+TEST_F(RunnerTest, AQuestionWithoutAnAnswerStopsTheScript) {
+    const QStringList script = {QStringLiteral("model 0"),
+                                QStringLiteral("set txtFromA 15"),
+                                QStringLiteral("set txtFromN 2500"),
+                                QStringLiteral("set txtFromH 7"),
+                                QStringLiteral("set txtFromB 20"),
+                                QStringLiteral("set txtToA 30"),
+                                QStringLiteral("set txtByA 5"),
+                                QStringLiteral("press cmdGrow"),
+                                QStringLiteral("press cmdThin"),
+                                QStringLiteral("set frmThin.txtRemV 40"),
+                                QStringLiteral("press frmThin.cmdThin"),
+                                QStringLiteral("press frmThin.cmdAccept"),
+                                QStringLiteral("press cmdThin")};
+    EXPECT_EQ(run(script).line, 13);
+    EXPECT_TRUE(outcome.error.contains(QStringLiteral("no answer")));
+}
+
+QString cli() {
+    return QStringLiteral(ARBOLEX_CLI_PATH);
+}
+
+TEST(RunnerProcessTest, ExitStatusAndTheSavedStartupFile) {
+    QTemporaryDir dir;
+    const QDir data(QStringLiteral(ARBOLEX_DATA_SOURCE));
+    for (const QString &name : data.entryList(QDir::Files)) {
+        QFile::copy(data.filePath(name), dir.filePath(name));
+    }
+    QFile script(dir.filePath(QStringLiteral("s.arb")));
+    ASSERT_TRUE(script.open(QIODevice::WriteOnly));
+    script.write("model 4\nset txtFromA 22\n");
+    script.close();
+    QProcess p;
+    p.start(cli(),
+            {QStringLiteral("run"), script.fileName(), QStringLiteral("--data-dir"), dir.path()});
+    ASSERT_TRUE(p.waitForFinished());
+    EXPECT_EQ(p.exitCode(), 0) << p.readAllStandardError().toStdString();
+    QFile startup(dir.filePath(QStringLiteral("IFPRM1.dat")));
+    ASSERT_TRUE(startup.open(QIODevice::ReadOnly));
+    const QList<QByteArray> values = startup.readAll().split('\n');
+    EXPECT_EQ(values.value(0).trimmed(), QByteArray("4")) << "the unload saved the model";
+    EXPECT_EQ(values.value(1).trimmed(), QByteArray("22"));
+
+    script.open(QIODevice::WriteOnly);
+    script.write("model 4\nfrobnicate\n");
+    script.close();
+    p.start(cli(),
+            {QStringLiteral("run"), script.fileName(), QStringLiteral("--data-dir"), dir.path()});
+    ASSERT_TRUE(p.waitForFinished());
+    EXPECT_EQ(p.exitCode(), 2);
+    EXPECT_TRUE(p.readAllStandardError().contains("s.arb:2:"));
+}
+
+TEST(GrowCommandTest, PrintsTheGridInEachFormat) {
+    QTemporaryDir dir;
+    const QStringList stand = {QStringLiteral("grow"),
+                               QStringLiteral("--model"),
+                               QStringLiteral("0"),
+                               QStringLiteral("--age"),
+                               QStringLiteral("15"),
+                               QStringLiteral("--stocking"),
+                               QStringLiteral("2500"),
+                               QStringLiteral("--height"),
+                               QStringLiteral("7"),
+                               QStringLiteral("--dbh"),
+                               QStringLiteral("10.09"),
+                               QStringLiteral("--to"),
+                               QStringLiteral("25"),
+                               QStringLiteral("--by"),
+                               QStringLiteral("5"),
+                               QStringLiteral("--data-dir"),
+                               dir.path()};
+    QProcess p;
+    p.start(cli(), stand);
+    ASSERT_TRUE(p.waitForFinished());
+    EXPECT_EQ(p.exitCode(), 0) << p.readAllStandardError().toStdString();
+    const QStringList tsv =
+        QString::fromUtf8(p.readAllStandardOutput()).split(QLatin1Char('\n'), Qt::SkipEmptyParts);
+    ASSERT_EQ(tsv.size(), 4);
+    EXPECT_TRUE(tsv[1].startsWith(QStringLiteral("15\t7.0\t2500\t10.1\t20.0")))
+        << "DBH completed BA";
+
+    p.start(cli(), stand + QStringList{QStringLiteral("--format"), QStringLiteral("json")});
+    ASSERT_TRUE(p.waitForFinished());
+    const QString json = QString::fromUtf8(p.readAllStandardOutput());
+    EXPECT_TRUE(json.contains(QStringLiteral("\"columns\": [\"Age\", \"Top Ht\"")));
+    EXPECT_EQ(json.count(QStringLiteral("[\"")), 4);
+
+    QStringList refused = stand;
+    refused[refused.indexOf(QStringLiteral("7"))] = QStringLiteral("60");
+    p.start(cli(), refused);
+    ASSERT_TRUE(p.waitForFinished());
+    EXPECT_EQ(p.exitCode(), 2);
+    EXPECT_TRUE(p.readAllStandardError().contains("Maximum height alowed is 49"));
+}
+
+} // namespace
+} // namespace arbolex::testing
