@@ -85,6 +85,8 @@ struct Options {
         parser.addOption(demo);
         demoThin.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(demoThin);
+        quitWhenShown.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(quitWhenShown);
     }
 
     QCommandLineOption dataDir{QStringLiteral("data-dir"),
@@ -97,6 +99,8 @@ struct Options {
                                               "the start-up file.")};
     QCommandLineOption demo{QStringLiteral("demo-grow")};
     QCommandLineOption demoThin{QStringLiteral("demo-thin"), QString(), QStringLiteral("STAGE")};
+    /// Ends the program once the main window is on screen: start-up is timed with it.
+    QCommandLineOption quitWhenShown{QStringLiteral("quit-when-shown")};
 };
 
 void nameApplication() {
@@ -169,6 +173,9 @@ int main(int argc, char *argv[]) {
     }
     if (parser.isSet(options.noIntro)) {
         window.show();
+        if (parser.isSet(options.quitWhenShown)) {
+            QTimer::singleShot(0, &app, &QCoreApplication::quit);
+        }
     } else {
         arbolex::ui::ModelChoiceDialog choice(window, folder, grow.modelId());
         if (choice.exec() != QDialog::Accepted) {

@@ -1,5 +1,7 @@
 #include "shell/apperror.hpp"
 
+#include "shell/runtimeerror.hpp"
+
 #include <cstdint>
 #include <limits>
 
@@ -27,13 +29,11 @@ void raiseAppFault(int number, std::source_location where) {
 }
 
 QString windowFaultLine(const AppFault &fault, const QString &label) {
-    return QStringLiteral("Error # :") + QString::number(fault.number) + QStringLiteral("  ") +
-           fault.description + QStringLiteral(" in line ") + QString::number(fault.line) + label;
+    return handlerErrorText({fault.number, fault.description}, fault.line, label);
 }
 
 QString moduleFaultLine(const AppFault &fault, const QString &label) {
-    return QStringLiteral("Error ") + QString::number(fault.number) + QLatin1Char(' ') +
-           fault.description + QStringLiteral(" in line ") + QString::number(fault.line) + label;
+    return moduleErrorText({fault.number, fault.description}, fault.line, label);
 }
 
 std::int16_t addInt16(int a, int b, std::source_location where) {

@@ -42,11 +42,11 @@ enum RuntimeErrorNumber : int {
 /// Log text of a failure in a module procedure or a private procedure of a
 /// window: "Error " + number + `gap` + description + " in line " + line + label.
 /// `gap` is one blank for most procedures, two for some ("Error 13  Type mismatch").
-QString moduleErrorText(const RuntimeError &error, int line, QLatin1String label,
-                        QLatin1String gap = QLatin1String(" "));
+QString moduleErrorText(const RuntimeError &error, int line, const QString &label,
+                        const QString &gap = QStringLiteral(" "));
 
 /// Log text of a failure in a window event handler or a growth-model procedure:
 /// "Error # :" + number + two blanks + description + " in line " + line + label.
-QString handlerErrorText(const RuntimeError &error, int line, QLatin1String label);
+QString handlerErrorText(const RuntimeError &error, int line, const QString &label);
 
 } // namespace arbolex::shell

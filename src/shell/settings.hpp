@@ -10,8 +10,8 @@ namespace arbolex::shell {
 inline constexpr const char *kSettingsSection = "Settings";
 
 /// Size of the main window when no usable placement is stored, pixels.
-inline constexpr int kDefaultMainWidth = 1100;
-inline constexpr int kDefaultMainHeight = 720;
+inline constexpr int kDefaultMainWidth = 1200;
+inline constexpr int kDefaultMainHeight = 760;
 
 /// Interest rate when none is stored, percent.
 inline constexpr double kDefaultInterestRate = 5.0;

@@ -13,10 +13,10 @@ TEST(SettingsTest, PlacementIsCentredUnlessAStoredOneShows) {
     QTemporaryDir dir;
     QSettings settings(dir.filePath(QStringLiteral("arbolex.ini")), QSettings::IniFormat);
     const QRect screen(0, 0, 1920, 1080);
-    const QRect centred(410, 180, 1100, 720);
+    const QRect centred(360, 160, 1200, 760);
     EXPECT_EQ(readMainPlacement(settings, screen), centred);
     EXPECT_EQ(readMainPlacement(settings, QRect(1920, 30, 1280, 1024)),
-              QRect(2010, 182, 1100, 720));
+              QRect(1960, 162, 1200, 760));
     EXPECT_EQ(readMainPlacement(settings, QRect(0, 0, 1024, 600)), QRect(0, 0, 1024, 600));
 
     writeMainPlacement(settings, QRect(40, 60, 900, 500));
