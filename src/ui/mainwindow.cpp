@@ -1,4 +1,5 @@
 #include "ui/mainwindow.hpp"
+#include "ui/fieldinput.hpp"
 
 #include "engine/catalogue.hpp"
 #include "ui/groupheaderview.hpp"
@@ -339,14 +340,7 @@ void MainWindow::setHint(MainControl c, const QString &hint) {
 }
 
 void MainWindow::focus(MainControl c) {
-    QWidget *w = control(c);
-    if (w == nullptr) {
-        return;
-    }
-    w->setFocus(Qt::OtherFocusReason);
-    if (auto *field = qobject_cast<QLineEdit *>(w)) {
-        field->selectAll();
-    }
+    focusControl(control(c));
 }
 
 void MainWindow::setCaption(const QString &caption) {
@@ -409,16 +403,9 @@ bool MainWindow::eventFilter(QObject *watched, QEvent *event) {
         return QMainWindow::eventFilter(watched, event);
     }
     if (event->type() == QEvent::KeyPress) {
-        // Typed characters go through the key filter; editing keys and
-        // shortcuts carry no printable text and pass untouched.
-        const auto *key = static_cast<QKeyEvent *>(event);
-        const bool shortcut = key->modifiers() & (Qt::ControlModifier | Qt::AltModifier);
-        if (!shortcut) {
-            for (const QChar c : key->text()) {
-                if (c.isPrint() && !workflow::MainWindowLogic::KeyFilter(c)) {
-                    return true;
-                }
-            }
+        // Typed characters go through the key filter.
+        if (refusedByKeyFilter(*static_cast<QKeyEvent *>(event))) {
+            return true;
         }
     } else if (event->type() == QEvent::FocusOut && m_logic != nullptr) {
         // Switching to another window or opening a menu does not leave the field.

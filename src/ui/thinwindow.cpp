@@ -1,4 +1,5 @@
 #include "ui/thinwindow.hpp"
+#include "ui/fieldinput.hpp"
 
 #include "thinning/thinwindowlogic.hpp"
 #include "ui/windowtexts.hpp"
@@ -302,14 +303,7 @@ void ThinWindow::setChecked(ThinControl c, bool checked) {
 }
 
 void ThinWindow::focus(ThinControl c) {
-    QWidget *w = control(c);
-    if (w == nullptr) {
-        return;
-    }
-    w->setFocus(Qt::OtherFocusReason);
-    if (auto *field = qobject_cast<QLineEdit *>(w)) {
-        field->selectAll();
-    }
+    focusControl(control(c));
 }
 
 void ThinWindow::setCaption(const QString &caption) {
@@ -370,16 +364,9 @@ bool ThinWindow::eventFilter(QObject *watched, QEvent *event) {
     if (event->type() == QEvent::KeyPress) {
         const auto name = thinning::thinControlFromName(watched->objectName());
         if (name && thinning::isThinField(*name) && control(*name) == watched) {
-            // Typed characters go through the key filter; editing keys and
-            // shortcuts carry no printable text and pass untouched.
-            const auto *key = static_cast<QKeyEvent *>(event);
-            const bool shortcut = key->modifiers() & (Qt::ControlModifier | Qt::AltModifier);
-            if (!shortcut) {
-                for (const QChar c : key->text()) {
-                    if (c.isPrint() && !workflow::MainWindowLogic::KeyFilter(c)) {
-                        return true;
-                    }
-                }
+            // Typed characters go through the key filter.
+            if (refusedByKeyFilter(*static_cast<QKeyEvent *>(event))) {
+                return true;
             }
         }
     }
