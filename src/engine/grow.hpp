@@ -158,6 +158,11 @@ private:
     double parn2b2(float H, float N, float G, float Gr) const;
     double parfb2(float H, float N, float G, float Nr, float Gr) const;
 
+    /// Runs `body` (a procedure's unchecked form); a run-time failure inside
+    /// it is reported with `lead` and `mark` and the result is `Result{}`.
+    template <typename Result, typename Body>
+    Result trapped(std::string_view lead, std::string_view mark, Body &&body);
+
     /// Reports a run-time failure: a message box (title, lead + description)
     /// when `lead` is not empty, then the log line with the procedure mark.
     void reportFault(const RuntimeFault &fault, std::string_view title, std::string_view lead,

@@ -3,6 +3,7 @@
 // with the active model's a, c, d, e.
 #include "engine/checkedmath.hpp"
 #include "engine/grow.hpp"
+#include "engine/trapped.hpp"
 
 #include <cmath>
 
@@ -70,39 +71,21 @@ double Grow::parfb2(float H, float N, float G, float Nr, float Gr) const {
 }
 
 float Grow::NRES(float H, float N, float G, float Gr) {
-    try {
-        return nres(H, N, G, Gr);
-    } catch (const RuntimeFault &fault) {
-        reportFault(fault, titles::kArbolex, kNresLead, " in Grow.NRES");
-        return 0.0f;
-    }
+    return trapped<float>(kNresLead, " in Grow.NRES", [&] { return nres(H, N, G, Gr); });
 }
 
 double Grow::BRES(float H, float N, float G, float Nr) {
-    try {
-        return bres(H, N, G, Nr);
-    } catch (const RuntimeFault &fault) {
-        reportFault(fault, titles::kArbolex, kBresLead, " in Grow.BRES()");
-        return 0.0;
-    }
+    return trapped<double>(kBresLead, " in Grow.BRES()", [&] { return bres(H, N, G, Nr); });
 }
 
 double Grow::PARN2B2(float H, float N, float G, float Gr) {
-    try {
-        return parn2b2(H, N, G, Gr);
-    } catch (const RuntimeFault &fault) {
-        reportFault(fault, titles::kArbolex, kParn2b2Lead, " in Grow.PARN2B2()");
-        return 0.0;
-    }
+    return trapped<double>(kParn2b2Lead, " in Grow.PARN2B2()",
+                           [&] { return parn2b2(H, N, G, Gr); });
 }
 
 double Grow::PARFB2(float H, float N, float G, float Nr, float Gr) {
-    try {
-        return parfb2(H, N, G, Nr, Gr);
-    } catch (const RuntimeFault &fault) {
-        reportFault(fault, titles::kArbolex, kParfb2Lead, " in Grow.PARFB2()");
-        return 0.0;
-    }
+    return trapped<double>(kParfb2Lead, " in Grow.PARFB2()",
+                           [&] { return parfb2(H, N, G, Nr, Gr); });
 }
 
 bool Grow::NEWTON(float N, float G, float H, float Vt, float &Nr, float &Gr) {

@@ -1,6 +1,7 @@
 // Standing volume to 7 cm top and the volume correction factor.
 #include "engine/checkedmath.hpp"
 #include "engine/grow.hpp"
+#include "engine/trapped.hpp"
 
 namespace arbolex::engine {
 
@@ -36,13 +37,8 @@ float Grow::getV7(float G, float N, float H) const {
 }
 
 float Grow::GetV7(float G, float N, float H) {
-    try {
-        return getV7(G, N, H);
-    } catch (const RuntimeFault &fault) {
-        reportFault(fault, titles::kArbolex,
-                    "Unable to complete volume calculation. Reason: ", " in Grow.GetV7()");
-        return 0.0f;
-    }
+    return trapped<float>("Unable to complete volume calculation. Reason: ", " in Grow.GetV7()",
+                          [&] { return getV7(G, N, H); });
 }
 
 bool Grow::GetVCF() {
