@@ -10,6 +10,7 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
+#include <ostream>
 
 namespace {
 
@@ -146,6 +147,10 @@ struct BadCommandLine {
     const char *arguments;
     const char *complaint; ///< part of what stderr must say
 };
+
+void PrintTo(const BadCommandLine &c, std::ostream *os) {
+    *os << c.arguments;
+}
 
 class CliBadArgumentsTest : public CliTest, public ::testing::WithParamInterface<BadCommandLine> {};
 
