@@ -4,10 +4,20 @@
 #include "cli/command.hpp"
 #include "cli/options.hpp"
 #include "cli/standinput.hpp"
+#include "workflow/standmath.hpp"
 
 #include <vector>
 
 namespace arbolex::cli {
+
+namespace {
+/// Mean DBH of a projected state, cm.
+float diameter(const engine::StandState &s) {
+    float basalArea = s.basalArea;
+    float stocking = s.stocking;
+    return workflow::dbhFromBasalArea(basalArea, stocking);
+}
+} // namespace
 
 namespace {
 
@@ -46,8 +56,7 @@ int runProject(CommandContext &context) {
     for (const engine::StandState &s : states) {
         context.out << formatNumber(s.age) << '\t' << formatNumber(s.topHeight) << '\t'
                     << formatNumber(s.stocking) << '\t' << formatNumber(s.basalArea) << '\t'
-                    << formatNumber(s.volume) << '\t'
-                    << formatNumber(diameterOf(s.basalArea, s.stocking)) << '\n';
+                    << formatNumber(s.volume) << '\t' << formatNumber(diameter(s)) << '\n';
     }
     return siteIndexOk && projected && report.reports() == 0 ? kExitSuccess : kExitEngineFailure;
 }

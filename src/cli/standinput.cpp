@@ -1,5 +1,7 @@
 #include "cli/standinput.hpp"
 
+#include "workflow/standmath.hpp"
+
 #include <cmath>
 #include <cstdio>
 
@@ -8,7 +10,6 @@ namespace arbolex::cli {
 namespace {
 
 /// π as the diameter and basal-area conversions have always written it.
-constexpr double kPi = 3.14159265358979;
 
 QString fromUtf8(std::string_view s) {
     return QString::fromUtf8(s.data(), static_cast<qsizetype>(s.size()));
@@ -58,21 +59,9 @@ StandInput readStand(const Options &options) {
     if (options.oneOf({"basal-area", "dbh"}) == 0) {
         stand.basalArea = options.positive("basal-area");
     } else {
-        stand.basalArea = basalAreaOf(stand.stocking, options.positive("dbh"));
+        stand.basalArea = workflow::basalAreaFromDbh(stand.stocking, options.positive("dbh"));
     }
     return stand;
-}
-
-float diameterOf(float basalArea, float stocking) {
-    const double n = stocking <= 0.0f ? 1.0 : double{stocking};
-    const double g = basalArea < 0.0f ? 0.0 : double{basalArea};
-    return static_cast<float>(200.0 * std::sqrt(g / (n * kPi)));
-}
-
-float basalAreaOf(float stocking, float diameter) {
-    const double n = stocking <= 0.0f ? 1.0 : double{stocking};
-    const double d = diameter;
-    return static_cast<float>(n * kPi * (d * d) / 40000.0);
 }
 
 QString formatNumber(double x) {

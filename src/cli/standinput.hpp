@@ -54,13 +54,6 @@ QString standOptionsHelp();
 /// Reads the stand; --basal-area and --dbh exclude each other. Throws UsageError.
 StandInput readStand(const Options &options);
 
-/// Mean diameter at breast height, cm: 200·√(G / (N·π)), N ≤ 0 taken as 1 and
-/// G < 0 as 0.
-float diameterOf(float basalArea, float stocking);
-
-/// Basal area, m²/ha, of N stems of diameter D cm: N·π·D² / 40000.
-float basalAreaOf(float stocking, float diameter);
-
 /// A number as the tables print it ("%.9g": every single-precision value
 /// comes back exactly).
 QString formatNumber(double x);
