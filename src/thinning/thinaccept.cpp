@@ -13,6 +13,8 @@
 #include "workflow/mainwindowlogic.hpp"
 #include "workflow/standmath.hpp"
 
+#include <QLocale>
+
 #include <cmath>
 
 namespace arbolex::thinning {
@@ -166,8 +168,9 @@ void ThinWindowLogic::WriteThinLine(const QString &label, int row) {
         m_main.fillTotalProduction(r, row);
         m_main.writeIncrements(row, false);
 
-        // The cash flow values thinnings at long-term average prices.
-        const int priceClass = economics::priceClassOf(meanTree, m_interactive);
+        // The cash flow values thinnings at long-term average prices, in the
+        // class the lookup above found (a failed lookup has already said so).
+        const int priceClass = economics::walkPriceClasses(meanTree, QLocale::system()).priceClass;
         m_main.timberRevenue().set(static_cast<int>(std::nearbyint(rec.age)),
                                    rec.removedVolume * prices.data().longTermAverage.at(
                                                            static_cast<std::size_t>(priceClass)));

@@ -96,15 +96,11 @@ bool MainWindowLogic::continuesFromRow(int row) const {
 void MainWindowLogic::cmdGrow_Click() {
     shell::guard(m_log, QStringLiteral(" in frmMain.cmdGrow_Click()"), [&] {
         const bool thinned = m_grow.isThinnedModel();
-        if (thinned) {
-            // The start of a thinned projection is fixed once it has rows.
-            if (m_table.rowCount() > 1 && changeCheck()) {
-                message(text::titleArbolex(), text::changesNotAllowed(), shell::kInformation);
-                restoreFromRow();
-                return;
-            }
-        } else {
-            m_growing[0] = true;
+        // The start of a thinned projection is fixed once it has rows.
+        if (thinned && m_table.rowCount() > 1 && changeCheck()) {
+            message(text::titleArbolex(), text::changesNotAllowed(), shell::kInformation);
+            restoreFromRow();
+            return;
         }
         if (m_thinning != nullptr) {
             m_thinning->flags().thinnedSinceLastGrow = false;
@@ -165,7 +161,6 @@ void MainWindowLogic::afterClear(HeaderLayout layout) {
     m_states.clear();
     m_firstNew = 0;
     m_standingVolume = 0.0;
-    m_growing = {};
     m_timberRevenue.clear();
     if (m_thinning != nullptr) {
         // A thinning window open on the old rows has nothing left to thin.

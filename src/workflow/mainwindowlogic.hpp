@@ -13,7 +13,6 @@
 
 #include <QString>
 
-#include <array>
 #include <cstdint>
 #include <vector>
 
@@ -182,8 +181,6 @@ private:
     std::size_t m_firstNew = 0;
     /// Volume per ha of the last growth row, m³/ha.
     double m_standingVolume = 0.0;
-    /// Set by the grow command of an un-thinned model.
-    std::array<bool, 2> m_growing{};
     thinning::ThinWindowLogic *m_thinning = nullptr;
     economics::TimberRevenue m_timberRevenue;
 };
