@@ -15,12 +15,12 @@ enum LookupLine : int { kFirstUpperBound = 10, kLowerBound = 20, kUpperBound = 3
 
 /// Upper bound text of a caption: of its last 5 characters, the first 4.
 QString upperBoundText(QLatin1String caption) {
-    return QString(caption.right(5).left(4));
+    return {caption.right(5).left(4)};
 }
 
 /// Lower bound text of a caption: its first 4 characters.
 QString lowerBoundText(QLatin1String caption) {
-    return QString(caption.left(4));
+    return {caption.left(4)};
 }
 
 void showFailure(const PriceClassWalk &walk, shell::IInteractive &interactive) {

@@ -15,8 +15,8 @@ std::string_view faultDescription(int number) {
     }
 }
 
-void raiseFault(int number, std::source_location where) {
-    throw RuntimeFault{number, static_cast<unsigned>(where.line())};
+void raiseFault(int number, unsigned line) {
+    throw RuntimeFault{number, line};
 }
 
 } // namespace arbolex::engine

@@ -7,7 +7,6 @@
 // catches it and reports it once.
 
 #include <cmath>
-#include <source_location>
 #include <string_view>
 
 namespace arbolex::engine {
@@ -28,61 +27,62 @@ struct RuntimeFault {
     unsigned line = 0;
 };
 
-[[noreturn, gnu::cold, gnu::noinline]] void raiseFault(int number, std::source_location where);
+[[noreturn, gnu::cold, gnu::noinline]] void raiseFault(int number, unsigned line);
 
 namespace checked {
 
-using Here = std::source_location;
+// Each function takes the line of its call, so a failure names the statement
+// that failed.
 
 /// Keeps a result only when it is a finite number.
-inline double finite(double r, Here where) {
+inline double finite(double r, unsigned line = __builtin_LINE()) {
     if (!std::isfinite(r)) {
-        raiseFault(std::isnan(r) ? kInvalidCall : kOverflow, where);
+        raiseFault(std::isnan(r) ? kInvalidCall : kOverflow, line);
     }
     return r;
 }
 
 /// base^exponent in double precision.
-inline double pow(double base, double exponent, Here where = Here::current()) {
+inline double pow(double base, double exponent, unsigned line = __builtin_LINE()) {
     if (base < 0.0 && exponent != std::trunc(exponent)) {
-        raiseFault(kInvalidCall, where);
+        raiseFault(kInvalidCall, line);
     }
     if (base == 0.0 && exponent < 0.0) {
-        raiseFault(kDivisionByZero, where);
+        raiseFault(kDivisionByZero, line);
     }
-    return finite(std::pow(base, exponent), where);
+    return finite(std::pow(base, exponent), line);
 }
 
-inline double div(double numerator, double denominator, Here where = Here::current()) {
+inline double div(double numerator, double denominator, unsigned line = __builtin_LINE()) {
     if (denominator == 0.0) {
-        raiseFault(kDivisionByZero, where);
+        raiseFault(kDivisionByZero, line);
     }
-    return finite(numerator / denominator, where);
+    return finite(numerator / denominator, line);
 }
 
-inline double sqrt(double x, Here where = Here::current()) {
+inline double sqrt(double x, unsigned line = __builtin_LINE()) {
     if (!(x >= 0.0)) {
-        raiseFault(kInvalidCall, where);
+        raiseFault(kInvalidCall, line);
     }
     return std::sqrt(x);
 }
 
-inline double log(double x, Here where = Here::current()) {
+inline double log(double x, unsigned line = __builtin_LINE()) {
     if (!(x > 0.0)) {
-        raiseFault(kInvalidCall, where);
+        raiseFault(kInvalidCall, line);
     }
     return std::log(x);
 }
 
-inline double exp(double x, Here where = Here::current()) {
-    return finite(std::exp(x), where);
+inline double exp(double x, unsigned line = __builtin_LINE()) {
+    return finite(std::exp(x), line);
 }
 
 /// Stores a double into a single-precision variable; too large a value overflows.
-inline float single(double x, Here where = Here::current()) {
+inline float single(double x, unsigned line = __builtin_LINE()) {
     const auto f = static_cast<float>(x);
     if (!std::isfinite(f)) {
-        raiseFault(std::isnan(x) ? kInvalidCall : kOverflow, where);
+        raiseFault(std::isnan(x) ? kInvalidCall : kOverflow, line);
     }
     return f;
 }

@@ -116,8 +116,8 @@ void Grow::applyStep(const State3 &z, double f1, double f2, double f3, State3 &o
     const double w1 = (S(23) * z.z1 + S(25) * z.z2 + S(27) * z.z3) * f1;
     const double w2 = (S(24) * z.z1 + S(26) * z.z2 + S(28) * z.z3) * f2;
     const double w3 = z.z3 * f3;
-    out.z1 = checked::finite(S(29) * w1 + S(31) * w2 + S(33) * w3, checked::Here::current());
-    out.z2 = checked::finite(S(30) * w1 + S(32) * w2 + S(34) * w3, checked::Here::current());
+    out.z1 = checked::finite(S(29) * w1 + S(31) * w2 + S(33) * w3);
+    out.z2 = checked::finite(S(30) * w1 + S(32) * w2 + S(34) * w3);
     out.z3 = w3;
 }
 

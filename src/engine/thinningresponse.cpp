@@ -50,8 +50,7 @@ double Grow::parn2b2(float H, float N, float G, float Gr) const {
     const double d = m_t[2];
     const double e = m_t[3];
     const double nr = nres(H, N, G, Gr);
-    return checked::finite(pow(nr, 1.0 - c) * div(a * e, c) * div(pow(Gr, -a - 1.0), pow(H, d)),
-                           checked::Here::current());
+    return checked::finite(pow(nr, 1.0 - c) * div(a * e, c) * div(pow(Gr, -a - 1.0), pow(H, d)));
 }
 
 double Grow::parfb2(float H, float N, float G, float Nr, float Gr) const {
@@ -67,7 +66,7 @@ double Grow::parfb2(float H, float N, float G, float Nr, float Gr) const {
         m_v[0] + m_v[1] * h + m_v[2] * h * (pow(nr, -0.5) - 0.5 * gr * np * pow(nr, -1.5)) +
         m_v[3] * h * np + div(m_v[4], h) + m_v[5] * h * (div(1.0, nr) - div(gr * np, nr * nr)) +
         div(m_v[6] * 2.0 * gr, h);
-    return checked::finite(-double{m_vcf} * d, checked::Here::current());
+    return checked::finite(-double{m_vcf} * d);
 }
 
 float Grow::NRES(float H, float N, float G, float Gr) {

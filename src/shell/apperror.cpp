@@ -24,8 +24,8 @@ QString appFaultDescription(int number) {
     }
 }
 
-void raiseAppFault(int number, std::source_location where) {
-    throw AppFault{number, appFaultDescription(number), static_cast<int>(where.line())};
+void raiseAppFault(int number, int line) {
+    throw AppFault{number, appFaultDescription(number), line};
 }
 
 QString windowFaultLine(const AppFault &fault, const QString &label) {
@@ -36,11 +36,11 @@ QString moduleFaultLine(const AppFault &fault, const QString &label) {
     return moduleErrorText({fault.number, fault.description}, fault.line, label);
 }
 
-std::int16_t addInt16(int a, int b, std::source_location where) {
+std::int16_t addInt16(int a, int b, int line) {
     const int sum = a + b;
     if (sum < std::numeric_limits<std::int16_t>::min() ||
         sum > std::numeric_limits<std::int16_t>::max()) {
-        raiseAppFault(kAppOverflow, where);
+        raiseAppFault(kAppOverflow, line);
     }
     return static_cast<std::int16_t>(sum);
 }

@@ -11,7 +11,6 @@
 #include <cstdint>
 #include <exception>
 #include <new>
-#include <source_location>
 
 namespace arbolex::shell {
 
@@ -34,8 +33,8 @@ struct AppFault {
 
 QString appFaultDescription(int number);
 
-[[noreturn]] void raiseAppFault(int number,
-                                std::source_location where = std::source_location::current());
+/// Raises failure `number` at the line of the call.
+[[noreturn]] void raiseAppFault(int number, int line = __builtin_LINE());
 
 /// "Error # :" + number + two blanks + description + " in line " + line + label,
 /// the line of window event handlers and engine procedures.
@@ -61,6 +60,6 @@ template <typename Body> void guard(ErrorLog &log, const QString &label, Body &&
 
 /// Whole-number arithmetic of 16 bits, as the increments are summed in:
 /// a result outside −32768..32767 is an overflow.
-std::int16_t addInt16(int a, int b, std::source_location where = std::source_location::current());
+std::int16_t addInt16(int a, int b, int line = __builtin_LINE());
 
 } // namespace arbolex::shell

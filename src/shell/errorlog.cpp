@@ -7,7 +7,7 @@
 
 namespace arbolex::shell {
 
-ErrorLog::ErrorLog(QString dataFolder)
+ErrorLog::ErrorLog(const QString &dataFolder)
     : m_path(QDir(dataFolder).filePath(QStringLiteral("ErrorLog.txt"))) {}
 
 void ErrorLog::append(const QString &message) {

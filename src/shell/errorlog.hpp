@@ -10,7 +10,7 @@ namespace arbolex::shell {
 class ErrorLog {
 public:
     /// Log in `dataFolder`/ErrorLog.txt.
-    explicit ErrorLog(QString dataFolder);
+    explicit ErrorLog(const QString &dataFolder);
 
     /// Appends `message`, a blank, the short date, a blank and the time.
     /// Writing is attempted once; a log that cannot be written loses the line.

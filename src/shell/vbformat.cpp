@@ -4,6 +4,7 @@
 #include <charconv>
 #include <cmath>
 #include <cstdlib>
+#include <ranges>
 #include <string>
 
 namespace arbolex::shell {
@@ -42,12 +43,12 @@ Pattern parsePattern(QStringView pattern) {
 /// Adds one unit in the last digit of a string of decimal digits; returns
 /// false when the carry runs out of the left end.
 bool incrementDigits(std::string &digits) {
-    for (auto it = digits.rbegin(); it != digits.rend(); ++it) {
-        if (*it != '9') {
-            ++*it;
+    for (char &digit : std::views::reverse(digits)) {
+        if (digit != '9') {
+            ++digit;
             return true;
         }
-        *it = '0';
+        digit = '0';
     }
     return false;
 }

@@ -54,8 +54,8 @@ void MainWindowLogic::fillTotalProduction(TableRow &row, int rowIndex) const {
     const RowRecord &rec = row.record;
     QStringList &cells = row.cells;
     const ProjectionTable::Removals removed = m_table.removalsUpTo(rowIndex - 1);
-    float totalStocking = static_cast<float>(rec.stocking + rec.removedStocking + removed.stocking);
-    float totalBasalArea =
+    auto totalStocking = static_cast<float>(rec.stocking + rec.removedStocking + removed.stocking);
+    auto totalBasalArea =
         static_cast<float>(rec.basalArea + rec.removedBasalArea + removed.basalArea);
     const double totalVolume = rec.volume + rec.removedVolume + removed.volume;
     cells[kColTotStocking] = wholeText(totalStocking);
