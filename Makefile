@@ -6,7 +6,7 @@ JOBS    ?= $(shell nproc)
 CMAKE_FLAGS ?=
 GEN     := -G Ninja
 
-.PHONY: all deps build run test bench test-asan test-noqt format format-check ci clean
+.PHONY: all deps build run test bench test-asan test-noqt format format-check tidy ci clean
 
 all: build
 
@@ -49,6 +49,10 @@ format:
 
 format-check: deps
 	@git ls-files '*.cpp' '*.hpp' | xargs clang-format --dry-run --Werror
+
+# clang-tidy over every source file, with the compile commands of the build.
+tidy: build
+	@git ls-files 'src/*.cpp' | xargs -n 1 -P $(JOBS) clang-tidy -p $(BUILD) --quiet 2>/dev/null
 
 ci: format-check test test-noqt test-asan
 
