@@ -28,9 +28,9 @@ constexpr int kPictureInterval = 1500;
 
 } // namespace
 
-ModelChoiceDialog::ModelChoiceDialog(MainWindow &main, const QString &dataFolder, int initialModel,
+ModelChoiceDialog::ModelChoiceDialog(MainWindow &main, QString dataFolder, int initialModel,
                                      QWidget *parent)
-    : QDialog(parent), m_main(main), m_dataFolder(dataFolder) {
+    : QDialog(parent), m_main(main), m_dataFolder(std::move(dataFolder)) {
     setObjectName(QStringLiteral("frmModelChoice"));
     setWindowTitle(text::choiceTitle());
 

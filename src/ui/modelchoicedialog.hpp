@@ -23,7 +23,7 @@ class ModelChoiceDialog : public QDialog {
     Q_OBJECT
 public:
     /// `initialModel` is selected at first (the model of the start-up file).
-    ModelChoiceDialog(MainWindow &main, const QString &dataFolder, int initialModel,
+    ModelChoiceDialog(MainWindow &main, QString dataFolder, int initialModel,
                       QWidget *parent = nullptr);
     ~ModelChoiceDialog() override;
 
