@@ -109,6 +109,12 @@ public:
     /// `kind`, then refreshes the yield class.
     void AppendGrid(RowKind kind, const QString &label);
     const ProjectionTable &table() const { return m_table; }
+    /// Writes the total-production cells of row `rowIndex`: its stand plus
+    /// every removal so far (growth and thinning rows alike).
+    void fillTotalProduction(TableRow &row, int rowIndex) const;
+    /// Writes the increments of row `rowIndex`: the mean annual increment,
+    /// and the current one from the row before when `currentIncrement`.
+    void writeIncrements(int rowIndex, bool currentIncrement);
     /// Sets the current row and the end of the selection of `flxMain`.
     void select(int row, int endRow);
 
@@ -152,19 +158,6 @@ private:
     void updateCaption();
     void updateYieldClassLabel();
     void buildGrowthCells(TableRow &row, int rowIndex) const;
-
-public:
-    /// Writes the total-production and increment cells of row `rowIndex`
-    /// (shared by growth and thinning rows).
-    void fillTotalProduction(TableRow &row, int rowIndex) const;
-
-private:
-public:
-    /// Writes the increments of row `rowIndex`: the mean annual increment,
-    /// and the current one from the row before when `currentIncrement`.
-    void writeIncrements(int rowIndex, bool currentIncrement);
-
-private:
     bool continuesFromRow(int row) const;
     float thresholdBasalArea();
 
