@@ -5,6 +5,7 @@
 // no failure escapes to the user as a crash.
 
 #include "shell/errorlog.hpp"
+#include "shell/runtimeerror.hpp"
 
 #include <QString>
 
@@ -14,27 +15,14 @@
 
 namespace arbolex::shell {
 
-/// Run-time failure numbers of the window logic.
-enum AppFaultNumber : int {
-    kAppInvalidCall = 5,
-    kAppOverflow = 6,
-    kAppOutOfMemory = 7,
-    kAppDivisionByZero = 11,
-    kAppTypeMismatch = 13,
-    kAppInternal = 51,
-};
-
-/// A detected run-time failure: its number, description and the source line.
+/// A detected run-time failure and the source line that failed.
 struct AppFault {
-    int number = 0;
-    QString description;
+    RuntimeError error;
     int line = 0;
 };
 
-QString appFaultDescription(int number);
-
-/// Raises failure `number` at the line of the call.
-[[noreturn]] void raiseAppFault(int number, int line = __builtin_LINE());
+/// Raises `error` at the line of the call.
+[[noreturn]] void raiseAppFault(const RuntimeError &error, int line = __builtin_LINE());
 
 /// "Error # :" + number + two blanks + description + " in line " + line + label,
 /// the line of window event handlers and engine procedures.
@@ -51,10 +39,10 @@ template <typename Body> void guard(ErrorLog &log, const QString &label, Body &&
     } catch (const AppFault &fault) {
         log.append(windowFaultLine(fault, label));
     } catch (const std::bad_alloc &) {
-        log.append(
-            windowFaultLine({kAppOutOfMemory, appFaultDescription(kAppOutOfMemory), 0}, label));
+        log.append(windowFaultLine({RuntimeError::outOfMemory(), 0}, label));
     } catch (const std::exception &e) {
-        log.append(windowFaultLine({kAppInternal, QString::fromUtf8(e.what()), 0}, label));
+        log.append(
+            windowFaultLine({RuntimeError::internal(QString::fromUtf8(e.what())), 0}, label));
     }
 }
 

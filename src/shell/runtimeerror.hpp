@@ -15,6 +15,8 @@ struct RuntimeError {
     explicit operator bool() const { return number != 0; }
 
     static RuntimeError overflow() { return {6, QStringLiteral("Overflow")}; }
+    static RuntimeError outOfMemory() { return {7, QStringLiteral("Out of memory")}; }
+    static RuntimeError divisionByZero() { return {11, QStringLiteral("Division by zero")}; }
     static RuntimeError typeMismatch() { return {13, QStringLiteral("Type mismatch")}; }
     static RuntimeError badFileNameOrNumber() {
         return {52, QStringLiteral("Bad file name or number")};
@@ -28,6 +30,8 @@ struct RuntimeError {
         return {75, QStringLiteral("Path/File access error")};
     }
     static RuntimeError pathNotFound() { return {76, QStringLiteral("Path not found")}; }
+    /// A failure of the program itself, described by what it reported.
+    static RuntimeError internal(const QString &what) { return {51, what}; }
 };
 
 /// Classic error numbers that callers branch on.

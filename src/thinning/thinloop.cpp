@@ -74,14 +74,14 @@ void ThinWindowLogic::cmdLoop_Click() {
         } showWhenDone{m_view};
         const QString intensityText = field(ThinControl::txtRemV);
         if (!shell::isNumeric(intensityText)) {
-            shell::raiseAppFault(shell::kAppTypeMismatch);
+            shell::raiseAppFault(shell::RuntimeError::typeMismatch());
         }
         const double intensity = shell::val(intensityText);
         const double age = wholeYears(m_main.view().text(workflow::MainControl::txtFromA));
         const double until = wholeYears(field(ThinControl::txtThinUntil));
         const double frequency = wholeYears(field(ThinControl::txtThinFreq));
         if (frequency == 0.0) {
-            shell::raiseAppFault(shell::kAppDivisionByZero);
+            shell::raiseAppFault(shell::RuntimeError::divisionByZero());
         }
         // n + 1 passes: the last one leaves a previewed thinning in the window.
         const auto passes = static_cast<long>(std::nearbyint((until - age) / frequency));

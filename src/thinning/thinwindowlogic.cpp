@@ -304,7 +304,7 @@ void ThinWindowLogic::cmdClear_Click() {
         emptyResultColumns();
     } catch (const shell::AppFault &fault) {
         m_main.errorLog().append(
-            QStringLiteral("Error ") + fault.description +
+            QStringLiteral("Error ") + fault.error.description +
             QStringLiteral("  in procedure cmdClear_Click of Feuille frmThin"));
     }
 }

@@ -90,7 +90,7 @@ void MainWindowLogic::writeIncrements(int rowIndex, bool currentIncrement) {
                                 -roundWhole(before[kNumVolume]));
             const int years = roundWhole(row.numbers[kNumAge] - before[kNumAge]);
             if (years == 0) {
-                shell::raiseAppFault(shell::kAppDivisionByZero);
+                shell::raiseAppFault(shell::RuntimeError::divisionByZero());
             }
             row.numbers[kNumCai] = static_cast<double>(grown) / years;
             row.cells[kColCai] = formatNumber(row.numbers[kNumCai], u"#");

@@ -179,7 +179,7 @@ void MainWindowLogic::cmdClear_Click() {
     try {
         afterClear(HeaderLayout::WithMoney);
     } catch (const shell::AppFault &fault) {
-        m_log.append(QStringLiteral("Error ") + fault.description +
+        m_log.append(QStringLiteral("Error ") + fault.error.description +
                      QStringLiteral(" in procedure cmdClear_Click of Feuille frmMain"));
     }
 }
