@@ -1,5 +1,7 @@
 #include "thinning/thincontrols.hpp"
 
+#include "shell/controlnames.hpp"
+
 #include <array>
 
 namespace arbolex::thinning {
@@ -13,16 +15,11 @@ constexpr std::array<const char *, kThinControlCount> kNames = {
 } // namespace
 
 QString controlName(ThinControl control) {
-    return QLatin1String(kNames.at(static_cast<std::size_t>(control)));
+    return shell::controlNameIn(kNames, control);
 }
 
 std::optional<ThinControl> thinControlFromName(const QString &name) {
-    for (std::size_t i = 0; i < kNames.size(); ++i) {
-        if (name == QLatin1String(kNames[i])) {
-            return static_cast<ThinControl>(i);
-        }
-    }
-    return std::nullopt;
+    return shell::controlNamedIn<ThinControl>(kNames, name);
 }
 
 bool isThinField(ThinControl control) {

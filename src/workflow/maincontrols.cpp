@@ -1,5 +1,7 @@
 #include "workflow/maincontrols.hpp"
 
+#include "shell/controlnames.hpp"
+
 #include <array>
 
 namespace arbolex::workflow {
@@ -13,16 +15,11 @@ constexpr std::array<const char *, kMainControlCount> kNames = {
 } // namespace
 
 QString controlName(MainControl control) {
-    return QLatin1String(kNames.at(static_cast<std::size_t>(control)));
+    return shell::controlNameIn(kNames, control);
 }
 
 std::optional<MainControl> mainControlFromName(const QString &name) {
-    for (std::size_t i = 0; i < kNames.size(); ++i) {
-        if (name == QLatin1String(kNames[i])) {
-            return static_cast<MainControl>(i);
-        }
-    }
-    return std::nullopt;
+    return shell::controlNamedIn<MainControl>(kNames, name);
 }
 
 bool isNumericField(MainControl control) {
