@@ -28,7 +28,8 @@ void reportPerStep(benchmark::State &state) {
 // volume of the new state. Timed over the 50 steps of a rotation; the `step`
 // counter gives the time per step, in which the rate, the step factors and the
 // start state's volume, computed once per projection, weigh in at a fiftieth.
-void BM_ProjectionStep(benchmark::State &state) {
+/// Projects the typical stand over a rotation by 1-year steps, once a pass.
+void projectRotations(benchmark::State &state) {
     Grow grow;
     const Stand s = kTypicalStand;
     prepare(grow, s);
@@ -40,6 +41,10 @@ void BM_ProjectionStep(benchmark::State &state) {
         benchmark::DoNotOptimize(states.data());
         benchmark::ClobberMemory();
     }
+}
+
+void BM_ProjectionStep(benchmark::State &state) {
+    projectRotations(state);
     reportPerStep(state);
 }
 BENCHMARK(BM_ProjectionStep);
@@ -124,17 +129,7 @@ BENCHMARK(BM_ProjectionStepBaseline);
 
 // A rotation for one stand: 50 years by 1-year steps, 51 states.
 void BM_Projection50Years(benchmark::State &state) {
-    Grow grow;
-    const Stand s = kTypicalStand;
-    prepare(grow, s);
-    std::vector<StandState> states;
-    states.reserve(kRotationYears + 1);
-    for (auto _ : state) {
-        states.clear();
-        grow.PROJ(s.age, s.basalArea, s.stocking, s.height, s.age + kRotationYears, 1.0f, states);
-        benchmark::DoNotOptimize(states.data());
-        benchmark::ClobberMemory();
-    }
+    projectRotations(state);
 }
 BENCHMARK(BM_Projection50Years)->Unit(benchmark::kMicrosecond);
 
