@@ -1,4 +1,5 @@
 // The headless runner's script language and the grow shortcut.
+#include "mocks/programservices.hpp"
 #include "mocks/qtprinters.hpp"
 
 #include "cli/scriptrunner.hpp"
@@ -125,10 +126,7 @@ QString cli() {
 
 TEST(RunnerProcessTest, ExitStatusAndTheSavedStartupFile) {
     QTemporaryDir dir;
-    const QDir data(QStringLiteral(ARBOLEX_DATA_SOURCE));
-    for (const QString &name : data.entryList(QDir::Files)) {
-        QFile::copy(data.filePath(name), dir.filePath(name));
-    }
+    ASSERT_TRUE(copyShippedData(dir.path()));
     QFile script(dir.filePath(QStringLiteral("s.arb")));
     ASSERT_TRUE(script.open(QIODevice::WriteOnly));
     script.write("model 4\nset txtFromA 22\n");

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "mocks/fakeinteractive.hpp"
+#include "mocks/programservices.hpp"
 
 #include "economics/prices.hpp"
 #include "engine/grow.hpp"
@@ -23,16 +23,6 @@ namespace arbolex::testing {
 
 using workflow::MainControl;
 
-/// Copies the shipped data files into `folder`; true when all were copied.
-inline bool copyShippedData(const QString &folder) {
-    const QDir source(QStringLiteral(ARBOLEX_DATA_SOURCE));
-    bool copied = true;
-    for (const QString &name : source.entryList(QDir::Files)) {
-        copied = QFile::copy(source.filePath(name), QDir(folder).filePath(name)) && copied;
-    }
-    return copied;
-}
-
 /// Presses and releases one key on `widget`, as the keyboard would.
 inline void pressKey(QWidget *widget, int key, const QString &text = {}) {
     QKeyEvent press(QEvent::KeyPress, key, Qt::NoModifier, text);
@@ -50,7 +40,7 @@ inline void typeKeys(QWidget *widget, const QString &text) {
 
 /// The main window on the screen (offscreen) with its logic, loaded from a
 /// temporary copy of the shipped data folder and settings in a temporary file.
-class MainWindowGuiTest : public ::testing::Test {
+class MainWindowGuiTest : public ::testing::Test, protected ProgramServices {
 protected:
     MainWindowGuiTest() {
         window.attach(logic, settings);
@@ -59,14 +49,8 @@ protected:
 
     QLineEdit *field(MainControl c) const { return qobject_cast<QLineEdit *>(window.control(c)); }
 
-    QTemporaryDir dir;
     bool dataCopied = copyShippedData(dir.path());
     QSettings settings{dir.filePath(QStringLiteral("settings.ini")), QSettings::IniFormat};
-    shell::ErrorLog log{dir.path()};
-    FakeInteractive interactive;
-    shell::EngineReport report{interactive, log};
-    engine::Grow grow{&report};
-    economics::Prices prices;
     ui::MainWindow window;
     workflow::MainWindowLogic logic{grow, prices, log, dir.path(), window, interactive};
 };

@@ -17,12 +17,7 @@ const QRect kScreen(0, 0, 1920, 1080);
 
 class MainStartupTest : public MainWindowTest {
 protected:
-    MainStartupTest() {
-        const QDir source(QStringLiteral(ARBOLEX_DATA_SOURCE));
-        for (const QString &name : source.entryList(QDir::Files)) {
-            QFile::copy(source.filePath(name), dir.filePath(name));
-        }
-    }
+    MainStartupTest() { copyShippedData(dir.path()); }
 
     QSettings settings{dir.filePath(QStringLiteral("settings.ini")), QSettings::IniFormat};
 };

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "mocks/fakeinteractive.hpp"
+#include "mocks/programservices.hpp"
 #include "mocks/qtprinters.hpp"
 
 #include "economics/prices.hpp"
@@ -22,7 +22,7 @@ using workflow::MainControl;
 
 /// A main window without a screen over a temporary data folder, with model 0
 /// active and the grow-from fields of a young Sitka spruce stand.
-class MainWindowTest : public ::testing::Test {
+class MainWindowTest : public ::testing::Test, protected ProgramServices {
 protected:
     MainWindowTest() {
         grow.GetModel(0);
@@ -52,12 +52,6 @@ protected:
         return QString::fromUtf8(f.readAll()).split(QStringLiteral("\r\n"), Qt::SkipEmptyParts);
     }
 
-    QTemporaryDir dir;
-    shell::ErrorLog log{dir.path()};
-    FakeInteractive interactive;
-    shell::EngineReport report{interactive, log};
-    engine::Grow grow{&report};
-    economics::Prices prices;
     workflow::HeadlessMainView view;
     workflow::MainWindowLogic logic{grow, prices, log, dir.path(), view, interactive};
 };
