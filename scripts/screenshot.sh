@@ -5,7 +5,10 @@
 # stems/ha, 7 m, 20 m²/ha, to 50 by 5), the thinning window opened on the
 # same stand grown to 30 before and after previewing a removal of 60 m³/ha
 # (the whole screen, and the thinning window alone), and the main window
-# after a thinning loop: 30 m³/ha at 20, then every 5 years until 50.
+# after a thinning loop: 30 m³/ha at 20, then every 5 years until 50; and a
+# whole rotation (age 15, 2500 stems/ha, 9 m, 22 m²/ha, 10 ha, thinned by
+# 50 m³/ha at 30, grown to 60): the final cut with its question, the summary,
+# and the net present value window.
 #
 #   scripts/screenshot.sh [OUTPUT_FOLDER]      (default /tmp/shots)
 #
@@ -72,3 +75,12 @@ shoot thin-preview --no-intro --demo-thin preview
 export WINDOW_TITLE=
 export SHOT="$out/main-thin-loop.png"
 shoot main-thin-loop --no-intro --demo-thin loop
+
+export SHOT="$out/main-final-cut.png"
+shoot main-final-cut --no-intro --demo-rotation finalcut
+export SHOT="$out/main-summary.png"
+shoot main-summary --no-intro --demo-rotation summary
+export WINDOW_TITLE="Net Present Value"
+export SHOT="$out/npv.png"
+rm -f "${SHOT%.png}-window.png"
+shoot npv --no-intro --demo-rotation npv

@@ -1,6 +1,7 @@
 // ARBOLEX: the desktop program. Builds the engine, the prices, the main window
 // and the thinning window with their logic, loads the main window, then lets
 // the user choose the model in the model choice window.
+#include "economics/npvwindowlogic.hpp"
 #include "economics/prices.hpp"
 #include "engine/grow.hpp"
 #include "shell/datafolder.hpp"
@@ -9,6 +10,8 @@
 #include "thinning/thinwindowlogic.hpp"
 #include "ui/mainwindow.hpp"
 #include "ui/modelchoicedialog.hpp"
+#include "ui/npvwindow.hpp"
+#include "ui/qtclipboard.hpp"
 #include "ui/qtinteractive.hpp"
 #include "ui/thinwindow.hpp"
 #include "ui/windowtexts.hpp"
@@ -73,6 +76,49 @@ bool demoThin(MainWindowLogic &logic, ThinWindowLogic &thin, const QString &stag
     return false;
 }
 
+/// The rotation demonstrations, from a Sitka spruce stand (age 15, 2500
+/// stems/ha, 9 m, 22 m²/ha, 10 ha) thinned by 50 m³/ha at 30 and grown to 60:
+///   finalcut  the main window after the final cut;
+///   summary   the rotation summary;
+///   npv       the net present value window at 5 %, a planting cost in the
+///             first year.
+/// False for an unknown stage.
+bool demoRotation(MainWindowLogic &logic, ThinWindowLogic &thin,
+                  arbolex::economics::NpvWindowLogic &npv, const QString &stage) {
+    if (stage != QLatin1String("finalcut") && stage != QLatin1String("summary") &&
+        stage != QLatin1String("npv")) {
+        return false;
+    }
+    logic.mnuModel_Click(0);
+    logic.typeText(MainControl::txtFromA, QStringLiteral("15"));
+    logic.typeText(MainControl::txtFromN, QStringLiteral("2500"));
+    logic.typeText(MainControl::txtFromH, QStringLiteral("9"));
+    logic.typeText(MainControl::txtFromB, QStringLiteral("22"));
+    logic.typeText(MainControl::txtFromD, QString());
+    logic.typeText(MainControl::txtNetArea, QStringLiteral("10"));
+    logic.typeText(MainControl::txtToA, QStringLiteral("30"));
+    logic.typeText(MainControl::txtByA, QStringLiteral("5"));
+    logic.cmdGrow_Click();
+    logic.cmdThin_Click();
+    thin.typeText(ThinControl::txtRemV, QStringLiteral("50"));
+    thin.press(ThinControl::cmdThin);
+    thin.press(ThinControl::cmdAccept);
+    logic.typeText(MainControl::txtToA, QStringLiteral("60"));
+    logic.cmdGrow_Click();
+    logic.cmdFinalCut_Click();
+    if (stage == QLatin1String("summary")) {
+        logic.cmdSummary_Click();
+    } else if (stage == QLatin1String("npv")) {
+        logic.cmdNPV_Click();
+        npv.typeInCell(1, arbolex::economics::kCfOperation, QStringLiteral("Planting"));
+        npv.typeInCell(1, arbolex::economics::kCfCost, QStringLiteral("2500"));
+        npv.typeInCell(6, arbolex::economics::kCfOperation, QStringLiteral("Cleaning"));
+        npv.typeInCell(6, arbolex::economics::kCfCost, QStringLiteral("300"));
+        npv.cmdNPV_Click();
+    }
+    return true;
+}
+
 /// The options of the command line.
 struct Options {
     explicit Options(QCommandLineParser &parser) {
@@ -85,6 +131,8 @@ struct Options {
         parser.addOption(demo);
         demoThin.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(demoThin);
+        demoRotation.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(demoRotation);
         quitWhenShown.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(quitWhenShown);
     }
@@ -99,6 +147,8 @@ struct Options {
                                               "the start-up file.")};
     QCommandLineOption demo{QStringLiteral("demo-grow")};
     QCommandLineOption demoThin{QStringLiteral("demo-thin"), QString(), QStringLiteral("STAGE")};
+    QCommandLineOption demoRotation{QStringLiteral("demo-rotation"), QString(),
+                                    QStringLiteral("STAGE")};
     /// Ends the program once the main window is on screen: start-up is timed with it.
     QCommandLineOption quitWhenShown{QStringLiteral("quit-when-shown")};
 };
@@ -159,9 +209,27 @@ int main(int argc, char *argv[]) {
     ThinWindowLogic thinLogic(logic, thinWindow, interactive);
     thinWindow.attach(thinLogic);
     logic.attachThinning(&thinLogic);
+    // The net present value window, and the clipboard every table is copied to.
+    arbolex::ui::QtClipboard clipboard;
+    arbolex::ui::NpvWindow npvWindow(&window);
+    arbolex::economics::NpvWindowLogic npvLogic(logic.cashFlow(), logic.timberRevenue(), log,
+                                                npvWindow, interactive, clipboard);
+    npvWindow.attach(npvLogic);
+    logic.attachNpv(&npvLogic);
+    logic.attachClipboard(&clipboard);
     logic.Form_Load(settings, QGuiApplication::primaryScreen()->availableGeometry());
 
-    if (parser.isSet(options.demoThin)) {
+    if (parser.isSet(options.demoRotation)) {
+        const QString stage = parser.value(options.demoRotation);
+        if (stage != QLatin1String("finalcut")) {
+            interactive.queueAnswer(true); // view the net present value
+        }
+        QTimer::singleShot(0, &window, [&logic, &thinLogic, &npvLogic, stage] {
+            if (!demoRotation(logic, thinLogic, npvLogic, stage)) {
+                qWarning("unknown rotation demonstration: %s", qPrintable(stage));
+            }
+        });
+    } else if (parser.isSet(options.demoThin)) {
         const QString stage = parser.value(options.demoThin);
         QTimer::singleShot(0, &window, [&logic, &thinLogic, stage] {
             if (!demoThin(logic, thinLogic, stage)) {

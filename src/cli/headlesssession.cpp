@@ -26,8 +26,12 @@ bool PrintingInteractive::askYesNo(const QString &title, const QString &text) {
 HeadlessSession::HeadlessSession(const QString &dataFolder, QTextStream &out)
     : m_log(dataFolder), m_interactive(out), m_report(m_interactive, m_log), m_grow(&m_report),
       m_main(m_grow, m_prices, m_log, dataFolder, m_mainView, m_interactive),
-      m_thin(m_main, m_thinView, m_interactive) {
+      m_thin(m_main, m_thinView, m_interactive),
+      m_npv(m_main.cashFlow(), m_main.timberRevenue(), m_log, m_npvView, m_interactive,
+            m_clipboard) {
     m_main.attachThinning(&m_thin);
+    m_main.attachNpv(&m_npv);
+    m_main.attachClipboard(&m_clipboard);
 }
 
 } // namespace arbolex::cli

@@ -4,10 +4,13 @@
 // the main window's logic over a headless view. The runner and the grow
 // shortcut of the command-line program drive it.
 
+#include "economics/inpvview.hpp"
+#include "economics/npvwindowlogic.hpp"
 #include "economics/prices.hpp"
 #include "engine/grow.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
+#include "shell/iclipboard.hpp"
 #include "shell/interactive.hpp"
 #include "thinning/headlessthinview.hpp"
 #include "thinning/thinwindowlogic.hpp"
@@ -56,6 +59,9 @@ public:
     thinning::ThinWindowLogic &thinning() { return m_thin; }
     thinning::HeadlessThinView &thinView() { return m_thinView; }
     PrintingInteractive &interactive() { return m_interactive; }
+    economics::NpvWindowLogic &npv() { return m_npv; }
+    economics::HeadlessNpvView &npvView() { return m_npvView; }
+    shell::HeadlessClipboard &clipboard() { return m_clipboard; }
 
 private:
     shell::ErrorLog m_log;
@@ -67,6 +73,9 @@ private:
     workflow::MainWindowLogic m_main;
     thinning::HeadlessThinView m_thinView;
     thinning::ThinWindowLogic m_thin;
+    shell::HeadlessClipboard m_clipboard;
+    economics::HeadlessNpvView m_npvView;
+    economics::NpvWindowLogic m_npv;
 };
 
 } // namespace arbolex::cli

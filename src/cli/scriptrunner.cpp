@@ -1,6 +1,9 @@
 #include "cli/scriptrunner.hpp"
 
+#include "shell/tableexport.hpp"
+
 #include <QFile>
+#include <QRegularExpression>
 #include <QSettings>
 #include <QTemporaryDir>
 
@@ -43,6 +46,30 @@ ScriptRunner::ScriptRunner(HeadlessSession &session, QTextStream &out)
         {QStringLiteral("mnuWarn"),
          [&main] {
              main.Warn();
+         }},
+        {QStringLiteral("cmdFinalCut"),
+         [&main] {
+             main.cmdFinalCut_Click();
+         }},
+        {QStringLiteral("cmdSummary"),
+         [&main] {
+             main.cmdSummary_Click();
+         }},
+        {QStringLiteral("cmdNPV"),
+         [&main] {
+             main.cmdNPV_Click();
+         }},
+        {QStringLiteral("cmdDeleteRows"),
+         [&main] {
+             main.cmdDeleteRows_Click();
+         }},
+        {QStringLiteral("mnuCopyTable"),
+         [&main] {
+             main.CopyTable(false);
+         }},
+        {QStringLiteral("mnuCopySummary"),
+         [&main] {
+             main.CopyTable(true);
          }},
     };
 }
@@ -119,6 +146,25 @@ QString ScriptRunner::runLine(const QString &rawLine) {
 
 namespace {
 constexpr QLatin1String kThinWindow("frmThin.");
+constexpr QLatin1String kNpvWindow("frmNPV.");
+
+/// The net present value window's control `name` names ("frmNPV.txtNPV"), if any.
+std::optional<economics::NpvControl> npvControl(const QString &name) {
+    if (!name.startsWith(kNpvWindow)) {
+        return std::nullopt;
+    }
+    return economics::npvControlFromName(name.mid(kNpvWindow.size()));
+}
+
+/// The cell (row, column) of "frmNPV.NPV_Grid(ROW,COL)", if `name` is one.
+std::optional<std::pair<int, int>> npvGridCell(const QString &name) {
+    static const QRegularExpression cell(QStringLiteral(R"(^frmNPV\.NPV_Grid\((\d+),(\d+)\)$)"));
+    const QRegularExpressionMatch match = cell.match(name);
+    if (!match.hasMatch()) {
+        return std::nullopt;
+    }
+    return std::pair{match.captured(1).toInt(), match.captured(2).toInt()};
+}
 
 /// The thinning-window control `name` names ("frmThin.txtRemV"), if any.
 std::optional<thinning::ThinControl> thinControl(const QString &name) {
@@ -130,6 +176,14 @@ std::optional<thinning::ThinControl> thinControl(const QString &name) {
 } // namespace
 
 QString ScriptRunner::set(const QString &control, const QString &text) {
+    if (const auto cell = npvGridCell(control)) {
+        m_session.npv().typeInCell(cell->first, cell->second, text);
+        return {};
+    }
+    if (npvControl(control) == economics::NpvControl::txtInterestRate) {
+        m_session.npv().typeInterestRate(text);
+        return {};
+    }
     if (const auto thin = thinControl(control)) {
         if (!thinning::isThinField(*thin)) {
             return QStringLiteral("no field named '") + control + QLatin1Char('\'');
@@ -152,9 +206,20 @@ QString ScriptRunner::press(const QString &control) {
         }
         return {};
     }
+    if (const auto npv = npvControl(control)) {
+        if (!m_session.npv().press(*npv)) {
+            return QStringLiteral("no command named '") + control + QLatin1Char('\'');
+        }
+        return {};
+    }
     const auto found = m_commands.find(control);
     if (found == m_commands.end()) {
         return QStringLiteral("no command named '") + control + QLatin1Char('\'');
+    }
+    // A switched-off button cannot be pressed, on the screen or here.
+    const auto main = workflow::mainControlFromName(control);
+    if (main && !m_session.mainView().isEnabled(*main)) {
+        return QStringLiteral("'") + control + QStringLiteral("' is switched off");
     }
     found->second();
     return {};
@@ -165,6 +230,22 @@ QString ScriptRunner::print(const QString &control) {
         for (const QStringList &row : m_session.main().table().visibleGrid()) {
             m_out << row.join(QLatin1Char('\t')) << '\n';
         }
+        return {};
+    }
+    if (control == QLatin1String("flxSummary")) {
+        m_out << shell::tabSeparated(m_session.main().summaryGrid());
+        return {};
+    }
+    if (control == QLatin1String("clipboard")) {
+        m_out << m_session.clipboard().text();
+        return {};
+    }
+    if (control == QLatin1String("frmNPV.NPV_Grid")) {
+        m_out << shell::tabSeparated(m_session.npv().grid());
+        return {};
+    }
+    if (const auto npv = npvControl(control)) {
+        m_out << m_session.npvView().text(*npv) << '\n';
         return {};
     }
     if (const auto thin = thinControl(control)) {

@@ -6,7 +6,10 @@
 //   press CONTROL            press a button or menu command
 //   select ROW [ENDROW]      current row and end of the selection of flxMain
 //   answer yes|no            the answer to the next question
-//   print flxMain | CONTROL  the grid (header row first) or the text of a control
+//   print flxMain | CONTROL  the grid (header row first) or the text of a control;
+//                            flxSummary, frmNPV.NPV_Grid and clipboard print tab-separated
+//   set frmNPV.NPV_Grid(ROW,COL) TEXT  types TEXT into a cell of the cash flow
+// A switched-off button cannot be pressed. `set CONTROL` alone empties the field.
 // '#' starts a comment. Controls of other windows are named "window.name".
 
 #include "cli/headlesssession.hpp"

@@ -6,12 +6,13 @@ namespace arbolex::economics {
 
 /// Timber revenue of the sub-compartment by year of the projection, euro per
 /// hectare: what the thinnings and the final cut earn at long-term average
-/// prices. The cash flow reads it; clearing the projection empties it.
+/// prices, rebuilt from the rows of the projection table whenever they change. The cash flow reads
+/// it; clearing the projection empties it.
 class TimberRevenue {
 public:
-    /// The revenue of the harvest at `age` (one harvest a year: a thinning
-    /// that is overwritten replaces its revenue).
-    void set(int age, double euroPerHa) { m_byAge[age] = euroPerHa; }
+    /// Adds a harvest to the revenue of `age` (a thinning and the final cut
+    /// of the same year add up).
+    void add(int age, double euroPerHa) { m_byAge[age] += euroPerHa; }
     double at(int age) const {
         const auto found = m_byAge.find(age);
         return found == m_byAge.end() ? 0.0 : found->second;

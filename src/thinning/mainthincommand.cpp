@@ -21,7 +21,8 @@ QString wholeAge(float age) {
 void MainWindowLogic::cmdThin_Click() {
     namespace tt = thinning::text;
     shell::guard(m_log, QStringLiteral(" in frmMain.cmdThin_Click()"), [&] {
-        if (m_thinning == nullptr || !m_grow.isThinnedModel()) {
+        // After the final cut there is no crop left to thin.
+        if (m_thinning == nullptr || !m_grow.isThinnedModel() || m_felled) {
             return;
         }
         const QString title = text::titleArbolexYeld();

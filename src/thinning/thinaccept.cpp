@@ -107,6 +107,9 @@ void ThinWindowLogic::WriteThinLine(const QString &label, int row) {
         }
         QStringList &cells = r.cells;
 
+        // The summary carries every thinning: its marker cell is not empty.
+        cells[workflow::kColSeparator1] = workflow::text::summaryMarker();
+
         // Main crop: the stand after the thinning.
         cells[workflow::kColAge] = shell::singleText(rec.age);
         cells[workflow::kColTopHeight] = formatNumber(rec.topHeight, u"#0.0");
@@ -171,9 +174,9 @@ void ThinWindowLogic::WriteThinLine(const QString &label, int row) {
         // The cash flow values thinnings at long-term average prices, in the
         // class the lookup above found (a failed lookup has already said so).
         const int priceClass = economics::walkPriceClasses(meanTree, QLocale::system()).priceClass;
-        m_main.timberRevenue().set(static_cast<int>(std::nearbyint(rec.age)),
-                                   rec.removedVolume * prices.data().longTermAverage.at(
-                                                           static_cast<std::size_t>(priceClass)));
+        r.timberRevenue = rec.removedVolume *
+                          prices.data().longTermAverage.at(static_cast<std::size_t>(priceClass));
+        m_main.timberRevenueChanged();
 
         m_flags.noThinningYet = false;
         m_main.thinningWritten(row, rec.volume);

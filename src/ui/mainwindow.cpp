@@ -4,6 +4,7 @@
 #include "engine/catalogue.hpp"
 #include "ui/groupheaderview.hpp"
 #include "ui/projectionmodel.hpp"
+#include "ui/stringgridmodel.hpp"
 #include "ui/windowtexts.hpp"
 #include "workflow/mainwindowlogic.hpp"
 
@@ -21,6 +22,7 @@
 #include <QMenuBar>
 #include <QMessageBox>
 #include <QPushButton>
+#include <QStackedWidget>
 #include <QTableView>
 #include <QVBoxLayout>
 
@@ -51,8 +53,20 @@ MainWindow::MainWindow(QWidget *parent) : QMainWindow(parent) {
     layout->setContentsMargins(12, 10, 12, 12);
     layout->setSpacing(10);
     layout->addWidget(buildPanel());
+    QLabel *title = addResult(MainControl::lblTableTitle);
+    title->setFrameStyle(QFrame::NoFrame);
+    title->setAlignment(Qt::AlignLeft | Qt::AlignVCenter);
+    QFont bold = title->font();
+    bold.setBold(true);
+    title->setFont(bold);
+    layout->addWidget(title);
     buildGrid();
-    layout->addWidget(m_grid, 1);
+    buildSummaryGrid();
+    m_tables = new QStackedWidget(this);
+    m_tables->addWidget(m_grid);
+    m_tables->addWidget(m_summaryGrid);
+    layout->addWidget(m_tables, 1);
+    layout->setSpacing(6);
     setCentralWidget(central);
 }
 
@@ -74,6 +88,9 @@ void MainWindow::attach(workflow::MainWindowLogic &logic, QSettings &settings) {
     connect(m_grid->selectionModel(), &QItemSelectionModel::currentRowChanged, this,
             &MainWindow::selectionToLogic);
     fitColumns();
+    m_summaryModel = new StringGridModel([&logic] { return logic.summaryGrid(); }, this);
+    // Totals follow the rows of the start, the thinnings and the final cut.
+    m_summaryGrid->setModel(m_summaryModel);
 }
 
 void MainWindow::SetModelFromfrmModelChoice(int modelId) {
@@ -102,6 +119,22 @@ void MainWindow::buildMenus() {
         m_logic->mnuModel_Click(entry->data().toInt());
         // A refused choice leaves the active model where it was.
         setActiveModel(m_logic->grow().modelId());
+    });
+
+    QMenu *edit = menuBar()->addMenu(text::menuEdit());
+    QAction *copy = edit->addAction(text::menuCopy());
+    copy->setObjectName(QStringLiteral("mnuCopyTable"));
+    copy->setShortcut(QKeySequence::Copy);
+    connect(copy, &QAction::triggered, this, [this] {
+        if (m_logic != nullptr) {
+            m_logic->CopyTable(m_logic->showingSummary());
+        }
+    });
+    QAction *remove = edit->addAction(text::menuDeleteRows());
+    connect(remove, &QAction::triggered, this, [this] {
+        if (m_logic != nullptr) {
+            m_logic->cmdDeleteRows_Click();
+        }
     });
 
     QMenu *help = menuBar()->addMenu(text::menuHelp());
@@ -212,13 +245,32 @@ QWidget *MainWindow::buildPanel() {
     useRow->setToolTip(text::hintUseRow());
     QPushButton *clear = addButton(MainControl::cmdClear, text::buttonClear());
     QPushButton *clearAll = addButton(MainControl::cmdClearAll, text::buttonClearAll());
+    QPushButton *finalCut = addButton(MainControl::cmdFinalCut, text::buttonFinalCut());
+    finalCut->setToolTip(text::hintFinalCut());
+    QPushButton *summary = addButton(MainControl::cmdSummary, QString());
+    summary->setToolTip(text::hintSummary());
+    summary->setMinimumWidth(
+        summary->fontMetrics().horizontalAdvance(QStringLiteral("GoTo Stand Projections")) + 24);
+    QPushButton *npv = addButton(MainControl::cmdNPV, text::buttonNpv());
+    npv->setToolTip(text::hintNpv());
+    npv->setEnabled(false);
+    QPushButton *deleteRows = addButton(MainControl::cmdDeleteRows, text::buttonDeleteRows());
+    deleteRows->setToolTip(text::hintDeleteRows());
     commands->addWidget(grow, 0, 0);
     commands->addWidget(thin, 1, 0);
     commands->addWidget(useRow, 2, 0);
     commands->addWidget(clear, 3, 0);
     commands->addWidget(clearAll, 4, 0);
+    commands->addWidget(finalCut, 0, 1);
+    commands->addWidget(summary, 1, 1);
+    commands->addWidget(npv, 2, 1);
+    commands->addWidget(deleteRows, 3, 1);
     commands->setRowStretch(5, 1);
     row->addLayout(commands);
+    onClick(MainControl::cmdFinalCut, &workflow::MainWindowLogic::cmdFinalCut_Click);
+    onClick(MainControl::cmdSummary, &workflow::MainWindowLogic::cmdSummary_Click);
+    onClick(MainControl::cmdNPV, &workflow::MainWindowLogic::cmdNPV_Click);
+    onClick(MainControl::cmdDeleteRows, &workflow::MainWindowLogic::cmdDeleteRows_Click);
 
     connect(grow, &QPushButton::clicked, this, [this] {
         if (m_logic != nullptr) {
@@ -248,11 +300,12 @@ QWidget *MainWindow::buildPanel() {
 
     // Keyboard order follows the stand description, then the projection.
     const MainControl order[] = {
-        MainControl::txtFromA,   MainControl::txtFromN,   MainControl::txtFromH,
-        MainControl::txtFromB,   MainControl::txtFromD,   MainControl::txtToA,
-        MainControl::txtByA,     MainControl::txtNetArea, MainControl::cmdGrow,
-        MainControl::cmdThin,    MainControl::cmdUseRow,  MainControl::cmdClear,
-        MainControl::cmdClearAll};
+        MainControl::txtFromA,    MainControl::txtFromN,     MainControl::txtFromH,
+        MainControl::txtFromB,    MainControl::txtFromD,     MainControl::txtToA,
+        MainControl::txtByA,      MainControl::txtNetArea,   MainControl::cmdGrow,
+        MainControl::cmdThin,     MainControl::cmdUseRow,    MainControl::cmdClear,
+        MainControl::cmdClearAll, MainControl::cmdFinalCut,  MainControl::cmdSummary,
+        MainControl::cmdNPV,      MainControl::cmdDeleteRows};
     for (std::size_t i = 1; i < std::size(order); ++i) {
         setTabOrder(control(order[i - 1]), control(order[i]));
     }
@@ -277,6 +330,29 @@ void MainWindow::buildGrid() {
     m_grid->verticalHeader()->setFixedWidth(
         m_grid->fontMetrics().horizontalAdvance(QStringLiteral("AC yr")) + 16);
     m_grid->horizontalHeader()->setMinimumSectionSize(kSeparatorWidth);
+}
+
+void MainWindow::onClick(MainControl c, void (workflow::MainWindowLogic::*handler)()) {
+    connect(static_cast<QPushButton *>(control(c)), &QPushButton::clicked, this, [this, handler] {
+        if (m_logic != nullptr) {
+            (m_logic->*handler)();
+        }
+    });
+}
+
+void MainWindow::buildSummaryGrid() {
+    m_summaryGrid = new QTableView(this);
+    m_summaryGrid->setObjectName(QStringLiteral("flxSummary"));
+    m_summaryGrid->setSelectionBehavior(QAbstractItemView::SelectRows);
+    m_summaryGrid->setEditTriggers(QAbstractItemView::NoEditTriggers);
+    m_summaryGrid->setAlternatingRowColors(true);
+    m_summaryGrid->setWordWrap(false);
+    m_summaryGrid->verticalHeader()->hide();
+    m_summaryGrid->verticalHeader()->setDefaultSectionSize(m_grid->fontMetrics().height() + 8);
+    // Captions name their group ("Thinning V/ha"): two lines each.
+    m_summaryGrid->horizontalHeader()->setDefaultAlignment(
+        Qt::Alignment::fromInt(Qt::AlignCenter | Qt::TextWordWrap));
+    m_summaryGrid->horizontalHeader()->setFixedHeight(m_grid->fontMetrics().height() * 2 + 14);
 }
 
 void MainWindow::fitColumns() {
@@ -362,7 +438,52 @@ void MainWindow::tableChanged(int firstRow) {
         return;
     }
     m_model->refresh(firstRow);
+    // Rewritten rows (a final cut) may hold wider numbers than before.
+    fitColumns();
     selectionFromLogic();
+    if (m_summaryModel != nullptr && m_logic->showingSummary()) {
+        fitSummary();
+    }
+}
+
+void MainWindow::showSummary(bool summary) {
+    if (m_tables == nullptr || m_summaryModel == nullptr) {
+        return;
+    }
+    if (summary) {
+        fitSummary();
+    }
+    m_tables->setCurrentWidget(summary ? m_summaryGrid : m_grid);
+}
+
+void MainWindow::fitSummary() {
+    m_summaryModel->refresh();
+    // Rows after the copied ones are the rotation's totals.
+    const auto rows = static_cast<int>(m_logic->summaryRows().size());
+    int copied = 0;
+    for (const workflow::TableRow &r : m_logic->summaryRows()) {
+        copied += r.isText() ? 0 : 1;
+    }
+    m_summaryModel->setBoldFrom(copied < rows ? copied : -1);
+    const QFontMetrics metrics = m_summaryGrid->horizontalHeader()->fontMetrics();
+    QFont boldFont = m_summaryGrid->font();
+    boldFont.setBold(true);
+    const QFontMetrics bold(boldFont);
+    for (int c = 0; c < m_summaryModel->columnCount(); ++c) {
+        // A caption wraps onto two lines ("Thinning" over "V/ha"), so its
+        // group or its own caption, whichever is wider, sets the least width.
+        const QString caption = m_summaryModel->headerData(c, Qt::Horizontal).toString();
+        const qsizetype lastBlank = caption.lastIndexOf(u' ');
+        int widest = lastBlank < 0
+                         ? metrics.horizontalAdvance(caption)
+                         : std::max(metrics.horizontalAdvance(caption.left(lastBlank)),
+                                    metrics.horizontalAdvance(caption.mid(lastBlank + 1)));
+        for (int r = 0; r < m_summaryModel->rowCount(); ++r) {
+            widest = std::max(
+                widest, bold.horizontalAdvance(m_summaryModel->index(r, c).data().toString()));
+        }
+        m_summaryGrid->setColumnWidth(c, widest + 14);
+    }
 }
 
 void MainWindow::scrollToRow(int row) {

@@ -11,6 +11,7 @@ class QLabel;
 class QLineEdit;
 class QPushButton;
 class QSettings;
+class QStackedWidget;
 class QTableView;
 
 namespace arbolex::workflow {
@@ -20,6 +21,7 @@ class MainWindowLogic;
 namespace arbolex::ui {
 
 class ProjectionModel;
+class StringGridModel;
 
 /// The main window `frmMain`: the grow-from panel, the commands, the
 /// projection table `flxMain` and the model menu `mnuModel`. Everything it
@@ -41,6 +43,7 @@ public:
     /// The widget of a control, nullptr for commands the window does not offer.
     QWidget *control(workflow::MainControl control) const;
     QTableView *grid() const { return m_grid; }
+    QTableView *summaryGrid() const { return m_summaryGrid; }
     ProjectionModel *gridModel() const { return m_model; }
     QActionGroup *modelMenu() const { return m_modelActions; }
 
@@ -56,6 +59,7 @@ public:
     void tableChanged(int firstRow) override;
     void scrollToRow(int row) override;
     void setActiveModel(int modelId) override;
+    void showSummary(bool summary) override;
     QRect placement() const override;
     void setPlacement(const QRect &placement) override;
 
@@ -67,6 +71,11 @@ private:
     void buildMenus();
     QWidget *buildPanel();
     void buildGrid();
+    void buildSummaryGrid();
+    /// Reads the summary again and sizes its columns to captions and values.
+    void fitSummary();
+    /// Connects a command button to its handler of the logic.
+    void onClick(workflow::MainControl control, void (workflow::MainWindowLogic::*handler)());
     QLineEdit *addField(workflow::MainControl control);
     QLabel *addResult(workflow::MainControl control);
     QPushButton *addButton(workflow::MainControl control, const QString &caption);
@@ -87,6 +96,9 @@ private:
     QActionGroup *m_modelActions = nullptr;
     QTableView *m_grid = nullptr;
     ProjectionModel *m_model = nullptr;
+    QTableView *m_summaryGrid = nullptr;
+    StringGridModel *m_summaryModel = nullptr;
+    QStackedWidget *m_tables = nullptr;
     /// Set while the grid follows the logic, so the change is not sent back.
     bool m_followingLogic = false;
     int m_busyDepth = 0;

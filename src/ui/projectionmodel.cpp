@@ -19,6 +19,10 @@ bool isSeparatorColumn(int tableColumn) {
 QColor thinningTint() {
     return {0xf6, 0xe7, 0xc8};
 }
+/// The clear-fell row that ends the rotation.
+QColor finalCutTint() {
+    return {0xd5, 0xe8, 0xd0};
+}
 /// Rows of a projection that failed half-way.
 QColor failedTint() {
     return {0xf4, 0xd3, 0xd0};
@@ -50,12 +54,16 @@ QVariant ProjectionModel::data(const QModelIndex &index, int role) const {
     const bool separator = isSeparator(index.column());
     switch (role) {
     case Qt::DisplayRole:
-        return row.cells.value(column);
+        // A separator's cell may hold the summary's marker: blank on screen.
+        return separator ? QString() : row.cells.value(column);
     case Qt::TextAlignmentRole:
         return QVariant::fromValue(Qt::AlignRight | Qt::AlignVCenter);
     case Qt::BackgroundRole:
         if (separator) {
             return QBrush(separatorTint());
+        }
+        if (row.finalCut) {
+            return QBrush(finalCutTint());
         }
         if (row.kind == RowKind::Thinning) {
             return QBrush(thinningTint());
@@ -69,6 +77,11 @@ QVariant ProjectionModel::data(const QModelIndex &index, int role) const {
             QFont italic;
             italic.setItalic(true);
             return italic;
+        }
+        if (row.finalCut) {
+            QFont bold;
+            bold.setBold(true);
+            return bold;
         }
         return {};
     case SeparatorRole:

@@ -57,6 +57,9 @@ void QtInteractive::message(const QString &title, const QString &text, int style
 }
 
 bool QtInteractive::askYesNo(const QString &title, const QString &text) {
+    if (!m_answers.isEmpty()) {
+        return m_answers.takeFirst();
+    }
     QMessageBox box(QMessageBox::Question, title, lineBreaks(text),
                     QMessageBox::Yes | QMessageBox::No, m_parent);
     box.setTextFormat(Qt::PlainText);

@@ -2,6 +2,7 @@
 
 #include "shell/interactive.hpp"
 
+#include <QList>
 #include <QPointer>
 #include <QWidget>
 
@@ -17,6 +18,8 @@ public:
     explicit QtInteractive(QWidget *parent = nullptr) : m_parent(parent) {}
 
     void setParentWidget(QWidget *parent) { m_parent = parent; }
+    /// Answers the next question with `yes` without asking (demonstrations).
+    void queueAnswer(bool yes) { m_answers.append(yes); }
 
     void message(const QString &title, const QString &text, int style) override;
     bool askYesNo(const QString &title, const QString &text) override;
@@ -30,6 +33,7 @@ public:
 
 private:
     QPointer<QWidget> m_parent;
+    QList<bool> m_answers;
 };
 
 } // namespace arbolex::ui

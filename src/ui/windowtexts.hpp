@@ -47,6 +47,15 @@ inline QString menuThreshold() {
 inline QString menuNotes() {
     return QStringLiteral("&Notes on this model\u2026");
 }
+inline QString menuEdit() {
+    return QStringLiteral("&Edit");
+}
+inline QString menuCopy() {
+    return QStringLiteral("&Copy Table");
+}
+inline QString menuDeleteRows() {
+    return QStringLiteral("&Delete Rows from Selection\u2026");
+}
 inline QString menuAbout() {
     return QStringLiteral("&About ARBOLEX");
 }
@@ -119,6 +128,27 @@ inline QString buttonThin() {
 }
 inline QString hintThin() {
     return QStringLiteral("Mark or edit thinning.");
+}
+inline QString buttonFinalCut() {
+    return QStringLiteral("&Final Cut");
+}
+inline QString hintFinalCut() {
+    return QStringLiteral("Clear-fell the last stand of the table and value it.");
+}
+inline QString buttonNpv() {
+    return QStringLiteral("&NPV\u2026");
+}
+inline QString hintNpv() {
+    return QStringLiteral("Cash flow and net present value of the rotation.");
+}
+inline QString buttonDeleteRows() {
+    return QStringLiteral("&Delete Rows");
+}
+inline QString hintDeleteRows() {
+    return QStringLiteral("Delete the rows from the selected one to the end.");
+}
+inline QString hintSummary() {
+    return QStringLiteral("Switch between the projections and the rotation summary.");
 }
 
 // ---- Thinning window ----------------------------------------------------------------

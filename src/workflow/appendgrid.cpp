@@ -140,6 +140,10 @@ void MainWindowLogic::AppendGrid(RowKind kind, const QString &label) {
             // A row of a failed projection shows its age and increments only.
             row.cells[kColAge] = shell::singleText(s.age);
         }
+        if (index == 1) {
+            // The summary carries the start of the rotation.
+            row.cells[kColSeparator1] = text::summaryMarker();
+        }
         m_table.append(std::move(row));
         writeIncrements(index, true);
     }
@@ -149,12 +153,16 @@ void MainWindowLogic::AppendGrid(RowKind kind, const QString &label) {
 
 int MainWindowLogic::yieldClass() const {
     std::vector<double> mai;
+    double lastAge = -1.0;
     for (int r = 1; r <= m_table.lastRow(); ++r) {
         const TableRow &row = m_table.row(r);
-        // Only rows that carry an increment of their own take part: a
-        // thinning row repeats the MAI of the growth row at its age.
-        if (row.kind == RowKind::Growth || row.kind == RowKind::Failed) {
+        // Only rows that carry an increment of their own take part, one per
+        // age: a thinning row, or a final cut after a thinning, repeats the
+        // MAI of the growth row at its age.
+        if ((row.kind == RowKind::Growth || row.kind == RowKind::Failed) &&
+            row.numbers[kNumAge] != lastAge) {
             mai.push_back(row.numbers[kNumMai]);
+            lastAge = row.numbers[kNumAge];
         }
     }
     return workflow::yieldClass(mai);
@@ -164,8 +172,7 @@ void MainWindowLogic::updateYieldClassLabel() {
     const int yc = yieldClass();
     if (yc > 0) {
         m_view.setText(MainControl::lblYC, QString::number(yc));
-        m_view.setHint(MainControl::lblYC,
-                       QStringLiteral("Yield Class: the culminated mean annual increment"));
+        m_view.setHint(MainControl::lblYC, text::yieldClassHint());
     } else {
         m_view.setText(MainControl::lblYC, QString());
         m_view.setHint(MainControl::lblYC, text::yieldClassInsufficient());

@@ -22,6 +22,7 @@ public:
     void tableChanged(int /*firstRow*/) override {}
     void scrollToRow(int row) override { m_topRow = row; }
     void setActiveModel(int modelId) override { m_activeModel = modelId; }
+    void showSummary(bool summary) override { m_summaryShown = summary; }
     QRect placement() const override { return m_placement; }
     void setPlacement(const QRect &p) override { m_placement = p; }
 
@@ -32,6 +33,7 @@ public:
     bool busy() const { return m_busy; }
     int topRow() const { return m_topRow; }
     int activeModel() const { return m_activeModel; }
+    bool summaryShown() const { return m_summaryShown; }
 
 private:
     static std::size_t index(MainControl c) { return static_cast<std::size_t>(c); }
@@ -44,6 +46,7 @@ private:
     bool m_busy = false;
     int m_topRow = 0;
     int m_activeModel = -1;
+    bool m_summaryShown = false;
     QRect m_placement{100, 100, 1100, 720};
 };
 

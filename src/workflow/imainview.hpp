@@ -24,6 +24,8 @@ public:
     virtual void tableChanged(int firstRow) = 0;
     /// Scrolls the table so that `row` is the top visible row.
     virtual void scrollToRow(int row) = 0;
+    /// Shows the summary `flxSummary` in place of the projections, or back.
+    virtual void showSummary(bool summary) = 0;
     /// Marks the active model in the model menu.
     virtual void setActiveModel(int modelId) = 0;
     /// Placement of the window on the screen.

@@ -8,10 +8,10 @@ namespace arbolex::workflow {
 
 namespace {
 constexpr std::array<const char *, kMainControlCount> kNames = {
-    "txtFromA",    "txtFromN",  "txtFromH",    "txtFromB",   "txtFromD",
-    "txtToA",      "txtByA",    "txtNetArea",  "lblSI",      "lblYC",
-    "cmdGrow",     "cmdThin",   "cmdFinalCut", "cmdAssort",  "cmdClear",
-    "cmdClearAll", "cmdUseRow", "cmdNPV",      "cmdSummary", "cmdShowTimberPrice"};
+    "txtFromA",    "txtFromN",           "txtFromH",      "txtFromB",     "txtFromD",  "txtToA",
+    "txtByA",      "txtNetArea",         "lblSI",         "lblYC",        "cmdGrow",   "cmdThin",
+    "cmdFinalCut", "cmdAssort",          "cmdClear",      "cmdClearAll",  "cmdUseRow", "cmdNPV",
+    "cmdSummary",  "cmdShowTimberPrice", "cmdDeleteRows", "lblTableTitle"};
 } // namespace
 
 QString controlName(MainControl control) {

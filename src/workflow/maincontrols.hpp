@@ -32,9 +32,12 @@ enum class MainControl {
     cmdNPV,
     cmdSummary,
     cmdShowTimberPrice,
+    cmdDeleteRows,
+    /// Title above the table: "Stand Projections" or "Summary".
+    lblTableTitle,
 };
 
-inline constexpr int kMainControlCount = static_cast<int>(MainControl::cmdShowTimberPrice) + 1;
+inline constexpr int kMainControlCount = static_cast<int>(MainControl::lblTableTitle) + 1;
 
 /// The control's name ("txtFromA").
 QString controlName(MainControl control);

@@ -121,6 +121,78 @@ inline QString showTimberPrices() {
     return QStringLiteral("Show Timber Prices");
 }
 
+// Final cut, summary and row deletion
+inline QString rowLabelFinalCut() {
+    return QStringLiteral("FC yr");
+}
+/// Text of the marker cell of the rows the summary carries (start, thinnings,
+/// final cut): a tab, blank on the screen and dropped by every copy.
+inline QString summaryMarker() {
+    return QStringLiteral("\t");
+}
+inline QString titleNpv() {
+    return QStringLiteral("NPV");
+}
+inline QString npvOffer() {
+    return QStringLiteral("You now have the option to view the Net Present Value of this "
+                          "sub-compartment. If you wish to avail of this possibility, clik Yes");
+}
+inline QString nothingToFell() {
+    return QStringLiteral("FAULT - There is no stand to fell: grow the stand first.");
+}
+inline QString failedRowsBeforeFinalCut() {
+    return QStringLiteral("FAULT - The projection failed before its last row. Delete the "
+                          "failed rows before the final cut.");
+}
+inline QString nothingToSummarize() {
+    return QStringLiteral("Sorry!  Nothing to summurize.");
+}
+inline QString standProjections() {
+    return QStringLiteral("Stand Projections");
+}
+inline QString summary() {
+    return QStringLiteral("Summary");
+}
+inline QString gotoStandProjections() {
+    return QStringLiteral("GoTo Stand Projections");
+}
+inline QString yieldClassHint() {
+    return QStringLiteral("Yield Class: the culminated mean annual increment");
+}
+inline QString summaryLabelCaption() {
+    return QStringLiteral("Event");
+}
+inline QString summaryStart() {
+    return QStringLiteral("Start");
+}
+inline QString summaryThinning() {
+    return QStringLiteral("Thinning");
+}
+inline QString summaryFinalCut() {
+    return QStringLiteral("Final cut");
+}
+inline QString summaryTotalProduction() {
+    return QStringLiteral("Total production");
+}
+inline QString summaryTotalThinned() {
+    return QStringLiteral("Total thinned");
+}
+inline QString summaryMaximumMai() {
+    return QStringLiteral("Maximum MAI");
+}
+inline QString summaryYieldClass() {
+    return QStringLiteral("Yield class");
+}
+inline QString selectRowToDelete() {
+    return QStringLiteral("FAULT - Select the first row to delete in the projection table.");
+}
+inline QString confirmDelete(int first, int last) {
+    return QStringLiteral("PLEASE CONFIRM - Delete rows ") + QString::number(first) +
+           QStringLiteral(" to ") + QString::number(last) +
+           QStringLiteral(" of the projection table?") + QStringLiteral("\r\n") +
+           QStringLiteral("The projection will go on from the row before them.");
+}
+
 /// "O.R." stands in both volume cells when the volume is 0 or less.
 inline QString outOfRange() {
     return QStringLiteral("O.R.");

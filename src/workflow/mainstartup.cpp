@@ -39,6 +39,7 @@ constexpr float kFirstThinningHeight = 12.0f;
 void MainWindowLogic::Form_Load(QSettings &settings, const QRect &screen) {
     shell::guard(m_log, QStringLiteral(" in frmMain.Load()"), [&] {
         m_view.setPlacement(shell::readMainPlacement(settings, screen));
+        m_cashFlow.setInterestRate(shell::readInterestRate(settings));
         afterClear(HeaderLayout::WithMoney);
         shell::StartupValues stored;
         shell::readStartupFile(m_dataFolder, stored, m_log);
@@ -53,7 +54,7 @@ void MainWindowLogic::Form_Load(QSettings &settings, const QRect &screen) {
         showSiteIndex(stored.age, stored.topHeight);
         economics::GetPricesFromFiles(m_dataFolder, m_prices.data(), m_log);
         m_prices.selectPriceSet(economics::kCurrentPrices);
-        m_view.setText(MainControl::cmdSummary, text::gotoSummary());
+        showSummary(false);
         m_view.setText(MainControl::cmdShowTimberPrice, text::showTimberPrices());
     });
 }
@@ -61,7 +62,10 @@ void MainWindowLogic::Form_Load(QSettings &settings, const QRect &screen) {
 void MainWindowLogic::Form_Unload(QSettings &settings) {
     // Each step is tried on its own: a failure in one still lets the others save.
     const QString label = QStringLiteral(" in frmMain.Unload()");
-    shell::guard(m_log, label, [&] { shell::writeMainPlacement(settings, m_view.placement()); });
+    shell::guard(m_log, label, [&] {
+        shell::writeMainPlacement(settings, m_view.placement());
+        shell::writeInterestRate(settings, m_cashFlow.interestRate());
+    });
     shell::guard(m_log, label, [&] {
         shell::StartupValues values;
         values.modelIndex = m_grow.modelId();
@@ -100,6 +104,8 @@ void MainWindowLogic::mnuModel_Click(int index) {
             return;
         }
         m_grow.GetVCF();
+        m_cashFlow.reset();
+        m_view.setEnabled(MainControl::cmdNPV, false);
         m_table.setHeaderLayout(HeaderLayout::WithMoney);
         m_view.tableChanged(1);
         updateCaption();

@@ -1,6 +1,7 @@
 // The main window's commands: grow, clear, clear all and continuing from a row.
 #include "workflow/mainwindowlogic.hpp"
 
+#include "economics/npvwindowlogic.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
@@ -95,6 +96,10 @@ bool MainWindowLogic::continuesFromRow(int row) const {
 
 void MainWindowLogic::cmdGrow_Click() {
     shell::guard(m_log, QStringLiteral(" in frmMain.cmdGrow_Click()"), [&] {
+        // After the final cut the rotation is closed until rows are cleared or deleted.
+        if (m_felled) {
+            return;
+        }
         const bool thinned = m_grow.isThinnedModel();
         // The start of a thinned projection is fixed once it has rows.
         if (thinned && m_table.rowCount() > 1 && changeCheck()) {
@@ -143,6 +148,7 @@ void MainWindowLogic::cmdGrow_Click() {
         m_view.scrollToRow(last);
 
         m_view.setEnabled(MainControl::cmdUseRow, true);
+        m_view.setEnabled(MainControl::cmdFinalCut, last >= 1);
         if (thinned) {
             // From now on the projection goes on only from its own rows.
             m_view.setEnabled(MainControl::cmdClear, false);
@@ -150,7 +156,6 @@ void MainWindowLogic::cmdGrow_Click() {
                 copyRowToFields(last);
             }
         } else {
-            m_view.setEnabled(MainControl::cmdFinalCut, true);
             m_view.setEnabled(MainControl::cmdClear, true);
         }
     });
@@ -162,6 +167,14 @@ void MainWindowLogic::afterClear(HeaderLayout layout) {
     m_firstNew = 0;
     m_standingVolume = 0.0;
     m_timberRevenue.clear();
+    m_felled = false;
+    m_cashFlow.reset();
+    if (m_npv != nullptr) {
+        m_npv->view().close();
+    }
+    if (m_showingSummary) {
+        showSummary(false);
+    }
     if (m_thinning != nullptr) {
         // A thinning window open on the old rows has nothing left to thin.
         m_thinning->flags().noThinningYet = true;
@@ -172,6 +185,8 @@ void MainWindowLogic::afterClear(HeaderLayout layout) {
     m_view.setEnabled(MainControl::cmdClear, true);
     m_view.setEnabled(MainControl::cmdUseRow, false);
     m_view.setEnabled(MainControl::cmdFinalCut, false);
+    m_view.setEnabled(MainControl::cmdNPV, false);
+    m_view.setEnabled(MainControl::cmdThin, m_grow.isThinnedModel());
     m_view.tableChanged(1);
 }
 

@@ -6,6 +6,7 @@
 // IMainView and asks the user only through IInteractive, so its handlers can
 // call one another with no person at the keyboard.
 
+#include "economics/mdlnpv.hpp"
 #include "economics/timberrevenue.hpp"
 #include "engine/grow.hpp"
 #include "workflow/imainview.hpp"
@@ -20,10 +21,12 @@ class QSettings;
 
 namespace arbolex::shell {
 class ErrorLog;
+class IClipboard;
 class IInteractive;
 } // namespace arbolex::shell
 
 namespace arbolex::economics {
+class NpvWindowLogic;
 class Prices;
 } // namespace arbolex::economics
 
@@ -77,6 +80,30 @@ public:
     void TrhesholdInfo();
     /// Notes on the valid use of the active model.
     void Warn();
+
+    // ---- Closing the rotation ---------------------------------------------------
+
+    /// Final cut: the last stand of the table becomes the clear-fell row,
+    /// valued, with the yield class of the rotation; offers the net present value.
+    void cmdFinalCut_Click();
+    /// Fills the summary `flxSummary` and shows it; false when there was
+    /// nothing to summarise.
+    bool FillSummary();
+    /// Toggles between "Stand Projections" and "Summary".
+    void cmdSummary_Click();
+    /// Opens the net present value window on the rotation.
+    void cmdNPV_Click();
+    /// Deletes the rows from the first selected one to the end, after a question.
+    void cmdDeleteRows_Click();
+    /// Copies the projection table or the summary to the clipboard.
+    void CopyTable(bool summary);
+    /// True once the final cut has ended the rotation.
+    bool felled() const { return m_felled; }
+    /// The summary as last filled: its rows, in the projection table's shape.
+    const std::vector<TableRow> &summaryRows() const { return m_summary; }
+    /// The summary as shown: captions first, then its rows.
+    std::vector<QStringList> summaryGrid() const;
+    bool showingSummary() const { return m_showingSummary; }
     /// Text of the notes shown by Warn().
     QString warnText() const;
 
@@ -129,13 +156,21 @@ public:
 
     /// The thinning window's logic that the thin command opens.
     void attachThinning(thinning::ThinWindowLogic *thinning) { m_thinning = thinning; }
+    /// The net present value window's logic that cmdNPV opens.
+    void attachNpv(economics::NpvWindowLogic *npv) { m_npv = npv; }
+    /// The clipboard that the copy commands fill.
+    void attachClipboard(shell::IClipboard *clipboard) { m_clipboard = clipboard; }
 
     /// The table as the thinning rows change it.
     ProjectionTable &tableForThinning() { return m_table; }
     /// Tells the window that rows from `firstRow` on changed, and makes the
     /// thinned stand the standing crop.
     void thinningWritten(int firstRow, double standingVolume);
-    economics::TimberRevenue &timberRevenue() { return m_timberRevenue; }
+    const economics::TimberRevenue &timberRevenue() const { return m_timberRevenue; }
+    /// Rebuilds the timber revenue by year from the rows' own revenues.
+    void timberRevenueChanged();
+    /// The cash flow of the rotation (module `mdlNPV`).
+    economics::CashFlow &cashFlow() { return m_cashFlow; }
     /// The net area of the sub-compartment, ha (0 when empty).
     double netArea() const;
 
@@ -160,6 +195,12 @@ private:
     void buildGrowthCells(TableRow &row, int rowIndex) const;
     bool continuesFromRow(int row) const;
     float thresholdBasalArea();
+    /// The last row that holds a stand (growth or thinning), 0 when none.
+    int lastStandRow() const;
+    /// Renumbers the table's state after rows were deleted from `firstDeleted` on.
+    void AjustArraysAfterDelete(int firstDeleted);
+    /// Switches the table view between the projections and the summary.
+    void showSummary(bool summary);
 
     engine::Grow &m_grow;
     economics::Prices &m_prices;
@@ -175,7 +216,14 @@ private:
     /// Volume per ha of the last growth row, m³/ha.
     double m_standingVolume = 0.0;
     thinning::ThinWindowLogic *m_thinning = nullptr;
+    economics::NpvWindowLogic *m_npv = nullptr;
+    shell::IClipboard *m_clipboard = nullptr;
     economics::TimberRevenue m_timberRevenue;
+    economics::CashFlow m_cashFlow;
+    /// Set by the final cut; no growing or thinning until rows are cleared or deleted.
+    bool m_felled = false;
+    std::vector<TableRow> m_summary;
+    bool m_showingSummary = false;
 };
 
 } // namespace arbolex::workflow

@@ -49,6 +49,13 @@ void ProjectionTable::clear(HeaderLayout layout) {
     m_rowSel = 0;
 }
 
+void ProjectionTable::removeFrom(int firstRemoved) {
+    const auto kept = static_cast<std::size_t>(std::clamp(firstRemoved - 1, 0, lastRow()));
+    m_rows.erase(m_rows.begin() + static_cast<std::ptrdiff_t>(kept), m_rows.end());
+    m_row = lastRow();
+    m_rowSel = lastRow();
+}
+
 std::vector<int> ProjectionTable::visibleColumns() const {
     std::vector<int> columns;
     columns.reserve(kColumnCount);
@@ -107,6 +114,37 @@ std::vector<QStringList> ProjectionTable::visibleGrid() const {
         QStringList cells;
         for (int c : columns) {
             cells << r.cells.value(c);
+        }
+        grid.push_back(cells);
+    }
+    return grid;
+}
+
+std::vector<QStringList> ProjectionTable::exportGrid() const {
+    return exportGrid(m_rows, QStringLiteral("Row"));
+}
+
+std::vector<QStringList> ProjectionTable::exportGrid(const std::vector<TableRow> &rows,
+                                                     const QString &labelCaption) const {
+    std::vector<int> columns;
+    for (int c : visibleColumns()) {
+        if (c != kColSeparator1 && c != kColSeparator2 && c != kColSeparator3) {
+            columns.push_back(c);
+        }
+    }
+    std::vector<QStringList> grid;
+    grid.reserve(rows.size() + 1);
+    QStringList header{labelCaption};
+    for (int c : columns) {
+        const QString group = groupCaption(c);
+        const QString own = caption(c).trimmed();
+        header << (group.isEmpty() || c <= kColTopHeight ? own : group + u' ' + own);
+    }
+    grid.push_back(header);
+    for (const TableRow &r : rows) {
+        QStringList cells{r.label};
+        for (int c : columns) {
+            cells << r.cells.value(c).trimmed();
         }
         grid.push_back(cells);
     }

@@ -64,6 +64,12 @@ struct TableRow {
     RowNumbers numbers{};
     /// Value of the timber removed on this row, euro per ha (thinning rows).
     double removedValue = 0.0;
+    /// Timber revenue earned on this row at long-term average prices, euro
+    /// per ha: a thinning's removal or the final cut's crop. The cash flow
+    /// reads it by year.
+    double timberRevenue = 0.0;
+    /// True for the clear-fell row that ends the rotation.
+    bool finalCut = false;
 
     bool isGrowth() const { return kind == RowKind::Growth; }
     bool isThinning() const { return kind == RowKind::Thinning; }
@@ -91,6 +97,9 @@ public:
     int append(TableRow row);
     /// Removes every data row and writes the header in `layout`.
     void clear(HeaderLayout layout);
+    /// Removes data rows `firstRemoved` to the last; the current row and the
+    /// end of the selection move to the new last row.
+    void removeFrom(int firstRemoved);
     void setHeaderLayout(HeaderLayout layout) { m_layout = layout; }
     HeaderLayout headerLayout() const { return m_layout; }
 
@@ -104,6 +113,13 @@ public:
     /// The grid as it is seen: the header row, then every data row, each as
     /// its visible cells.
     std::vector<QStringList> visibleGrid() const;
+    /// The table as a spreadsheet receives it: a first column with the row
+    /// labels, the visible columns without the blank separators, and captions
+    /// that name their group ("Thinning N/ha").
+    std::vector<QStringList> exportGrid() const;
+    /// The same layout for `rows`, rows of this table's shape (the summary).
+    std::vector<QStringList> exportGrid(const std::vector<TableRow> &rows,
+                                        const QString &labelCaption) const;
 
     int currentRow() const { return m_row; }
     int selectionEnd() const { return m_rowSel; }

@@ -1,0 +1,41 @@
+#pragma once
+
+#include <QAbstractTableModel>
+#include <QStringList>
+
+#include <functional>
+#include <vector>
+
+namespace arbolex::ui {
+
+/// A grid of texts whose first row holds the captions, as an item model: the
+/// summary `flxSummary` and the cash flow `NPV_Grid`. The grid is read through
+/// `source` each time, so the model always shows what its logic holds.
+class StringGridModel : public QAbstractTableModel {
+    Q_OBJECT
+public:
+    using Source = std::function<std::vector<QStringList>()>;
+
+    explicit StringGridModel(Source source, QObject *parent = nullptr);
+
+    int rowCount(const QModelIndex &parent = {}) const override;
+    int columnCount(const QModelIndex &parent = {}) const override;
+    QVariant data(const QModelIndex &index, int role = Qt::DisplayRole) const override;
+    QVariant headerData(int section, Qt::Orientation orientation,
+                        int role = Qt::DisplayRole) const override;
+
+    /// Reads the grid again; a change of shape resets the model.
+    void refresh();
+    /// Columns shown left-aligned (texts); the others are numbers, right-aligned.
+    void setTextColumns(std::vector<int> columns) { m_textColumns = std::move(columns); }
+    /// Item rows shown bold (totals).
+    void setBoldFrom(int row) { m_boldFrom = row; }
+
+private:
+    Source m_source;
+    std::vector<QStringList> m_grid;
+    std::vector<int> m_textColumns{0};
+    int m_boldFrom = -1;
+};
+
+} // namespace arbolex::ui
