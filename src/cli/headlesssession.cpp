@@ -28,6 +28,7 @@ HeadlessSession::HeadlessSession(const QString &dataFolder, QTextStream &out)
       m_main(m_grow, m_prices, m_log, dataFolder, m_mainView, m_interactive),
       m_thin(m_main, m_thinView, m_interactive) {
     m_main.attachThinning(&m_thin);
+    m_main.attachTimberPrices(&m_timberPrices);
 }
 
 } // namespace arbolex::cli

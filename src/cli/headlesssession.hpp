@@ -4,7 +4,9 @@
 // the main window's logic over a headless view. The runner and the grow
 // shortcut of the command-line program drive it.
 
+#include "economics/headlesstimberpricesview.hpp"
 #include "economics/prices.hpp"
+#include "economics/timberpriceswindowlogic.hpp"
 #include "engine/grow.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
@@ -56,6 +58,8 @@ public:
     thinning::ThinWindowLogic &thinning() { return m_thin; }
     thinning::HeadlessThinView &thinView() { return m_thinView; }
     PrintingInteractive &interactive() { return m_interactive; }
+    economics::TimberPricesWindowLogic &timberPrices() { return m_timberPrices; }
+    economics::HeadlessTimberPricesView &timberPricesView() { return m_timberPricesView; }
 
 private:
     shell::ErrorLog m_log;
@@ -67,6 +71,8 @@ private:
     workflow::MainWindowLogic m_main;
     thinning::HeadlessThinView m_thinView;
     thinning::ThinWindowLogic m_thin;
+    economics::HeadlessTimberPricesView m_timberPricesView;
+    economics::TimberPricesWindowLogic m_timberPrices{m_prices, m_log, m_timberPricesView};
 };
 
 } // namespace arbolex::cli

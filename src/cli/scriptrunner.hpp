@@ -8,6 +8,9 @@
 //   answer yes|no            the answer to the next question
 //   print flxMain | CONTROL  the grid (header row first) or the text of a control
 // '#' starts a comment. Controls of other windows are named "window.name".
+// `set CONTROL` with no text empties the field; an element of a control array
+// carries its index ("frmTimberPrices.txtTimbVal(13)"); an option button
+// prints 1 when chosen, else 0.
 
 #include "cli/headlesssession.hpp"
 

@@ -25,6 +25,7 @@ class IInteractive;
 
 namespace arbolex::economics {
 class Prices;
+class TimberPricesWindowLogic;
 } // namespace arbolex::economics
 
 namespace arbolex::thinning {
@@ -69,6 +70,8 @@ public:
     void cmdClear_Click();
     /// Allows or ends changes to the user-defined prices.
     void cmdChangePrices_Click();
+    /// Show Timber Prices: opens the timber prices window.
+    void cmdShowTimberPrice_Click();
     /// Clear All: empties the table and shows the header without money column.
     void ClearAll();
     /// Copies the current table row into the grow-from fields.
@@ -129,6 +132,8 @@ public:
 
     /// The thinning window's logic that the thin command opens.
     void attachThinning(thinning::ThinWindowLogic *thinning) { m_thinning = thinning; }
+    /// The timber prices window's logic that Show Timber Prices opens.
+    void attachTimberPrices(economics::TimberPricesWindowLogic *prices) { m_timberPrices = prices; }
 
     /// The table as the thinning rows change it.
     ProjectionTable &tableForThinning() { return m_table; }
@@ -175,6 +180,7 @@ private:
     /// Volume per ha of the last growth row, m³/ha.
     double m_standingVolume = 0.0;
     thinning::ThinWindowLogic *m_thinning = nullptr;
+    economics::TimberPricesWindowLogic *m_timberPrices = nullptr;
     economics::TimberRevenue m_timberRevenue;
 };
 
