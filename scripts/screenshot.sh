@@ -5,7 +5,9 @@
 # stems/ha, 7 m, 20 m²/ha, to 50 by 5), the thinning window opened on the
 # same stand grown to 30 before and after previewing a removal of 60 m³/ha
 # (the whole screen, and the thinning window alone), and the main window
-# after a thinning loop: 30 m³/ha at 20, then every 5 years until 50.
+# after a thinning loop: 30 m³/ha at 20, then every 5 years until 50; and the
+# timber prices window as Show Timber Prices opens it (the whole screen, and
+# the window alone).
 #
 #   scripts/screenshot.sh [OUTPUT_FOLDER]      (default /tmp/shots)
 #
@@ -72,3 +74,9 @@ shoot thin-preview --no-intro --demo-thin preview
 export WINDOW_TITLE=
 export SHOT="$out/main-thin-loop.png"
 shoot main-thin-loop --no-intro --demo-thin loop
+
+export WINDOW_TITLE="Timber Prices"
+export SHOT="$out/timber-prices.png"
+rm -f "${SHOT%.png}-window.png"
+shoot timber-prices --no-intro --demo-prices
+export WINDOW_TITLE=

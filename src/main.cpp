@@ -2,6 +2,7 @@
 // and the thinning window with their logic, loads the main window, then lets
 // the user choose the model in the model choice window.
 #include "economics/prices.hpp"
+#include "economics/timberpriceswindowlogic.hpp"
 #include "engine/grow.hpp"
 #include "shell/datafolder.hpp"
 #include "shell/enginereport.hpp"
@@ -11,6 +12,7 @@
 #include "ui/modelchoicedialog.hpp"
 #include "ui/qtinteractive.hpp"
 #include "ui/thinwindow.hpp"
+#include "ui/timberpriceswindow.hpp"
 #include "ui/windowtexts.hpp"
 #include "workflow/mainwindowlogic.hpp"
 
@@ -85,6 +87,8 @@ struct Options {
         parser.addOption(demo);
         demoThin.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(demoThin);
+        demoPrices.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(demoPrices);
         quitWhenShown.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(quitWhenShown);
     }
@@ -99,6 +103,8 @@ struct Options {
                                               "the start-up file.")};
     QCommandLineOption demo{QStringLiteral("demo-grow")};
     QCommandLineOption demoThin{QStringLiteral("demo-thin"), QString(), QStringLiteral("STAGE")};
+    /// Opens the timber prices window, as Show Timber Prices does.
+    QCommandLineOption demoPrices{QStringLiteral("demo-prices")};
     /// Ends the program once the main window is on screen: start-up is timed with it.
     QCommandLineOption quitWhenShown{QStringLiteral("quit-when-shown")};
 };
@@ -159,6 +165,11 @@ int main(int argc, char *argv[]) {
     ThinWindowLogic thinLogic(logic, thinWindow, interactive);
     thinWindow.attach(thinLogic);
     logic.attachThinning(&thinLogic);
+    // The timber prices window too opens over the main window.
+    arbolex::ui::TimberPricesWindow pricesWindow(&window);
+    arbolex::economics::TimberPricesWindowLogic pricesLogic(prices, log, pricesWindow);
+    pricesWindow.attach(pricesLogic);
+    logic.attachTimberPrices(&pricesLogic);
     logic.Form_Load(settings, QGuiApplication::primaryScreen()->availableGeometry());
 
     if (parser.isSet(options.demoThin)) {
@@ -168,6 +179,8 @@ int main(int argc, char *argv[]) {
                 qWarning("unknown thinning demonstration: %s", qPrintable(stage));
             }
         });
+    } else if (parser.isSet(options.demoPrices)) {
+        QTimer::singleShot(0, &window, [&logic] { logic.cmdShowTimberPrice_Click(); });
     } else if (parser.isSet(options.demo)) {
         QTimer::singleShot(0, &window, [&logic] { demoGrow(logic); });
     }

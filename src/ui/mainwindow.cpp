@@ -5,6 +5,7 @@
 #include "ui/groupheaderview.hpp"
 #include "ui/projectionmodel.hpp"
 #include "ui/windowtexts.hpp"
+#include "workflow/mainmessages.hpp"
 #include "workflow/mainwindowlogic.hpp"
 
 #include <QAction>
@@ -218,6 +219,14 @@ QWidget *MainWindow::buildPanel() {
     commands->addWidget(clear, 3, 0);
     commands->addWidget(clearAll, 4, 0);
     commands->setRowStretch(5, 1);
+    QPushButton *prices =
+        addButton(MainControl::cmdShowTimberPrice, workflow::text::showTimberPrices());
+    commands->addWidget(prices, 5, 0, Qt::AlignTop);
+    connect(prices, &QPushButton::clicked, this, [this] {
+        if (m_logic != nullptr) {
+            m_logic->cmdShowTimberPrice_Click();
+        }
+    });
     row->addLayout(commands);
 
     connect(grow, &QPushButton::clicked, this, [this] {
