@@ -29,7 +29,7 @@ int elementCount(TimberPricesControl control) {
 }
 
 QString controlName(TimberPricesItem item) {
-    const QString name = shell::controlNameIn(kNames, item.control);
+    QString name = shell::controlNameIn(kNames, item.control);
     if (elementCount(item.control) == 1) {
         return name;
     }
