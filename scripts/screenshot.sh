@@ -5,10 +5,11 @@
 # stems/ha, 7 m, 20 m²/ha, to 50 by 5), the thinning window opened on the
 # same stand grown to 30 before and after previewing a removal of 60 m³/ha
 # (the whole screen, and the thinning window alone), and the main window
-# after a thinning loop: 30 m³/ha at 20, then every 5 years until 50; and a
+# after a thinning loop: 30 m³/ha at 20, then every 5 years until 50; a
 # whole rotation (age 15, 2500 stems/ha, 9 m, 22 m²/ha, 10 ha, thinned by
 # 50 m³/ha at 30, grown to 60): the final cut with its question, the summary,
-# and the net present value window.
+# and the net present value window; and the timber prices window as Show
+# Timber Prices opens it (the whole screen, and the window alone).
 #
 #   scripts/screenshot.sh [OUTPUT_FOLDER]      (default /tmp/shots)
 #
@@ -84,3 +85,8 @@ export WINDOW_TITLE="Net Present Value"
 export SHOT="$out/npv.png"
 rm -f "${SHOT%.png}-window.png"
 shoot npv --no-intro --demo-rotation npv
+export WINDOW_TITLE="Timber Prices"
+export SHOT="$out/timber-prices.png"
+rm -f "${SHOT%.png}-window.png"
+shoot timber-prices --no-intro --demo-prices
+export WINDOW_TITLE=

@@ -3,6 +3,7 @@
 // the user choose the model in the model choice window.
 #include "economics/npvwindowlogic.hpp"
 #include "economics/prices.hpp"
+#include "economics/timberpriceswindowlogic.hpp"
 #include "engine/grow.hpp"
 #include "shell/datafolder.hpp"
 #include "shell/enginereport.hpp"
@@ -14,6 +15,7 @@
 #include "ui/qtclipboard.hpp"
 #include "ui/qtinteractive.hpp"
 #include "ui/thinwindow.hpp"
+#include "ui/timberpriceswindow.hpp"
 #include "ui/windowtexts.hpp"
 #include "workflow/mainwindowlogic.hpp"
 
@@ -133,6 +135,8 @@ struct Options {
         parser.addOption(demoThin);
         demoRotation.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(demoRotation);
+        demoPrices.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(demoPrices);
         quitWhenShown.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(quitWhenShown);
     }
@@ -149,6 +153,8 @@ struct Options {
     QCommandLineOption demoThin{QStringLiteral("demo-thin"), QString(), QStringLiteral("STAGE")};
     QCommandLineOption demoRotation{QStringLiteral("demo-rotation"), QString(),
                                     QStringLiteral("STAGE")};
+    /// Opens the timber prices window, as Show Timber Prices does.
+    QCommandLineOption demoPrices{QStringLiteral("demo-prices")};
     /// Ends the program once the main window is on screen: start-up is timed with it.
     QCommandLineOption quitWhenShown{QStringLiteral("quit-when-shown")};
 };
@@ -217,6 +223,11 @@ int main(int argc, char *argv[]) {
     npvWindow.attach(npvLogic);
     logic.attachNpv(&npvLogic);
     logic.attachClipboard(&clipboard);
+    // The timber prices window too opens over the main window.
+    arbolex::ui::TimberPricesWindow pricesWindow(&window);
+    arbolex::economics::TimberPricesWindowLogic pricesLogic(prices, log, pricesWindow);
+    pricesWindow.attach(pricesLogic);
+    logic.attachTimberPrices(&pricesLogic);
     logic.Form_Load(settings, QGuiApplication::primaryScreen()->availableGeometry());
 
     if (parser.isSet(options.demoRotation)) {
@@ -236,6 +247,8 @@ int main(int argc, char *argv[]) {
                 qWarning("unknown thinning demonstration: %s", qPrintable(stage));
             }
         });
+    } else if (parser.isSet(options.demoPrices)) {
+        QTimer::singleShot(0, &window, [&logic] { logic.cmdShowTimberPrice_Click(); });
     } else if (parser.isSet(options.demo)) {
         QTimer::singleShot(0, &window, [&logic] { demoGrow(logic); });
     }

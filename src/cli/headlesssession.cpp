@@ -32,6 +32,7 @@ HeadlessSession::HeadlessSession(const QString &dataFolder, QTextStream &out)
     m_main.attachThinning(&m_thin);
     m_main.attachNpv(&m_npv);
     m_main.attachClipboard(&m_clipboard);
+    m_main.attachTimberPrices(&m_timberPrices);
 }
 
 } // namespace arbolex::cli

@@ -4,9 +4,11 @@
 // the main window's logic over a headless view. The runner and the grow
 // shortcut of the command-line program drive it.
 
+#include "economics/headlesstimberpricesview.hpp"
 #include "economics/inpvview.hpp"
 #include "economics/npvwindowlogic.hpp"
 #include "economics/prices.hpp"
+#include "economics/timberpriceswindowlogic.hpp"
 #include "engine/grow.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
@@ -62,6 +64,8 @@ public:
     economics::NpvWindowLogic &npv() { return m_npv; }
     economics::HeadlessNpvView &npvView() { return m_npvView; }
     shell::HeadlessClipboard &clipboard() { return m_clipboard; }
+    economics::TimberPricesWindowLogic &timberPrices() { return m_timberPrices; }
+    economics::HeadlessTimberPricesView &timberPricesView() { return m_timberPricesView; }
 
 private:
     shell::ErrorLog m_log;
@@ -76,6 +80,8 @@ private:
     shell::HeadlessClipboard m_clipboard;
     economics::HeadlessNpvView m_npvView;
     economics::NpvWindowLogic m_npv;
+    economics::HeadlessTimberPricesView m_timberPricesView;
+    economics::TimberPricesWindowLogic m_timberPrices{m_prices, m_log, m_timberPricesView};
 };
 
 } // namespace arbolex::cli

@@ -39,6 +39,10 @@ ScriptRunner::ScriptRunner(HeadlessSession &session, QTextStream &out)
          [&main] {
              main.cmdChangePrices_Click();
          }},
+        {QStringLiteral("cmdShowTimberPrice"),
+         [&main] {
+             main.cmdShowTimberPrice_Click();
+         }},
         {QStringLiteral("mnuThreshold"),
          [&main] {
              main.TrhesholdInfo();
@@ -173,6 +177,16 @@ std::optional<thinning::ThinControl> thinControl(const QString &name) {
     }
     return thinning::thinControlFromName(name.mid(kThinWindow.size()));
 }
+
+constexpr QLatin1String kTimberPricesWindow("frmTimberPrices.");
+
+/// The timber-prices control `name` names ("frmTimberPrices.txtTimbVal(13)"), if any.
+std::optional<economics::TimberPricesItem> timberPricesItem(const QString &name) {
+    if (!name.startsWith(kTimberPricesWindow)) {
+        return std::nullopt;
+    }
+    return economics::timberPricesItemFromName(name.mid(kTimberPricesWindow.size()));
+}
 } // namespace
 
 QString ScriptRunner::set(const QString &control, const QString &text) {
@@ -182,6 +196,13 @@ QString ScriptRunner::set(const QString &control, const QString &text) {
     }
     if (npvControl(control) == economics::NpvControl::txtInterestRate) {
         m_session.npv().typeInterestRate(text);
+        return {};
+    }
+    if (const auto prices = timberPricesItem(control)) {
+        if (prices->control != economics::TimberPricesControl::txtTimbVal) {
+            return QStringLiteral("no field named '") + control + QLatin1Char('\'');
+        }
+        m_session.timberPrices().typeText(prices->index, text);
         return {};
     }
     if (const auto thin = thinControl(control)) {
@@ -200,6 +221,12 @@ QString ScriptRunner::set(const QString &control, const QString &text) {
 }
 
 QString ScriptRunner::press(const QString &control) {
+    if (const auto prices = timberPricesItem(control)) {
+        if (!m_session.timberPrices().press(prices->control)) {
+            return QStringLiteral("no command named '") + control + QLatin1Char('\'');
+        }
+        return {};
+    }
     if (const auto thin = thinControl(control)) {
         if (!m_session.thinning().press(*thin)) {
             return QStringLiteral("no command named '") + control + QLatin1Char('\'');
@@ -254,6 +281,15 @@ QString ScriptRunner::print(const QString &control) {
             m_out << (view.isChecked(*thin) ? "1" : "0") << '\n';
         } else {
             m_out << view.text(*thin) << '\n';
+        }
+        return {};
+    }
+    if (const auto prices = timberPricesItem(control)) {
+        const economics::HeadlessTimberPricesView &view = m_session.timberPricesView();
+        if (economics::isPriceOption(prices->control)) {
+            m_out << (view.isChecked(prices->control) ? "1" : "0") << '\n';
+        } else {
+            m_out << view.text(*prices) << '\n';
         }
         return {};
     }

@@ -11,6 +11,9 @@
 //   set frmNPV.NPV_Grid(ROW,COL) TEXT  types TEXT into a cell of the cash flow
 // A switched-off button cannot be pressed. `set CONTROL` alone empties the field.
 // '#' starts a comment. Controls of other windows are named "window.name".
+// `set CONTROL` with no text empties the field; an element of a control array
+// carries its index ("frmTimberPrices.txtTimbVal(13)"); an option button
+// prints 1 when chosen, else 0.
 
 #include "cli/headlesssession.hpp"
 

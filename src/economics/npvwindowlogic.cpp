@@ -74,8 +74,7 @@ void NpvWindowLogic::writeComputedRow(int i) {
     QStringList &row = m_grid.at(static_cast<std::size_t>(i) + 1);
     row[kCfTotalRevenues] = formatNumber(m_cashFlow.matrix(kCfTotalRevenues, i), u"#0");
     row[kCfCashFlow] = formatNumber(m_cashFlow.matrix(kCfCashFlow, i), u"0");
-    row[kCfDiscountedCashFlow] =
-        formatNumber(m_cashFlow.matrix(kCfDiscountedCashFlow, i), u"#0");
+    row[kCfDiscountedCashFlow] = formatNumber(m_cashFlow.matrix(kCfDiscountedCashFlow, i), u"#0");
 }
 
 void NpvWindowLogic::showNetPresentValue() {

@@ -24,8 +24,7 @@ class NpvWindowLogic {
 public:
     /// `cashFlow` and `revenue` are the program's; the window shows and edits them.
     NpvWindowLogic(CashFlow &cashFlow, const TimberRevenue &revenue, shell::ErrorLog &log,
-                   INpvView &view, shell::IInteractive &interactive,
-                   shell::IClipboard &clipboard);
+                   INpvView &view, shell::IInteractive &interactive, shell::IClipboard &clipboard);
 
     /// The window's load: headers, one row per year, the timber revenues, the
     /// values typed so far, the interest rate and the net present value.

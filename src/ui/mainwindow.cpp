@@ -6,6 +6,7 @@
 #include "ui/projectionmodel.hpp"
 #include "ui/stringgridmodel.hpp"
 #include "ui/windowtexts.hpp"
+#include "workflow/mainmessages.hpp"
 #include "workflow/mainwindowlogic.hpp"
 
 #include <QAction>
@@ -266,6 +267,14 @@ QWidget *MainWindow::buildPanel() {
     commands->addWidget(npv, 2, 1);
     commands->addWidget(deleteRows, 3, 1);
     commands->setRowStretch(5, 1);
+    QPushButton *prices =
+        addButton(MainControl::cmdShowTimberPrice, workflow::text::showTimberPrices());
+    commands->addWidget(prices, 4, 1);
+    connect(prices, &QPushButton::clicked, this, [this] {
+        if (m_logic != nullptr) {
+            m_logic->cmdShowTimberPrice_Click();
+        }
+    });
     row->addLayout(commands);
     onClick(MainControl::cmdFinalCut, &workflow::MainWindowLogic::cmdFinalCut_Click);
     onClick(MainControl::cmdSummary, &workflow::MainWindowLogic::cmdSummary_Click);

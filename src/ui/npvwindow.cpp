@@ -171,11 +171,12 @@ void NpvWindow::fitColumns() {
     for (int c = 0; c < m_model->columnCount(); ++c) {
         const QString caption = m_model->headerData(c, Qt::Horizontal).toString();
         const qsizetype paren = caption.indexOf(u'(');
-        const QString widest =
-            paren > 0 ? std::max(caption.left(paren), caption.mid(paren), [&](auto &a, auto &b) {
-                return metrics.horizontalAdvance(a) < metrics.horizontalAdvance(b);
-            })
-                      : caption;
+        const QString widest = paren > 0 ? std::max(caption.left(paren), caption.mid(paren),
+                                                    [&](auto &a, auto &b) {
+                                                        return metrics.horizontalAdvance(a) <
+                                                               metrics.horizontalAdvance(b);
+                                                    })
+                                         : caption;
         m_grid->resizeColumnToContents(c);
         const int width = std::max(m_grid->columnWidth(c), metrics.horizontalAdvance(widest) + 24);
         m_grid->setColumnWidth(c, c == economics::kCfOperation ? std::max(width, 160) : width);

@@ -1,4 +1,5 @@
 #include "ui/thinwindow.hpp"
+#include "ui/controltext.hpp"
 #include "ui/fieldinput.hpp"
 
 #include "thinning/thinwindowlogic.hpp"
@@ -14,7 +15,6 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
-#include <QScreen>
 #include <QVBoxLayout>
 
 namespace arbolex::ui {
@@ -248,33 +248,11 @@ QWidget *ThinWindow::control(ThinControl c) const {
 }
 
 QString ThinWindow::text(ThinControl c) const {
-    QWidget *w = control(c);
-    if (auto *field = qobject_cast<QLineEdit *>(w)) {
-        return field->text();
-    }
-    if (auto *label = qobject_cast<QLabel *>(w)) {
-        return label->text();
-    }
-    if (auto *button = qobject_cast<QAbstractButton *>(w)) {
-        return button->text();
-    }
-    if (auto *box = qobject_cast<QGroupBox *>(w)) {
-        return box->title();
-    }
-    return {};
+    return controlText(control(c));
 }
 
 void ThinWindow::setText(ThinControl c, const QString &value) {
-    QWidget *w = control(c);
-    if (auto *field = qobject_cast<QLineEdit *>(w)) {
-        field->setText(value);
-    } else if (auto *label = qobject_cast<QLabel *>(w)) {
-        label->setText(value);
-    } else if (auto *button = qobject_cast<QAbstractButton *>(w)) {
-        button->setText(value);
-    } else if (auto *box = qobject_cast<QGroupBox *>(w)) {
-        box->setTitle(value);
-    }
+    setControlText(control(c), value);
 }
 
 void ThinWindow::setEnabled(ThinControl c, bool enabled) {
@@ -311,28 +289,7 @@ void ThinWindow::setCaption(const QString &caption) {
 }
 
 void ThinWindow::showCentred() {
-    adjustSize();
-    const QWidget *main = parentWidget();
-    const QScreen *where = main != nullptr ? main->screen() : screen();
-    const QRect available = where->availableGeometry();
-    const QRect over = main != nullptr && main->isVisible() ? main->frameGeometry() : available;
-    // Before its first showing the window has no frame yet: take the main
-    // window's, which the window manager draws alike.
-    QSize frame = frameGeometry().size();
-    if (!isVisible() && main != nullptr && main->isVisible()) {
-        frame += main->frameGeometry().size() - main->size();
-    }
-    QRect placed(QPoint(0, 0), frame);
-    placed.moveCenter(over.center());
-    // Never partly off the screen, whatever the main window's placement.
-    placed.moveLeft(std::clamp(placed.left(), available.left(),
-                               std::max(available.left(), available.right() - placed.width())));
-    placed.moveTop(std::clamp(placed.top(), available.top(),
-                              std::max(available.top(), available.bottom() - placed.height())));
-    move(placed.topLeft());
-    show();
-    raise();
-    activateWindow();
+    showCentredOverParent(this);
 }
 
 void ThinWindow::close() {

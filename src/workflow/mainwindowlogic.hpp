@@ -28,6 +28,7 @@ class IInteractive;
 namespace arbolex::economics {
 class NpvWindowLogic;
 class Prices;
+class TimberPricesWindowLogic;
 } // namespace arbolex::economics
 
 namespace arbolex::thinning {
@@ -72,6 +73,8 @@ public:
     void cmdClear_Click();
     /// Allows or ends changes to the user-defined prices.
     void cmdChangePrices_Click();
+    /// Show Timber Prices: opens the timber prices window.
+    void cmdShowTimberPrice_Click();
     /// Clear All: empties the table and shows the header without money column.
     void ClearAll();
     /// Copies the current table row into the grow-from fields.
@@ -160,6 +163,8 @@ public:
     void attachNpv(economics::NpvWindowLogic *npv) { m_npv = npv; }
     /// The clipboard that the copy commands fill.
     void attachClipboard(shell::IClipboard *clipboard) { m_clipboard = clipboard; }
+    /// The timber prices window's logic that Show Timber Prices opens.
+    void attachTimberPrices(economics::TimberPricesWindowLogic *prices) { m_timberPrices = prices; }
 
     /// The table as the thinning rows change it.
     ProjectionTable &tableForThinning() { return m_table; }
@@ -218,6 +223,7 @@ private:
     thinning::ThinWindowLogic *m_thinning = nullptr;
     economics::NpvWindowLogic *m_npv = nullptr;
     shell::IClipboard *m_clipboard = nullptr;
+    economics::TimberPricesWindowLogic *m_timberPrices = nullptr;
     economics::TimberRevenue m_timberRevenue;
     economics::CashFlow m_cashFlow;
     /// Set by the final cut; no growing or thinning until rows are cleared or deleted.

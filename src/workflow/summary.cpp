@@ -49,7 +49,7 @@ bool MainWindowLogic::FillSummary() {
                 continue;
             }
             TableRow copy = source;
-            copy.label = source.finalCut      ? text::summaryFinalCut()
+            copy.label = source.finalCut       ? text::summaryFinalCut()
                          : source.isThinning() ? text::summaryThinning()
                                                : text::summaryStart();
             m_summary.push_back(std::move(copy));

@@ -1,0 +1,84 @@
+// The timber prices window driven by the headless runner.
+#include "mocks/programservices.hpp"
+
+#include "cli/scriptrunner.hpp"
+
+#include <QSettings>
+#include <QTemporaryDir>
+
+#include <gtest/gtest.h>
+
+namespace arbolex::testing {
+namespace {
+
+/// A session over a copy of the shipped data, loaded as the program loads it.
+class RunnerPricesTest : public ::testing::Test {
+protected:
+    RunnerPricesTest() { session.main().Form_Load(settings, QRect(0, 0, 1280, 800)); }
+
+    QStringList run(const QStringList &lines) {
+        outcome = runner.run(lines);
+        out.flush();
+        return output.split(QLatin1Char('\n'), Qt::SkipEmptyParts);
+    }
+
+    QTemporaryDir dir;
+    bool copied = copyShippedData(dir.path());
+    QString output;
+    QTextStream out{&output};
+    QSettings settings{dir.filePath(QStringLiteral("settings.ini")), QSettings::IniFormat};
+    cli::HeadlessSession session{dir.path(), out};
+    cli::ScriptRunner runner{session, out};
+    cli::ScriptRunner::Outcome outcome;
+};
+
+TEST_F(RunnerPricesTest, EditsChoosesAndPrintsThePrices) {
+    const QStringList lines = run({
+        QStringLiteral("press cmdShowTimberPrice"),
+        QStringLiteral("set frmTimberPrices.txtTimbVal(13) 9"), // refused: no Allow Changes yet
+        QStringLiteral("print frmTimberPrices.txtTimbVal(13)"),
+        QStringLiteral("press frmTimberPrices.cmdChangePrices"),
+        QStringLiteral("print frmTimberPrices.cmdChangePrices"),
+        QStringLiteral("set frmTimberPrices.txtTimbVal(13) 12.5"),
+        QStringLiteral("set frmTimberPrices.txtTimbVal(14)"),
+        QStringLiteral("set frmTimberPrices.txtTimbVal(0) 1"), // refused: current prices
+        QStringLiteral("press frmTimberPrices.cmdChangePrices"),
+        QStringLiteral("print frmTimberPrices.txtTimbVal(13)"),
+        QStringLiteral("print frmTimberPrices.txtTimbVal(14)"),
+        QStringLiteral("print frmTimberPrices.txtTimbVal(0)"),
+        QStringLiteral("press frmTimberPrices.OptUserPrices"),
+        QStringLiteral("print frmTimberPrices.OptUserPrices"),
+        QStringLiteral("print frmTimberPrices.OptCurentPrices"),
+        QStringLiteral("print frmTimberPrices.lblOVRA_TP"),
+        QStringLiteral("press frmTimberPrices.cmdClosePricesList"),
+    });
+    ASSERT_TRUE(outcome.ok()) << outcome.error.toStdString();
+    EXPECT_EQ(lines, (QStringList{QStringLiteral("4.00"), QStringLiteral("Accept Changes"),
+                                  QStringLiteral("12.5"), QStringLiteral("0"),
+                                  QStringLiteral("4.10"), QStringLiteral("1"), QStringLiteral("0"),
+                                  QStringLiteral("Average private sector standing roundwood "
+                                                 "prices (\u20ac / m3) for the period"),
+                                  QStringLiteral("January 2025 to December 2025")}));
+    EXPECT_EQ(session.main().prices().priceSetInUse(), economics::kUserPrices);
+    EXPECT_EQ(session.main().prices().pricesInUse()[0], 12.5);
+    EXPECT_FALSE(session.timberPricesView().isShown());
+}
+
+TEST_F(RunnerPricesTest, RefusesWhatTheWindowDoesNotHave) {
+    struct Case {
+        const char *line;
+        const char *error;
+    };
+    const Case cases[] = {
+        {"set frmTimberPrices.txtTimbVal(52) 1", "no field named 'frmTimberPrices.txtTimbVal(52)'"},
+        {"set frmTimberPrices.lblTimbCat(0) 1", "no field named 'frmTimberPrices.lblTimbCat(0)'"},
+        {"press frmTimberPrices.txtTimbVal(1)", "no command named 'frmTimberPrices.txtTimbVal(1)'"},
+        {"press frmTimberPrices.OptPrices", "no command named 'frmTimberPrices.OptPrices'"},
+    };
+    for (const Case &c : cases) {
+        EXPECT_EQ(runner.runLine(QLatin1String(c.line)), QString::fromUtf8(c.error)) << c.line;
+    }
+}
+
+} // namespace
+} // namespace arbolex::testing
