@@ -90,6 +90,7 @@ void MainWindow::attach(workflow::MainWindowLogic &logic, QSettings &settings) {
             &MainWindow::selectionToLogic);
     fitColumns();
     m_summaryModel = new StringGridModel([&logic] { return logic.summaryGrid(); }, this);
+    m_summaryModel->setGroups([&logic] { return logic.summaryGroups(); });
     // Totals follow the rows of the start, the thinnings and the final cut.
     m_summaryGrid->setModel(m_summaryModel);
 }
@@ -358,10 +359,9 @@ void MainWindow::buildSummaryGrid() {
     m_summaryGrid->setWordWrap(false);
     m_summaryGrid->verticalHeader()->hide();
     m_summaryGrid->verticalHeader()->setDefaultSectionSize(m_grid->fontMetrics().height() + 8);
-    // Captions name their group ("Thinning V/ha"): two lines each.
-    m_summaryGrid->horizontalHeader()->setDefaultAlignment(
-        Qt::Alignment::fromInt(Qt::AlignCenter | Qt::TextWordWrap));
-    m_summaryGrid->horizontalHeader()->setFixedHeight(m_grid->fontMetrics().height() * 2 + 14);
+    // The same two-level header as the projections: groups over captions.
+    m_summaryGrid->setHorizontalHeader(
+        new GroupHeaderView(StringGridModel::GroupRole, m_summaryGrid));
 }
 
 void MainWindow::fitColumns() {
@@ -479,19 +479,35 @@ void MainWindow::fitSummary() {
     boldFont.setBold(true);
     const QFontMetrics bold(boldFont);
     for (int c = 0; c < m_summaryModel->columnCount(); ++c) {
-        // A caption wraps onto two lines ("Thinning" over "V/ha"), so its
-        // group or its own caption, whichever is wider, sets the least width.
-        const QString caption = m_summaryModel->headerData(c, Qt::Horizontal).toString();
-        const qsizetype lastBlank = caption.lastIndexOf(u' ');
-        int widest = lastBlank < 0
-                         ? metrics.horizontalAdvance(caption)
-                         : std::max(metrics.horizontalAdvance(caption.left(lastBlank)),
-                                    metrics.horizontalAdvance(caption.mid(lastBlank + 1)));
+        int widest =
+            metrics.horizontalAdvance(m_summaryModel->headerData(c, Qt::Horizontal).toString());
         for (int r = 0; r < m_summaryModel->rowCount(); ++r) {
             widest = std::max(
                 widest, bold.horizontalAdvance(m_summaryModel->index(r, c).data().toString()));
         }
         m_summaryGrid->setColumnWidth(c, widest + 14);
+    }
+    // A group's band must hold its name: the last column of a narrow group
+    // takes the missing room.
+    const QFontMetrics band(boldFont);
+    const int columns = m_summaryModel->columnCount();
+    for (int first = 0; first < columns;) {
+        const QString group =
+            m_summaryModel->headerData(first, Qt::Horizontal, StringGridModel::GroupRole)
+                .toString();
+        int last = first;
+        int width = m_summaryGrid->columnWidth(first);
+        while (last + 1 < columns &&
+               m_summaryModel->headerData(last + 1, Qt::Horizontal, StringGridModel::GroupRole)
+                       .toString() == group) {
+            ++last;
+            width += m_summaryGrid->columnWidth(last);
+        }
+        const int needed = band.horizontalAdvance(group) + 16;
+        if (width < needed) {
+            m_summaryGrid->setColumnWidth(last, m_summaryGrid->columnWidth(last) + needed - width);
+        }
+        first = last + 1;
     }
 }
 

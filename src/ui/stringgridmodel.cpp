@@ -45,16 +45,25 @@ QVariant StringGridModel::data(const QModelIndex &index, int role) const {
 }
 
 QVariant StringGridModel::headerData(int section, Qt::Orientation orientation, int role) const {
-    if (role != Qt::DisplayRole) {
+    if (orientation == Qt::Vertical) {
+        return role == Qt::DisplayRole ? QVariant(section + 1) : QVariant();
+    }
+    const QString group = m_groups.value(section);
+    if (role == GroupRole) {
+        return group;
+    }
+    if (role != Qt::DisplayRole || m_grid.empty()) {
         return {};
     }
-    if (orientation == Qt::Vertical) {
-        return section + 1;
-    }
-    return m_grid.empty() ? QVariant() : QVariant(m_grid.front().value(section));
+    const QString caption = m_grid.front().value(section);
+    const QString prefix = group + u' ';
+    return !group.isEmpty() && caption.startsWith(prefix) ? caption.mid(prefix.size()) : caption;
 }
 
 void StringGridModel::refresh() {
+    if (m_groupSource) {
+        m_groups = m_groupSource();
+    }
     std::vector<QStringList> next = m_source();
     const bool sameShape = next.size() == m_grid.size() &&
                            (next.empty() || next.front().size() == m_grid.front().size());

@@ -106,6 +106,8 @@ public:
     const std::vector<TableRow> &summaryRows() const { return m_summary; }
     /// The summary as shown: captions first, then its rows.
     std::vector<QStringList> summaryGrid() const;
+    /// The group above each column of the summary ("Thinning" …).
+    QStringList summaryGroups() const;
     bool showingSummary() const { return m_showingSummary; }
     /// Text of the notes shown by Warn().
     QString warnText() const;

@@ -120,18 +120,34 @@ std::vector<QStringList> ProjectionTable::visibleGrid() const {
     return grid;
 }
 
+std::vector<int> ProjectionTable::exportColumns(const std::vector<int> &wanted) const {
+    std::vector<int> columns;
+    for (int c : visibleColumns()) {
+        const bool kept =
+            wanted.empty() || std::find(wanted.begin(), wanted.end(), c) != wanted.end();
+        if (kept && c != kColSeparator1 && c != kColSeparator2 && c != kColSeparator3) {
+            columns.push_back(c);
+        }
+    }
+    return columns;
+}
+
+QStringList ProjectionTable::exportGroups(const std::vector<int> &wanted) const {
+    QStringList groups{QString()};
+    for (int c : exportColumns(wanted)) {
+        groups << groupCaption(c);
+    }
+    return groups;
+}
+
 std::vector<QStringList> ProjectionTable::exportGrid() const {
     return exportGrid(m_rows, QStringLiteral("Row"));
 }
 
 std::vector<QStringList> ProjectionTable::exportGrid(const std::vector<TableRow> &rows,
-                                                     const QString &labelCaption) const {
-    std::vector<int> columns;
-    for (int c : visibleColumns()) {
-        if (c != kColSeparator1 && c != kColSeparator2 && c != kColSeparator3) {
-            columns.push_back(c);
-        }
-    }
+                                                     const QString &labelCaption,
+                                                     const std::vector<int> &wanted) const {
+    const std::vector<int> columns = exportColumns(wanted);
     std::vector<QStringList> grid;
     grid.reserve(rows.size() + 1);
     QStringList header{labelCaption};

@@ -117,9 +117,14 @@ public:
     /// labels, the visible columns without the blank separators, and captions
     /// that name their group ("Thinning N/ha").
     std::vector<QStringList> exportGrid() const;
-    /// The same layout for `rows`, rows of this table's shape (the summary).
+    /// The same layout for `rows`, rows of this table's shape (the summary),
+    /// keeping only `columns` of those the table shows, when given.
     std::vector<QStringList> exportGrid(const std::vector<TableRow> &rows,
-                                        const QString &labelCaption) const;
+                                        const QString &labelCaption,
+                                        const std::vector<int> &columns = {}) const;
+    /// The group above each column of exportGrid(rows, caption, columns):
+    /// none above the row labels, then "Stand", "Main crop", "Thinning" …
+    QStringList exportGroups(const std::vector<int> &columns = {}) const;
 
     int currentRow() const { return m_row; }
     int selectionEnd() const { return m_rowSel; }
@@ -135,6 +140,9 @@ public:
     Removals removalsUpTo(int upTo) const;
 
 private:
+    /// The visible columns among `wanted` (all when empty), without separators.
+    std::vector<int> exportColumns(const std::vector<int> &wanted) const;
+
     std::vector<TableRow> m_rows;
     HeaderLayout m_layout = HeaderLayout::WithMoney;
     int m_row = 0;

@@ -103,8 +103,38 @@ bool MainWindowLogic::FillSummary() {
     return filled;
 }
 
+namespace {
+/// What a rotation is read by: the stand, the removals and their value, total
+/// production and the mean annual increment.
+const std::vector<int> &summaryColumns() {
+    static const std::vector<int> columns = {kColAge,
+                                             kColTopHeight,
+                                             kColStocking,
+                                             kColDbh,
+                                             kColBasalArea,
+                                             kColVolumePerTree,
+                                             kColVolumePerHa,
+                                             kColThinStocking,
+                                             kColThinDbh,
+                                             kColThinBasalArea,
+                                             kColThinVolumePerTree,
+                                             kColThinVolumePerHa,
+                                             kColValuePerHa,
+                                             kColThinTotalVolume,
+                                             kColThinTotalValue,
+                                             kColTotVolumePerHa,
+                                             kColTotVolume,
+                                             kColMai};
+    return columns;
+}
+} // namespace
+
 std::vector<QStringList> MainWindowLogic::summaryGrid() const {
-    return m_table.exportGrid(m_summary, text::summaryLabelCaption());
+    return m_table.exportGrid(m_summary, text::summaryLabelCaption(), summaryColumns());
+}
+
+QStringList MainWindowLogic::summaryGroups() const {
+    return m_table.exportGroups(summaryColumns());
 }
 
 void MainWindowLogic::showSummary(bool summary) {
