@@ -26,8 +26,11 @@ bool PrintingInteractive::askYesNo(const QString &title, const QString &text) {
 HeadlessSession::HeadlessSession(const QString &dataFolder, QTextStream &out)
     : m_log(dataFolder), m_interactive(out), m_report(m_interactive, m_log), m_grow(&m_report),
       m_main(m_grow, m_prices, m_log, dataFolder, m_mainView, m_interactive),
-      m_thin(m_main, m_thinView, m_interactive) {
+      m_thin(m_main, m_thinView, m_interactive), m_assort(m_main, m_assortView, m_interactive),
+      m_assortUser(m_prices.data(), m_assort.session(), m_assortUserView, m_interactive) {
     m_main.attachThinning(&m_thin);
+    m_main.attachAssortments(&m_assort);
+    m_thin.attachAssortments(&m_assort);
 }
 
 } // namespace arbolex::cli

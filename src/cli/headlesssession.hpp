@@ -4,6 +4,9 @@
 // the main window's logic over a headless view. The runner and the grow
 // shortcut of the command-line program drive it.
 
+#include "assortments/assortuserlogic.hpp"
+#include "assortments/assortwindowlogic.hpp"
+#include "assortments/headlessassortview.hpp"
 #include "economics/prices.hpp"
 #include "engine/grow.hpp"
 #include "shell/enginereport.hpp"
@@ -55,6 +58,10 @@ public:
     workflow::HeadlessMainView &mainView() { return m_mainView; }
     thinning::ThinWindowLogic &thinning() { return m_thin; }
     thinning::HeadlessThinView &thinView() { return m_thinView; }
+    assortments::AssortWindowLogic &assort() { return m_assort; }
+    assortments::HeadlessAssortView &assortView() { return m_assortView; }
+    assortments::AssortUserLogic &assortUser() { return m_assortUser; }
+    assortments::HeadlessAssortUserView &assortUserView() { return m_assortUserView; }
     PrintingInteractive &interactive() { return m_interactive; }
 
 private:
@@ -67,6 +74,10 @@ private:
     workflow::MainWindowLogic m_main;
     thinning::HeadlessThinView m_thinView;
     thinning::ThinWindowLogic m_thin;
+    assortments::HeadlessAssortView m_assortView;
+    assortments::AssortWindowLogic m_assort;
+    assortments::HeadlessAssortUserView m_assortUserView;
+    assortments::AssortUserLogic m_assortUser;
 };
 
 } // namespace arbolex::cli

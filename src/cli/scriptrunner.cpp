@@ -1,5 +1,7 @@
 #include "cli/scriptrunner.hpp"
 
+#include "cli/assortscript.hpp"
+
 #include <QFile>
 #include <QSettings>
 #include <QTemporaryDir>
@@ -130,6 +132,9 @@ std::optional<thinning::ThinControl> thinControl(const QString &name) {
 } // namespace
 
 QString ScriptRunner::set(const QString &control, const QString &text) {
+    if (const auto assort = setAssortControl(m_session, control, text)) {
+        return *assort;
+    }
     if (const auto thin = thinControl(control)) {
         if (!thinning::isThinField(*thin)) {
             return QStringLiteral("no field named '") + control + QLatin1Char('\'');
@@ -146,6 +151,9 @@ QString ScriptRunner::set(const QString &control, const QString &text) {
 }
 
 QString ScriptRunner::press(const QString &control) {
+    if (const auto assort = pressAssortControl(m_session, control)) {
+        return *assort;
+    }
     if (const auto thin = thinControl(control)) {
         if (!m_session.thinning().press(*thin)) {
             return QStringLiteral("no command named '") + control + QLatin1Char('\'');
@@ -161,6 +169,9 @@ QString ScriptRunner::press(const QString &control) {
 }
 
 QString ScriptRunner::print(const QString &control) {
+    if (const auto assort = printAssortControl(m_session, control, m_out)) {
+        return *assort;
+    }
     if (control == QLatin1String("flxMain")) {
         for (const QStringList &row : m_session.main().table().visibleGrid()) {
             m_out << row.join(QLatin1Char('\t')) << '\n';

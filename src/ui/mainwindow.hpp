@@ -6,6 +6,7 @@
 
 #include <array>
 
+class QAction;
 class QActionGroup;
 class QLabel;
 class QLineEdit;
@@ -43,6 +44,8 @@ public:
     QTableView *grid() const { return m_grid; }
     ProjectionModel *gridModel() const { return m_model; }
     QActionGroup *modelMenu() const { return m_modelActions; }
+    /// The entry `mnuAssortUser` that opens the user categories window.
+    QAction *assortUserAction() const { return m_assortUserAction; }
 
     // IMainView
     QString text(workflow::MainControl control) const override;
@@ -85,6 +88,7 @@ private:
     std::array<QString, workflow::kMainControlCount> m_absentText;
 
     QActionGroup *m_modelActions = nullptr;
+    QAction *m_assortUserAction = nullptr;
     QTableView *m_grid = nullptr;
     ProjectionModel *m_model = nullptr;
     /// Set while the grid follows the logic, so the change is not sent back.

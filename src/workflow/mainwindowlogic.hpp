@@ -31,6 +31,10 @@ namespace arbolex::thinning {
 class ThinWindowLogic;
 } // namespace arbolex::thinning
 
+namespace arbolex::assortments {
+class AssortWindowLogic;
+} // namespace arbolex::assortments
+
 namespace arbolex::workflow {
 
 /// The grow-from values as read from the fields.
@@ -66,6 +70,8 @@ public:
     void cmdGrow_Click();
     /// Thin: opens the thinning window on the last growth row.
     void cmdThin_Click();
+    /// Assort: the assortment report of the selected growth row.
+    void cmdAssort_Click();
     void cmdClear_Click();
     /// Allows or ends changes to the user-defined prices.
     void cmdChangePrices_Click();
@@ -129,6 +135,8 @@ public:
 
     /// The thinning window's logic that the thin command opens.
     void attachThinning(thinning::ThinWindowLogic *thinning) { m_thinning = thinning; }
+    /// The assortment report window's logic that the assort command opens.
+    void attachAssortments(assortments::AssortWindowLogic *assort) { m_assort = assort; }
 
     /// The table as the thinning rows change it.
     ProjectionTable &tableForThinning() { return m_table; }
@@ -175,6 +183,7 @@ private:
     /// Volume per ha of the last growth row, m³/ha.
     double m_standingVolume = 0.0;
     thinning::ThinWindowLogic *m_thinning = nullptr;
+    assortments::AssortWindowLogic *m_assort = nullptr;
     economics::TimberRevenue m_timberRevenue;
 };
 
