@@ -154,6 +154,20 @@ TEST_F(AssortTest, RowsFollowTheRequestsInKindOrderEachOnce) {
     EXPECT_TRUE(assort.session().pending.isEmpty());
 }
 
+TEST_F(AssortTest, ReopenedThinningReportsTheActualCropAfter) {
+    previewThinning();
+    thin.cmdAccept_Click();
+    logic.cmdThin_Click(); // the thinning row is the last row: it opens again
+    interactive.questions.clear();
+    ASSERT_TRUE(thin.flags().editingExisting);
+    thin.cmdAssort_Click(2);
+    EXPECT_EQ(assortView.text(AssortControl::lblDesc),
+              QStringLiteral("Post-[Actual]-Thin Crop assortment"));
+    assort.cmdAccept_Click();
+    thin.cmdAccept_Click();
+    EXPECT_EQ(labelsAfterThinning(), QStringList{QStringLiteral("AP yr")});
+}
+
 TEST_F(AssortTest, RemovalRowAddsUpToTheRemovedVolume) {
     previewThinning(QStringLiteral("60"));
     thin.cmdAssort_Click(1);

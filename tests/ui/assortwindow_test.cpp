@@ -63,7 +63,8 @@ TEST_F(AssortWindowGuiTest, AssortButtonReportsTheSelectedGrowthRow) {
     logic.select(3, 3);
     auto *assortButton = qobject_cast<QPushButton *>(window.control(MainControl::cmdAssort));
     ASSERT_NE(assortButton, nullptr);
-    EXPECT_EQ(assortButton->toolTip(), QStringLiteral("Predict crop assortment in non-thin years."));
+    EXPECT_EQ(assortButton->toolTip(),
+              QStringLiteral("Predict crop assortment in non-thin years."));
     click(assortButton);
     ASSERT_TRUE(interactive.messages.isEmpty());
     EXPECT_TRUE(assortWindow.isVisible());
@@ -77,7 +78,8 @@ TEST_F(AssortWindowGuiTest, AssortButtonReportsTheSelectedGrowthRow) {
 TEST_F(AssortWindowGuiTest, ThinningButtonsKeepReportsAsRowsSpanningTheGrid) {
     growTo(QStringLiteral("30"));
     click(window.control(MainControl::cmdThin));
-    qobject_cast<QLineEdit *>(thinWindow.control(ThinControl::txtRemV))->setText(QStringLiteral("60"));
+    qobject_cast<QLineEdit *>(thinWindow.control(ThinControl::txtRemV))
+        ->setText(QStringLiteral("60"));
     click(thinWindow.control(ThinControl::cmdThin));
     for (int kind : {2, 1}) {
         click(thinWindow.assortButton(kind));
