@@ -46,7 +46,6 @@ AssortWindow::AssortWindow(QWidget *parent) : QDialog(parent) {
     m_userTable->setEditTriggers(QAbstractItemView::NoEditTriggers);
     m_userTable->setSelectionMode(QAbstractItemView::NoSelection);
     m_userTable->verticalHeader()->hide();
-    m_userTable->horizontalHeader()->setSectionResizeMode(QHeaderView::ResizeToContents);
     m_userTable->setAlternatingRowColors(true);
     m_userTable->setFocusPolicy(Qt::NoFocus);
     m_userTable->hide();
