@@ -90,3 +90,20 @@ export SHOT="$out/timber-prices.png"
 rm -f "${SHOT%.png}-window.png"
 shoot timber-prices --no-intro --demo-prices
 export WINDOW_TITLE=
+# Assortments: the report of a growth row at 35, the report of the trees a
+# 60 m³/ha thinning at 30 removes, the user categories window and a report
+# over the categories in use, and the main window with the assortment rows
+# of an accepted thinning.
+export WINDOW_TITLE="Assortment at age"
+for stage in growth thinning user-report; do
+    export SHOT="$out/assort-$stage.png"
+    rm -f "${SHOT%.png}-window.png"
+    shoot "assort-$stage" --no-intro --demo-assort "$stage"
+done
+export WINDOW_TITLE="User assortment categories"
+export SHOT="$out/assort-user.png"
+rm -f "${SHOT%.png}-window.png"
+shoot assort-user --no-intro --demo-assort user
+export WINDOW_TITLE=
+export SHOT="$out/main-assort-rows.png"
+shoot main-assort-rows --no-intro --demo-assort rows

@@ -1,6 +1,8 @@
 // ARBOLEX: the desktop program. Builds the engine, the prices, the main window
 // and the thinning window with their logic, loads the main window, then lets
 // the user choose the model in the model choice window.
+#include "assortments/assortuserlogic.hpp"
+#include "assortments/assortwindowlogic.hpp"
 #include "economics/npvwindowlogic.hpp"
 #include "economics/prices.hpp"
 #include "economics/timberpriceswindowlogic.hpp"
@@ -9,6 +11,8 @@
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
 #include "thinning/thinwindowlogic.hpp"
+#include "ui/assortuserwindow.hpp"
+#include "ui/assortwindow.hpp"
 #include "ui/mainwindow.hpp"
 #include "ui/modelchoicedialog.hpp"
 #include "ui/npvwindow.hpp"
@@ -19,6 +23,7 @@
 #include "ui/windowtexts.hpp"
 #include "workflow/mainwindowlogic.hpp"
 
+#include <QAction>
 #include <QApplication>
 #include <QCommandLineParser>
 #include <QScreen>
@@ -121,6 +126,60 @@ bool demoRotation(MainWindowLogic &logic, ThinWindowLogic &thin,
     return true;
 }
 
+/// The assortment demonstrations:
+///   growth    the report of the growth row at 35 of the grown stand;
+///   thinning  the report of the trees a 60 m³/ha thinning at 30 removes;
+///   rows      that thinning accepted with its three reports kept, then grown
+///             on to 50, so the assortment rows are in view;
+///   user      the user categories window with four categories in use;
+///   user-report  the report of the growth row at 35 over those categories.
+/// False for an unknown stage.
+bool demoAssort(MainWindowLogic &logic, ThinWindowLogic &thin,
+                arbolex::assortments::AssortWindowLogic &assort,
+                arbolex::assortments::AssortUserLogic &user, const QString &stage) {
+    using arbolex::assortments::AssortControl;
+    using arbolex::assortments::AssortUserControl;
+    if (stage == QLatin1String("growth")) {
+        demoGrow(logic);
+        logic.select(5, 5);
+        logic.cmdAssort_Click();
+        return true;
+    }
+    if (stage == QLatin1String("thinning") || stage == QLatin1String("rows")) {
+        demoGrow(logic, QStringLiteral("30"));
+        logic.cmdThin_Click();
+        thin.typeText(ThinControl::txtRemV, QStringLiteral("60"));
+        thin.press(ThinControl::cmdThin);
+        if (stage == QLatin1String("thinning")) {
+            thin.cmdAssort_Click(1);
+            return true;
+        }
+        for (int kind = 0; kind < 3; ++kind) {
+            thin.cmdAssort_Click(kind);
+            assort.press(AssortControl::cmdAccept);
+        }
+        thin.press(ThinControl::cmdAccept);
+        logic.typeText(MainControl::txtToA, QStringLiteral("50"));
+        logic.cmdGrow_Click();
+        return true;
+    }
+    if (stage == QLatin1String("user") || stage == QLatin1String("user-report")) {
+        demoGrow(logic);
+        user.mnuAssortUser_Click();
+        for (const int index : {1, 2, 3, 4}) {
+            user.press(AssortUserControl::chkUse, index);
+        }
+        user.press(AssortUserControl::chkUserCategories, 0);
+        if (stage == QLatin1String("user-report")) {
+            user.press(AssortUserControl::cmdOK, 0);
+            logic.select(5, 5);
+            logic.cmdAssort_Click();
+        }
+        return true;
+    }
+    return false;
+}
+
 /// The options of the command line.
 struct Options {
     explicit Options(QCommandLineParser &parser) {
@@ -137,6 +196,8 @@ struct Options {
         parser.addOption(demoRotation);
         demoPrices.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(demoPrices);
+        demoAssort.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(demoAssort);
         quitWhenShown.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(quitWhenShown);
     }
@@ -155,6 +216,8 @@ struct Options {
                                     QStringLiteral("STAGE")};
     /// Opens the timber prices window, as Show Timber Prices does.
     QCommandLineOption demoPrices{QStringLiteral("demo-prices")};
+    QCommandLineOption demoAssort{QStringLiteral("demo-assort"), QString(),
+                                  QStringLiteral("STAGE")};
     /// Ends the program once the main window is on screen: start-up is timed with it.
     QCommandLineOption quitWhenShown{QStringLiteral("quit-when-shown")};
 };
@@ -228,6 +291,19 @@ int main(int argc, char *argv[]) {
     arbolex::economics::TimberPricesWindowLogic pricesLogic(prices, log, pricesWindow);
     pricesWindow.attach(pricesLogic);
     logic.attachTimberPrices(&pricesLogic);
+    // The assortment report opens over whichever window asked for it; the
+    // user categories window from the main window's menu.
+    arbolex::ui::AssortWindow assortWindow(&window);
+    arbolex::assortments::AssortWindowLogic assortLogic(logic, assortWindow, interactive);
+    assortWindow.attach(assortLogic);
+    logic.attachAssortments(&assortLogic);
+    thinLogic.attachAssortments(&assortLogic);
+    arbolex::ui::AssortUserWindow assortUserWindow(&window);
+    arbolex::assortments::AssortUserLogic assortUserLogic(prices.data(), assortLogic.session(),
+                                                          assortUserWindow, interactive);
+    assortUserWindow.attach(assortUserLogic);
+    QObject::connect(window.assortUserAction(), &QAction::triggered, &window,
+                     [&assortUserLogic] { assortUserLogic.mnuAssortUser_Click(); });
     logic.Form_Load(settings, QGuiApplication::primaryScreen()->availableGeometry());
 
     if (parser.isSet(options.demoRotation)) {
@@ -238,6 +314,13 @@ int main(int argc, char *argv[]) {
         QTimer::singleShot(0, &window, [&logic, &thinLogic, &npvLogic, stage] {
             if (!demoRotation(logic, thinLogic, npvLogic, stage)) {
                 qWarning("unknown rotation demonstration: %s", qPrintable(stage));
+            }
+        });
+    } else if (parser.isSet(options.demoAssort)) {
+        const QString stage = parser.value(options.demoAssort);
+        QTimer::singleShot(0, &window, [&, stage] {
+            if (!demoAssort(logic, thinLogic, assortLogic, assortUserLogic, stage)) {
+                qWarning("unknown assortment demonstration: %s", qPrintable(stage));
             }
         });
     } else if (parser.isSet(options.demoThin)) {

@@ -46,5 +46,6 @@ Command projectCommand();
 Command thinCommand();
 Command growCommand();
 Command runCommand();
+Command assortCommand();
 
 } // namespace arbolex::cli

@@ -28,11 +28,15 @@ HeadlessSession::HeadlessSession(const QString &dataFolder, QTextStream &out)
       m_main(m_grow, m_prices, m_log, dataFolder, m_mainView, m_interactive),
       m_thin(m_main, m_thinView, m_interactive),
       m_npv(m_main.cashFlow(), m_main.timberRevenue(), m_log, m_npvView, m_interactive,
-            m_clipboard) {
+            m_clipboard),
+      m_assort(m_main, m_assortView, m_interactive),
+      m_assortUser(m_prices.data(), m_assort.session(), m_assortUserView, m_interactive) {
     m_main.attachThinning(&m_thin);
     m_main.attachNpv(&m_npv);
     m_main.attachClipboard(&m_clipboard);
     m_main.attachTimberPrices(&m_timberPrices);
+    m_main.attachAssortments(&m_assort);
+    m_thin.attachAssortments(&m_assort);
 }
 
 } // namespace arbolex::cli

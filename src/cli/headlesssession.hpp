@@ -4,6 +4,9 @@
 // the main window's logic over a headless view. The runner and the grow
 // shortcut of the command-line program drive it.
 
+#include "assortments/assortuserlogic.hpp"
+#include "assortments/assortwindowlogic.hpp"
+#include "assortments/headlessassortview.hpp"
 #include "economics/headlesstimberpricesview.hpp"
 #include "economics/inpvview.hpp"
 #include "economics/npvwindowlogic.hpp"
@@ -60,6 +63,10 @@ public:
     workflow::HeadlessMainView &mainView() { return m_mainView; }
     thinning::ThinWindowLogic &thinning() { return m_thin; }
     thinning::HeadlessThinView &thinView() { return m_thinView; }
+    assortments::AssortWindowLogic &assort() { return m_assort; }
+    assortments::HeadlessAssortView &assortView() { return m_assortView; }
+    assortments::AssortUserLogic &assortUser() { return m_assortUser; }
+    assortments::HeadlessAssortUserView &assortUserView() { return m_assortUserView; }
     PrintingInteractive &interactive() { return m_interactive; }
     economics::NpvWindowLogic &npv() { return m_npv; }
     economics::HeadlessNpvView &npvView() { return m_npvView; }
@@ -82,6 +89,10 @@ private:
     economics::NpvWindowLogic m_npv;
     economics::HeadlessTimberPricesView m_timberPricesView;
     economics::TimberPricesWindowLogic m_timberPrices{m_prices, m_log, m_timberPricesView};
+    assortments::HeadlessAssortView m_assortView;
+    assortments::AssortWindowLogic m_assort;
+    assortments::HeadlessAssortUserView m_assortUserView;
+    assortments::AssortUserLogic m_assortUser;
 };
 
 } // namespace arbolex::cli

@@ -27,6 +27,8 @@ public:
 
     bool has(const char *name) const;
 
+    /// The value as typed (a file name). Throws UsageError when the option is absent.
+    QString text(const char *name) const { return value(name); }
     /// A finite number. Throws UsageError when the option is absent or its
     /// value is not a number.
     double number(const char *name) const;

@@ -1,5 +1,6 @@
 #include "cli/scriptrunner.hpp"
 
+#include "cli/assortscript.hpp"
 #include "shell/tableexport.hpp"
 
 #include <QFile>
@@ -205,6 +206,9 @@ QString ScriptRunner::set(const QString &control, const QString &text) {
         m_session.timberPrices().typeText(prices->index, text);
         return {};
     }
+    if (const auto assort = setAssortControl(m_session, control, text)) {
+        return *assort;
+    }
     if (const auto thin = thinControl(control)) {
         if (!thinning::isThinField(*thin)) {
             return QStringLiteral("no field named '") + control + QLatin1Char('\'');
@@ -226,6 +230,9 @@ QString ScriptRunner::press(const QString &control) {
             return QStringLiteral("no command named '") + control + QLatin1Char('\'');
         }
         return {};
+    }
+    if (const auto assort = pressAssortControl(m_session, control)) {
+        return *assort;
     }
     if (const auto thin = thinControl(control)) {
         if (!m_session.thinning().press(*thin)) {
@@ -253,6 +260,9 @@ QString ScriptRunner::press(const QString &control) {
 }
 
 QString ScriptRunner::print(const QString &control) {
+    if (const auto assort = printAssortControl(m_session, control, m_out)) {
+        return *assort;
+    }
     if (control == QLatin1String("flxMain")) {
         for (const QStringList &row : m_session.main().table().visibleGrid()) {
             m_out << row.join(QLatin1Char('\t')) << '\n';

@@ -6,12 +6,14 @@
 // coefficient sets and never ask which model is active (except the volume
 // correction factor and the assortment calculation).
 
+#include "engine/assortment.hpp"
 #include "engine/catalogue.hpp"
 #include "engine/report.hpp"
 #include "engine/standstate.hpp"
 
 #include <array>
 #include <cstdint>
+#include <span>
 #include <string>
 #include <vector>
 
@@ -132,6 +134,29 @@ public:
     /// Newton iteration limit.
     static constexpr int kNewtonIterationLimit = 100;
 
+    // ---- Assortments (docs/assortments.md) -------------------------------
+
+    /// Class bounds of the categories, cm: each widened by −0.5 below and
+    /// +0.499 above (big-end 0: no upper limit); no categories give the three
+    /// fixed classes. Bad bounds show "ERROR - Non-recoverable AsmtG
+    /// calculation error" and return false.
+    bool AsmtG(std::span<const AssortmentCategory> categories, AssortmentBounds &bounds);
+
+    /// The active model's volume-ratio expression exp(b1 · (t/d)^b2), taken
+    /// over the stand's diameter distribution (basal area G, m²/ha, stocking
+    /// N, stems/ha) at every class bound. A failure shows "ERROR -
+    /// Non-recoverable AsmtH calculation error" and returns false.
+    bool AsmtH(float G, float N, const AssortmentBounds &bounds, AssortmentRatios &ratios);
+
+    /// Volume per hectare of the stand (G, N, top height H, m) in each
+    /// category, or in the fixed classes 7-14, 14-20 and >20 cm when no
+    /// category is given; the classes are shares of GetV7. Returns the
+    /// success flag; on failure `result` is empty and "ERROR -
+    /// Non-recoverable Assortment calculation error." has been shown (after
+    /// AsmtG's or AsmtH's own message when one of them failed).
+    bool AsmtB(float G, float N, float H, std::span<const AssortmentCategory> categories,
+               Assortment &result);
+
 private:
     /// The transformed state z. Kept in double: z2 + S5 can be a small
     /// difference of large numbers (1/N − S5 for some models), which single
@@ -168,6 +193,8 @@ private:
     void reportFault(const RuntimeFault &fault, std::string_view title, std::string_view lead,
                      std::string_view mark);
     void showMessage(std::string_view title, std::string_view text, int style);
+    /// Shows one of the assortment calculation's failure messages and logs it.
+    void assortmentFailure(std::string_view text, std::string_view mark);
 
     IEngineReport *m_report = nullptr;
 

@@ -1,5 +1,6 @@
 // Accepting a thinning: the thinning record, the thinning row of the
 // projection table, its value, and the thinned stand as the new grow-from.
+#include "assortments/assortwindowlogic.hpp"
 #include "economics/pricelookup.hpp"
 #include "economics/prices.hpp"
 #include "shell/apperror.hpp"
@@ -81,6 +82,9 @@ void ThinWindowLogic::cmdAccept_Click() {
             thinRow = table.append(std::move(thinning));
         }
         WriteThinLine(workflow::text::rowLabelThinning(), thinRow);
+        if (m_assort != nullptr) {
+            m_assort->appendPendingRows(w, record.age);
+        }
         table.select(thinRow, thinRow);
         SetGrowFromAfterThin();
         if (!m_flags.loopUnderWay) {

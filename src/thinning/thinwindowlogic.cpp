@@ -2,6 +2,7 @@
 // prescription, solving it with the thinning response and showing it.
 #include "thinning/thinwindowlogic.hpp"
 
+#include "assortments/assortwindowlogic.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
@@ -81,6 +82,9 @@ void ThinWindowLogic::emptyResultColumns() {
 void ThinWindowLogic::frmThinLoad() {
     shell::guard(m_main.errorLog(), QStringLiteral(" in Misc.frmThinLoad()"), [&] {
         m_flags.editingExisting = false;
+        if (m_assort != nullptr) {
+            m_assort->session().pending.clear();
+        }
         const int row = m_main.table().currentRow();
         if (row < 1) {
             return;

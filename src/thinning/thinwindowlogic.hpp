@@ -14,6 +14,10 @@ namespace arbolex::shell {
 class IInteractive;
 }
 
+namespace arbolex::assortments {
+class AssortWindowLogic;
+}
+
 namespace arbolex::workflow {
 class MainWindowLogic;
 struct RowRecord;
@@ -68,6 +72,13 @@ public:
     /// Writes the thinned row's stand into the grow-from fields.
     void SetGrowFromAfterThin();
 
+    // ---- Assortments -------------------------------------------------------------------
+
+    /// Assort button `index` (0 pre-thin, 1 thinning, 2 post-thin): the
+    /// report of that stand of the working state, asked for as a row.
+    void cmdAssort_Click(int index);
+    void attachAssortments(assortments::AssortWindowLogic *assort) { m_assort = assort; }
+
     // ---- The loop -----------------------------------------------------------------------
 
     void chkActivLoop_Click();
@@ -102,6 +113,7 @@ private:
     IThinView &m_view;
     shell::IInteractive &m_interactive;
     ThinningWork m_work;
+    assortments::AssortWindowLogic *m_assort = nullptr;
     ThinningFlags m_flags;
     /// Ratios post / pre of the last method-1 preview.
     float m_ratioBasalArea = 1.0f;

@@ -1,6 +1,7 @@
 #include "ui/mainwindow.hpp"
 #include "ui/fieldinput.hpp"
 
+#include "assortments/assortmessages.hpp"
 #include "engine/catalogue.hpp"
 #include "ui/groupheaderview.hpp"
 #include "ui/projectionmodel.hpp"
@@ -138,6 +139,9 @@ void MainWindow::buildMenus() {
             m_logic->cmdDeleteRows_Click();
         }
     });
+    QMenu *assortMenu = menuBar()->addMenu(assortments::text::menuAssortments());
+    m_assortUserAction = assortMenu->addAction(assortments::text::userMenu());
+    m_assortUserAction->setObjectName(QStringLiteral("mnuAssortUser"));
 
     QMenu *help = menuBar()->addMenu(text::menuHelp());
     connect(help->addAction(text::menuThreshold()), &QAction::triggered, this, [this] {
@@ -243,6 +247,8 @@ QWidget *MainWindow::buildPanel() {
     // Only thinned models offer the thin command: the logic enables it.
     QPushButton *thin = addButton(MainControl::cmdThin, text::buttonThin());
     thin->setToolTip(text::hintThin());
+    QPushButton *assort = addButton(MainControl::cmdAssort, assortments::text::mainAssortButton());
+    assort->setToolTip(assortments::text::mainAssortHint());
     QPushButton *useRow = addButton(MainControl::cmdUseRow, text::buttonUseRow());
     useRow->setToolTip(text::hintUseRow());
     QPushButton *clear = addButton(MainControl::cmdClear, text::buttonClear());
@@ -260,14 +266,15 @@ QWidget *MainWindow::buildPanel() {
     deleteRows->setToolTip(text::hintDeleteRows());
     commands->addWidget(grow, 0, 0);
     commands->addWidget(thin, 1, 0);
-    commands->addWidget(useRow, 2, 0);
-    commands->addWidget(clear, 3, 0);
-    commands->addWidget(clearAll, 4, 0);
+    commands->addWidget(assort, 2, 0);
+    commands->addWidget(useRow, 3, 0);
+    commands->addWidget(clear, 4, 0);
+    commands->addWidget(clearAll, 5, 0);
     commands->addWidget(finalCut, 0, 1);
     commands->addWidget(summary, 1, 1);
     commands->addWidget(npv, 2, 1);
     commands->addWidget(deleteRows, 3, 1);
-    commands->setRowStretch(5, 1);
+    commands->setRowStretch(6, 1);
     QPushButton *prices =
         addButton(MainControl::cmdShowTimberPrice, workflow::text::showTimberPrices());
     commands->addWidget(prices, 4, 1);
@@ -292,6 +299,11 @@ QWidget *MainWindow::buildPanel() {
             m_logic->cmdThin_Click();
         }
     });
+    connect(assort, &QPushButton::clicked, this, [this] {
+        if (m_logic != nullptr) {
+            m_logic->cmdAssort_Click();
+        }
+    });
     connect(useRow, &QPushButton::clicked, this, [this] {
         if (m_logic != nullptr) {
             m_logic->UseFlxRow();
@@ -309,13 +321,25 @@ QWidget *MainWindow::buildPanel() {
     });
 
     // Keyboard order follows the stand description, then the projection.
-    const MainControl order[] = {
-        MainControl::txtFromA,    MainControl::txtFromN,     MainControl::txtFromH,
-        MainControl::txtFromB,    MainControl::txtFromD,     MainControl::txtToA,
-        MainControl::txtByA,      MainControl::txtNetArea,   MainControl::cmdGrow,
-        MainControl::cmdThin,     MainControl::cmdUseRow,    MainControl::cmdClear,
-        MainControl::cmdClearAll, MainControl::cmdFinalCut,  MainControl::cmdSummary,
-        MainControl::cmdNPV,      MainControl::cmdDeleteRows};
+    const MainControl order[] = {MainControl::txtFromA,
+                                 MainControl::txtFromN,
+                                 MainControl::txtFromH,
+                                 MainControl::txtFromB,
+                                 MainControl::txtFromD,
+                                 MainControl::txtToA,
+                                 MainControl::txtByA,
+                                 MainControl::txtNetArea,
+                                 MainControl::cmdGrow,
+                                 MainControl::cmdThin,
+                                 MainControl::cmdAssort,
+                                 MainControl::cmdUseRow,
+                                 MainControl::cmdClear,
+                                 MainControl::cmdClearAll,
+                                 MainControl::cmdFinalCut,
+                                 MainControl::cmdSummary,
+                                 MainControl::cmdNPV,
+                                 MainControl::cmdDeleteRows,
+                                 MainControl::cmdShowTimberPrice};
     for (std::size_t i = 1; i < std::size(order); ++i) {
         setTabOrder(control(order[i - 1]), control(order[i]));
     }
@@ -365,6 +389,7 @@ void MainWindow::buildSummaryGrid() {
 }
 
 void MainWindow::fitColumns() {
+    m_model->spanTextRows(*m_grid);
     QHeaderView *header = m_grid->horizontalHeader();
     const int minimum = m_grid->fontMetrics().horizontalAdvance(QString(4, u'0')) + 10;
     for (int c = 0; c < m_model->columnCount(); ++c) {

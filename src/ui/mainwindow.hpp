@@ -6,6 +6,7 @@
 
 #include <array>
 
+class QAction;
 class QActionGroup;
 class QLabel;
 class QLineEdit;
@@ -46,6 +47,8 @@ public:
     QTableView *summaryGrid() const { return m_summaryGrid; }
     ProjectionModel *gridModel() const { return m_model; }
     QActionGroup *modelMenu() const { return m_modelActions; }
+    /// The entry `mnuAssortUser` that opens the user categories window.
+    QAction *assortUserAction() const { return m_assortUserAction; }
 
     // IMainView
     QString text(workflow::MainControl control) const override;
@@ -94,6 +97,7 @@ private:
     std::array<QString, workflow::kMainControlCount> m_absentText;
 
     QActionGroup *m_modelActions = nullptr;
+    QAction *m_assortUserAction = nullptr;
     QTableView *m_grid = nullptr;
     ProjectionModel *m_model = nullptr;
     QTableView *m_summaryGrid = nullptr;

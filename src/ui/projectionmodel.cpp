@@ -3,6 +3,7 @@
 #include <QBrush>
 #include <QColor>
 #include <QFont>
+#include <QSize>
 
 namespace arbolex::ui {
 
@@ -26,6 +27,10 @@ QColor finalCutTint() {
 /// Rows of a projection that failed half-way.
 QColor failedTint() {
     return {0xf4, 0xd3, 0xd0};
+}
+/// Assortment rows ("AC yr", "AT yr", "AP yr"): reports, not stands.
+QColor assortmentTint() {
+    return {0xdd, 0xea, 0xf4};
 }
 QColor separatorTint() {
     return {0xd8, 0xdc, 0xd4};
@@ -52,6 +57,9 @@ QVariant ProjectionModel::data(const QModelIndex &index, int role) const {
     const workflow::TableRow &row = m_table.row(index.row() + 1);
     const int column = tableColumn(index.column());
     const bool separator = isSeparator(index.column());
+    if (row.isText() && index.column() > 0) {
+        return textRowData(row, index.column(), role);
+    }
     switch (role) {
     case Qt::DisplayRole:
         // A separator's cell may hold the summary's marker: blank on screen.
@@ -88,6 +96,48 @@ QVariant ProjectionModel::data(const QModelIndex &index, int role) const {
         return separator;
     default:
         return {};
+    }
+}
+
+QVariant ProjectionModel::textRowData(const workflow::TableRow &row, int column, int role) const {
+    switch (role) {
+    case Qt::DisplayRole: {
+        // The report reads as one line across the row (item column 1 spans it).
+        if (column != 1) {
+            return {};
+        }
+        QStringList parts;
+        for (int c = 1; c < columnCount(); ++c) {
+            const QString cell = row.cells.value(tableColumn(c));
+            if (!cell.isEmpty()) {
+                parts << cell;
+            }
+        }
+        return parts.join(QStringLiteral("    "));
+    }
+    case Qt::TextAlignmentRole:
+        return QVariant::fromValue(Qt::AlignLeft | Qt::AlignVCenter);
+    case Qt::SizeHintRole:
+        // The line must not widen the columns of the stands under it.
+        return QSize(0, 0);
+    case Qt::BackgroundRole:
+        return QBrush(assortmentTint());
+    case Qt::FontRole: {
+        QFont italic;
+        italic.setItalic(true);
+        return italic;
+    }
+    default:
+        return {};
+    }
+}
+
+void ProjectionModel::spanTextRows(QTableView &view) const {
+    view.clearSpans();
+    for (int r = 0; r < m_rows; ++r) {
+        if (isTextRow(r) && columnCount() > 2) {
+            view.setSpan(r, 1, 1, columnCount() - 1);
+        }
     }
 }
 

@@ -3,6 +3,7 @@
 #include "workflow/projectiontable.hpp"
 
 #include <QAbstractTableModel>
+#include <QTableView>
 
 #include <vector>
 
@@ -37,8 +38,15 @@ public:
     int tableColumn(int column) const { return m_columns.at(static_cast<std::size_t>(column)); }
     /// True for the narrow, blank columns between the column groups.
     bool isSeparator(int column) const;
+    /// True for an assortment row (item row `row`): a report, not a stand.
+    bool isTextRow(int row) const { return m_table.row(row + 1).isText(); }
+    /// Lets every assortment row of `view` run as one cell from item column
+    /// 1 to the last, which shows the whole report.
+    void spanTextRows(QTableView &view) const;
 
 private:
+    QVariant textRowData(const workflow::TableRow &row, int column, int role) const;
+
     const workflow::ProjectionTable &m_table;
     /// What the views were last told: the data rows and the visible columns.
     int m_rows = 0;

@@ -2,6 +2,7 @@
 #include "ui/controltext.hpp"
 #include "ui/fieldinput.hpp"
 
+#include "assortments/assortmessages.hpp"
 #include "thinning/thinwindowlogic.hpp"
 #include "ui/windowtexts.hpp"
 #include "workflow/mainwindowlogic.hpp"
@@ -168,6 +169,22 @@ QWidget *ThinWindow::buildDetails() {
             grid->addWidget(cell, r, static_cast<int>(c) + 1, Qt::AlignHCenter);
         }
         ++r;
+    }
+    // One Assort button under each column: the crop before, the removal, the crop after.
+    grid->addWidget(new QLabel(assortments::text::thinAssortRow(), box), r, 0);
+    for (int c = 0; c < 3; ++c) {
+        auto *button = new QPushButton(assortments::text::thinAssortButton(), box);
+        button->setObjectName(QStringLiteral("cmdAssort(%1)").arg(c));
+        button->setToolTip(assortments::text::thinAssortHint(c));
+        button->setAutoDefault(false);
+        button->setFixedWidth(m_controls.at(slot(ThinControl::lblPreN))->width());
+        connect(button, &QPushButton::clicked, this, [this, c] {
+            if (m_logic != nullptr) {
+                m_logic->cmdAssort_Click(c);
+            }
+        });
+        m_assortButtons.at(static_cast<std::size_t>(c)) = button;
+        grid->addWidget(button, r, c + 1, Qt::AlignHCenter);
     }
     grid->setColumnMinimumWidth(0, box->fontMetrics().horizontalAdvance(text::rowThinBasalArea()) +
                                        12);

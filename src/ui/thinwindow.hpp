@@ -31,6 +31,11 @@ public:
     /// Binds the window to its logic, which must outlive the window.
     void attach(thinning::ThinWindowLogic &logic);
 
+    /// Assort button `index` (0 pre-thin, 1 thinning, 2 post-thin).
+    QPushButton *assortButton(int index) const {
+        return m_assortButtons.at(static_cast<std::size_t>(index));
+    }
+
     /// The widget of a control (the group box for `fraLoop`).
     QWidget *control(thinning::ThinControl control) const;
 
@@ -74,6 +79,7 @@ private:
     /// Captions inside the loop frame, greyed with the frame (the switch
     /// itself stays live, or the loop could never be switched on again).
     std::array<QLabel *, 2> m_loopCaptions{};
+    std::array<QPushButton *, 3> m_assortButtons{};
 };
 
 } // namespace arbolex::ui

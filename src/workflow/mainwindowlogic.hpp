@@ -35,6 +35,10 @@ namespace arbolex::thinning {
 class ThinWindowLogic;
 } // namespace arbolex::thinning
 
+namespace arbolex::assortments {
+class AssortWindowLogic;
+} // namespace arbolex::assortments
+
 namespace arbolex::workflow {
 
 /// The grow-from values as read from the fields.
@@ -70,6 +74,8 @@ public:
     void cmdGrow_Click();
     /// Thin: opens the thinning window on the last growth row.
     void cmdThin_Click();
+    /// Assort: the assortment report of the selected growth row.
+    void cmdAssort_Click();
     void cmdClear_Click();
     /// Allows or ends changes to the user-defined prices.
     void cmdChangePrices_Click();
@@ -167,6 +173,8 @@ public:
     void attachClipboard(shell::IClipboard *clipboard) { m_clipboard = clipboard; }
     /// The timber prices window's logic that Show Timber Prices opens.
     void attachTimberPrices(economics::TimberPricesWindowLogic *prices) { m_timberPrices = prices; }
+    /// The assortment report window's logic that the assort command opens.
+    void attachAssortments(assortments::AssortWindowLogic *assort) { m_assort = assort; }
 
     /// The table as the thinning rows change it.
     ProjectionTable &tableForThinning() { return m_table; }
@@ -226,6 +234,7 @@ private:
     economics::NpvWindowLogic *m_npv = nullptr;
     shell::IClipboard *m_clipboard = nullptr;
     economics::TimberPricesWindowLogic *m_timberPrices = nullptr;
+    assortments::AssortWindowLogic *m_assort = nullptr;
     economics::TimberRevenue m_timberRevenue;
     economics::CashFlow m_cashFlow;
     /// Set by the final cut; no growing or thinning until rows are cleared or deleted.

@@ -1,10 +1,9 @@
 // The command-line program, run as a user runs it: its tables, its exit
 // statuses and what it writes to stderr and to the error log.
+#include "cli/clirun.hpp"
 #include "mocks/qtprinters.hpp"
 
 #include <QFile>
-#include <QProcess>
-#include <QProcessEnvironment>
 #include <QTemporaryDir>
 
 #include <gtest/gtest.h>
@@ -14,28 +13,12 @@
 
 namespace {
 
-struct Outcome {
-    int exitCode = -1;
-    QStringList out; ///< stdout lines
-    QString err;
-};
+using arbolex::cli::testing::Outcome;
 
 class CliTest : public ::testing::Test {
 protected:
-    Outcome run(QStringList arguments) {
-        arguments << QStringLiteral("--data-dir") << m_data.path();
-        QProcess process;
-        QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
-        environment.remove(QStringLiteral("ARBOLEX_DATA_DIR"));
-        process.setProcessEnvironment(environment);
-        process.start(QStringLiteral(ARBOLEX_CLI_PATH), arguments);
-        EXPECT_TRUE(process.waitForFinished(30000)) << "arbolex-cli did not finish";
-        Outcome r;
-        r.exitCode = process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -1;
-        r.out = QString::fromUtf8(process.readAllStandardOutput())
-                    .split(QLatin1Char('\n'), Qt::SkipEmptyParts);
-        r.err = QString::fromUtf8(process.readAllStandardError());
-        return r;
+    Outcome run(const QStringList &arguments) {
+        return arbolex::cli::testing::runCli(arguments, m_data.path());
     }
 
     QString errorLog() const {

@@ -1,4 +1,5 @@
 // The headless runner's script language and the grow shortcut.
+#include "cli/runnerfixture.hpp"
 #include "mocks/programservices.hpp"
 #include "mocks/qtprinters.hpp"
 
@@ -13,24 +14,6 @@
 
 namespace arbolex::testing {
 namespace {
-
-class RunnerTest : public ::testing::Test {
-protected:
-    /// Runs `lines` against a fresh session; returns what it printed.
-    cli::ScriptRunner::Outcome run(const QStringList &lines) {
-        outcome = runner.run(lines);
-        out.flush();
-        return outcome;
-    }
-    QStringList printed() const { return output.split(QLatin1Char('\n'), Qt::SkipEmptyParts); }
-
-    QTemporaryDir dir;
-    QString output;
-    QTextStream out{&output};
-    cli::HeadlessSession session{dir.path(), out};
-    cli::ScriptRunner runner{session, out};
-    cli::ScriptRunner::Outcome outcome;
-};
 
 TEST_F(RunnerTest, TypesPressesAndPrintsAsAUserWould) {
     ASSERT_TRUE(run({QStringLiteral("model 0  # Sitka spruce"), QStringLiteral(""),

@@ -91,7 +91,8 @@ TEST_F(NpvWindowTest, TypingFollowsTheColumnOfTheCell) {
     for (const QChar c : QStringLiteral("1x2.5.0")) {
         key(c);
     }
-    EXPECT_EQ(cell(3, kCfCost), QStringLiteral("12.50")) << "the 0 went away, x and a 2nd point not";
+    EXPECT_EQ(cell(3, kCfCost), QStringLiteral("12.50"))
+        << "the 0 went away, x and a 2nd point not";
     EXPECT_EQ(cashFlow.matrix(kCfCost, 2), 12.5);
     key(u'\b');
     key(u'\b');
@@ -111,8 +112,8 @@ TEST_F(NpvWindowTest, TypingFollowsTheColumnOfTheCell) {
     EXPECT_EQ(cashFlow.operation(4), QStringLiteral("Fence, 1.2 km"));
 
     // The computed columns and the year take no input.
-    for (const int column : {kCfYear, kCfTimberRevenue, kCfTotalRevenues, kCfCashFlow,
-                             kCfDiscountedCashFlow}) {
+    for (const int column :
+         {kCfYear, kCfTimberRevenue, kCfTotalRevenues, kCfCashFlow, kCfDiscountedCashFlow}) {
         npv.typeInCell(11, column, QStringLiteral("9"));
     }
     EXPECT_EQ(cell(11, kCfYear), QStringLiteral("30"));
@@ -159,8 +160,7 @@ TEST_F(NpvWindowTest, AnOverflowEndsTheComputationAtItsYear) {
     EXPECT_EQ(view.text(NpvControl::txtNPV), before) << "not summed again";
     QFile file(log.path());
     ASSERT_TRUE(file.open(QIODevice::ReadOnly));
-    EXPECT_TRUE(QString::fromLatin1(file.readAll())
-                    .contains(QStringLiteral("Overflow in line ")));
+    EXPECT_TRUE(QString::fromLatin1(file.readAll()).contains(QStringLiteral("Overflow in line ")));
 }
 
 TEST_F(NpvWindowTest, CopiesTheGridAsTextAndHtml) {
@@ -173,8 +173,8 @@ TEST_F(NpvWindowTest, CopiesTheGridAsTextAndHtml) {
     EXPECT_EQ(lines[0], text::npvHeaders().join(u'\t'));
     EXPECT_EQ(lines[1].split(u'\t').value(1), QStringLiteral("Planting <bare> & fenced"));
     EXPECT_TRUE(clipboard.html().contains(QStringLiteral("<th>Cost (€/ha)</th>")));
-    EXPECT_TRUE(clipboard.html().contains(
-        QStringLiteral("<td>Planting &lt;bare&gt; &amp; fenced</td>")));
+    EXPECT_TRUE(
+        clipboard.html().contains(QStringLiteral("<td>Planting &lt;bare&gt; &amp; fenced</td>")));
 
     RefusingClipboard refusing;
     NpvWindowLogic other(cashFlow, revenue, log, view, interactive, refusing);

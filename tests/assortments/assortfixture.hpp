@@ -1,0 +1,50 @@
+#pragma once
+
+#include "thinning/thinningfixture.hpp"
+
+#include "assortments/assortuserlogic.hpp"
+#include "assortments/assortwindowlogic.hpp"
+#include "assortments/headlessassortview.hpp"
+
+namespace arbolex::testing {
+
+using assortments::AssortControl;
+using assortments::AssortUserControl;
+
+/// The main and thinning windows with the assortment report and the user
+/// categories windows attached, the shipped categories loaded.
+class AssortTest : public ThinningTest {
+protected:
+    AssortTest() {
+        logic.attachAssortments(&assort);
+        thin.attachAssortments(&assort);
+    }
+
+    /// Opens the thinning window at 30 and previews a removal of `volume` m³/ha.
+    void previewThinning(const QString &volume = QStringLiteral("60")) {
+        openThinning();
+        typeThin(ThinControl::txtRemV, volume);
+        thin.cmdThin_Click();
+    }
+
+    /// The labels of the rows after the last thinning row.
+    QStringList labelsAfterThinning() const {
+        QStringList labels;
+        bool after = false;
+        for (int r = 1; r <= logic.table().lastRow(); ++r) {
+            const workflow::TableRow &row = logic.table().row(r);
+            if (after) {
+                labels << row.label;
+            }
+            after = after || row.isThinning();
+        }
+        return labels;
+    }
+
+    assortments::HeadlessAssortView assortView;
+    assortments::AssortWindowLogic assort{logic, assortView, interactive};
+    assortments::HeadlessAssortUserView userView;
+    assortments::AssortUserLogic user{prices.data(), assort.session(), userView, interactive};
+};
+
+} // namespace arbolex::testing
