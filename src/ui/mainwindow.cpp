@@ -492,13 +492,8 @@ void MainWindow::showSummary(bool summary) {
 
 void MainWindow::fitSummary() {
     m_summaryModel->refresh();
-    // Rows after the copied ones are the rotation's totals.
-    const auto rows = static_cast<int>(m_logic->summaryRows().size());
-    int copied = 0;
-    for (const workflow::TableRow &r : m_logic->summaryRows()) {
-        copied += r.isText() ? 0 : 1;
-    }
-    m_summaryModel->setBoldFrom(copied < rows ? copied : -1);
+    // The rotation's totals stand out below the rows it copied.
+    m_summaryModel->setBoldFrom(m_logic->summaryTotalsFrom());
     const QFontMetrics metrics = m_summaryGrid->horizontalHeader()->fontMetrics();
     QFont boldFont = m_summaryGrid->font();
     boldFont.setBold(true);

@@ -110,6 +110,8 @@ public:
     bool felled() const { return m_felled; }
     /// The summary as last filled: its rows, in the projection table's shape.
     const std::vector<TableRow> &summaryRows() const { return m_summary; }
+    /// Index in summaryRows() of the first row of the rotation's totals.
+    int summaryTotalsFrom() const { return m_summaryTotalsFrom; }
     /// The summary as shown: captions first, then its rows.
     std::vector<QStringList> summaryGrid() const;
     /// The group above each column of the summary ("Thinning" …).
@@ -240,6 +242,8 @@ private:
     /// Set by the final cut; no growing or thinning until rows are cleared or deleted.
     bool m_felled = false;
     std::vector<TableRow> m_summary;
+    /// Index in m_summary of the first row of the rotation's totals.
+    int m_summaryTotalsFrom = 0;
     bool m_showingSummary = false;
 };
 

@@ -39,13 +39,22 @@ bool MainWindowLogic::FillSummary() {
         // the final cut.
         double thinnedVolume = 0.0;
         double thinnedValue = 0.0;
+        // Assortment rows go with the stand row they follow.
+        bool standCopied = false;
         for (int r = 1; r <= m_table.lastRow(); ++r) {
             const TableRow &source = m_table.row(r);
             if (source.isThinning()) {
                 thinnedVolume += source.record.removedVolume;
                 thinnedValue += source.removedValue;
             }
-            if (source.cells.value(kColSeparator1).isEmpty()) {
+            if (source.isText()) {
+                if (standCopied) {
+                    m_summary.push_back(source);
+                }
+                continue;
+            }
+            standCopied = !source.cells.value(kColSeparator1).isEmpty();
+            if (!standCopied) {
                 continue;
             }
             TableRow copy = source;
@@ -60,6 +69,7 @@ bool MainWindowLogic::FillSummary() {
         }
 
         // The rotation's totals, at the age of the last stand.
+        m_summaryTotalsFrom = static_cast<int>(m_summary.size());
         const int last = lastStandRow();
         const double area = netArea();
         if (last > 0) {
