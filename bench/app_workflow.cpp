@@ -1,9 +1,13 @@
 // The window logic at the speed a user feels it: a grow command, a thinning
 // preview, a whole thinning loop; and the headless runner as a whole process.
+#include "economics/inpvview.hpp"
+#include "economics/npvwindowlogic.hpp"
+#include "economics/pricedata.hpp"
 #include "economics/prices.hpp"
 #include "engine/grow.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
+#include "shell/iclipboard.hpp"
 #include "shell/interactive.hpp"
 #include "thinning/headlessthinview.hpp"
 #include "thinning/thinwindowlogic.hpp"
@@ -26,8 +30,9 @@ using arbolex::workflow::MainControl;
 class SilentInteractive : public arbolex::shell::IInteractive {
 public:
     void message(const QString &, const QString &, int) override { ++messages; }
-    bool askYesNo(const QString &, const QString &) override { return false; }
+    bool askYesNo(const QString &, const QString &) override { return answer; }
     int messages = 0;
+    bool answer = false;
 };
 
 /// A main window and a thinning window without a screen.
@@ -175,6 +180,77 @@ void BM_RunnerThinningLoop(benchmark::State &state) {
 BENCHMARK(BM_RunnerThinningLoop)->Unit(benchmark::kMillisecond);
 
 } // namespace
+
+/// The longest rotation the table holds (10 → 60 by 1 year, 51 rows):
+/// the final cut with the net present value accepted, then the cash flow
+/// with its timber revenues.
+void BM_FinalCutAndCashFlow(benchmark::State &state) {
+    for (auto _ : state) {
+        state.PauseTiming();
+        auto w = std::make_unique<Windows>();
+        arbolex::economics::GetPricesFromFiles(QStringLiteral(ARBOLEX_BIN_DIR), w->prices.data(),
+                                               w->log);
+        w->prices.selectPriceSet(arbolex::economics::kCurrentPrices);
+        w->typeStand("10", "60", "1");
+        w->main.typeText(MainControl::txtFromH, QStringLiteral("5"));
+        w->main.cmdGrow_Click();
+        w->interactive.answer = true;
+        state.ResumeTiming();
+        w->main.cmdFinalCut_Click();
+        w->main.cashFlow().LoadTimberRevenues(w->main.timberRevenue());
+        const int years = w->main.cashFlow().ComputeCashFlow(w->log);
+        benchmark::DoNotOptimize(w->main.cashFlow().SumNPV());
+        state.PauseTiming();
+        if (years != 51 || w->main.cashFlow().SumNPV() <= 0.0) {
+            state.SkipWithError("the final cut laid out no 51-year cash flow");
+        }
+        w.reset();
+        state.ResumeTiming();
+    }
+}
+BENCHMARK(BM_FinalCutAndCashFlow)->Unit(benchmark::kMicrosecond);
+
+/// The cash flow of a 60-year rotation alone: totals, discounting, the sum.
+void BM_ComputeCashFlow60Years(benchmark::State &state) {
+    QTemporaryDir dir;
+    arbolex::shell::ErrorLog log(dir.path());
+    arbolex::economics::CashFlow flow;
+    flow.SetRotationLength(0, 60);
+    flow.DimNPVArrays();
+    for (int i = 0; i < flow.years(); ++i) {
+        flow.setMatrix(arbolex::economics::kCfCost, i, 25.0 * i);
+        flow.setMatrix(arbolex::economics::kCfTimberRevenue, i, i % 5 == 0 ? 900.0 : 0.0);
+    }
+    for (auto _ : state) {
+        benchmark::DoNotOptimize(flow.ComputeCashFlow(log));
+        benchmark::DoNotOptimize(flow.SumNPV());
+    }
+}
+BENCHMARK(BM_ComputeCashFlow60Years)->Unit(benchmark::kMicrosecond);
+
+/// Opening the net present value window's logic on 60 years: the grid, the
+/// timber revenues, the typed values and the net present value.
+void BM_OpenNpvWindow60Years(benchmark::State &state) {
+    QTemporaryDir dir;
+    arbolex::shell::ErrorLog log(dir.path());
+    SilentInteractive interactive;
+    arbolex::shell::HeadlessClipboard clipboard;
+    arbolex::economics::HeadlessNpvView view;
+    arbolex::economics::TimberRevenue revenue;
+    for (int age = 20; age < 60; age += 5) {
+        revenue.add(age, 700.0);
+    }
+    revenue.add(60, 40000.0);
+    arbolex::economics::CashFlow flow;
+    flow.SetRotationLength(0, 60);
+    flow.DimNPVArrays();
+    arbolex::economics::NpvWindowLogic npv(flow, revenue, log, view, interactive, clipboard);
+    for (auto _ : state) {
+        npv.Form_Load();
+        benchmark::DoNotOptimize(npv.grid().size());
+    }
+}
+BENCHMARK(BM_OpenNpvWindow60Years)->Unit(benchmark::kMicrosecond);
 
 int main(int argc, char **argv) {
     QCoreApplication application(argc, argv);

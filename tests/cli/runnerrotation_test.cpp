@@ -52,12 +52,11 @@ protected:
 };
 
 TEST_F(RunnerRotationTest, NetPresentValueAtTwoRatesAndWithAFirstYearCost) {
-    const QStringList shown =
-        after({QStringLiteral("press frmNPV.cmdNPV"), QStringLiteral("print frmNPV.txtNPV"),
-               QStringLiteral("set frmNPV.txtInterestRate 0"),
-               QStringLiteral("press frmNPV.cmdNPV"), QStringLiteral("print frmNPV.txtNPV"),
-               QStringLiteral("set frmNPV.NPV_Grid(1,2) 1000"),
-               QStringLiteral("press frmNPV.cmdNPV"), QStringLiteral("print frmNPV.txtNPV")});
+    const QStringList shown = after(
+        {QStringLiteral("press frmNPV.cmdNPV"), QStringLiteral("print frmNPV.txtNPV"),
+         QStringLiteral("set frmNPV.txtInterestRate 0"), QStringLiteral("press frmNPV.cmdNPV"),
+         QStringLiteral("print frmNPV.txtNPV"), QStringLiteral("set frmNPV.NPV_Grid(1,2) 1000"),
+         QStringLiteral("press frmNPV.cmdNPV"), QStringLiteral("print frmNPV.txtNPV")});
     ASSERT_EQ(shown.size(), 3) << output.toStdString();
     const economics::CashFlow &flow = session.main().cashFlow();
     // At 0 % the net present value is the sum of the timber revenues.
@@ -71,10 +70,9 @@ TEST_F(RunnerRotationTest, NetPresentValueAtTwoRatesAndWithAFirstYearCost) {
 }
 
 TEST_F(RunnerRotationTest, SummaryGridAndClipboardPrintAsTabSeparatedText) {
-    const QStringList shown =
-        after({QStringLiteral("press cmdSummary"), QStringLiteral("print flxSummary"),
-               QStringLiteral("press frmNPV.CmdCopyToClipboard"),
-               QStringLiteral("print clipboard")});
+    const QStringList shown = after(
+        {QStringLiteral("press cmdSummary"), QStringLiteral("print flxSummary"),
+         QStringLiteral("press frmNPV.CmdCopyToClipboard"), QStringLiteral("print clipboard")});
     ASSERT_GE(shown.size(), 8);
     EXPECT_TRUE(shown[0].startsWith(QStringLiteral("Event\tAge\tTop Ht\t")));
     EXPECT_TRUE(shown[3].startsWith(QStringLiteral("Final cut\t60\t")));

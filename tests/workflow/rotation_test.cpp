@@ -51,8 +51,8 @@ protected:
 
     economics::HeadlessNpvView npvView;
     shell::HeadlessClipboard clipboard;
-    economics::NpvWindowLogic npv{logic.cashFlow(), logic.timberRevenue(), log, npvView,
-                                  interactive, clipboard};
+    economics::NpvWindowLogic npv{logic.cashFlow(), logic.timberRevenue(), log,
+                                  npvView,          interactive,           clipboard};
 };
 
 TEST_F(RotationTest, FinalCutFellsTheStandingCropAndValuesIt) {
@@ -76,7 +76,8 @@ TEST_F(RotationTest, FinalCutFellsTheStandingCropAndValuesIt) {
     const auto k = static_cast<std::size_t>(economics::priceClassOf(meanTree, interactive));
     const double price = prices.pricesInUse()[k];
     EXPECT_EQ(felled.cells[kColValuePerHa], shell::formatNumber(standing * price, u"0"));
-    EXPECT_EQ(felled.cells[kColThinTotalVolume], shell::formatNumber(trees * meanTree * 10, u"##0"));
+    EXPECT_EQ(felled.cells[kColThinTotalVolume],
+              shell::formatNumber(trees * meanTree * 10, u"##0"));
     EXPECT_EQ(felled.cells[kColThinTotalValue],
               shell::formatNumber(trees * meanTree * price * 10, u"##0"));
     EXPECT_TRUE(felled.cells[kColSeparator2].isEmpty());
@@ -111,7 +112,8 @@ TEST_F(RotationTest, FinalCutFixesAnEvenYieldClassAndOffersTheNetPresentValue) {
     EXPECT_GT(yc, 0);
     EXPECT_EQ(yc % 2, 0);
     EXPECT_EQ(view.text(MainControl::lblYC), QString::number(yc));
-    EXPECT_EQ(view.hint(MainControl::lblYC), QStringLiteral("Yield Class calculated at clearfell age"));
+    EXPECT_EQ(view.hint(MainControl::lblYC),
+              QStringLiteral("Yield Class calculated at clearfell age"));
 
     ASSERT_EQ(interactive.questions.size(), 1);
     EXPECT_EQ(interactive.questions[0].title, QStringLiteral("NPV"));
@@ -279,9 +281,9 @@ TEST_F(RotationTest, TablesCopyAsOneValuePerCellUnderTheirCaptions) {
     const QStringList lines = clipboard.text().split(u'\n', Qt::SkipEmptyParts);
     ASSERT_EQ(lines.size(), logic.table().rowCount());
     const QStringList header = lines[0].split(u'\t');
-    EXPECT_EQ(header.mid(0, 4), (QStringList{QStringLiteral("Row"), QStringLiteral("Age"),
-                                             QStringLiteral("Top Ht"),
-                                             QStringLiteral("Main crop N/ha")}));
+    EXPECT_EQ(header.mid(0, 4),
+              (QStringList{QStringLiteral("Row"), QStringLiteral("Age"), QStringLiteral("Top Ht"),
+                           QStringLiteral("Main crop N/ha")}));
     EXPECT_TRUE(header.contains(QStringLiteral("Thinning € / ha")));
     EXPECT_FALSE(header.contains(QString())) << "no blank separator columns";
     for (const QString &line : lines) {

@@ -1,0 +1,61 @@
+// The windows as a user opens them, drawn off screen: the net present value
+// window on a 60-year cash flow, from the command to the window laid out.
+#include "economics/mdlnpv.hpp"
+#include "economics/npvwindowlogic.hpp"
+#include "shell/errorlog.hpp"
+#include "shell/iclipboard.hpp"
+#include "shell/interactive.hpp"
+#include "ui/npvwindow.hpp"
+
+#include <QApplication>
+#include <QTemporaryDir>
+
+#include <benchmark/benchmark.h>
+
+namespace {
+
+class SilentInteractive : public arbolex::shell::IInteractive {
+public:
+    void message(const QString &, const QString &, int) override {}
+    bool askYesNo(const QString &, const QString &) override { return false; }
+};
+
+void BM_ShowNpvWindow60Years(benchmark::State &state) {
+    QTemporaryDir dir;
+    arbolex::shell::ErrorLog log(dir.path());
+    SilentInteractive interactive;
+    arbolex::shell::HeadlessClipboard clipboard;
+    arbolex::economics::TimberRevenue revenue;
+    for (int age = 20; age <= 60; age += 5) {
+        revenue.add(age, 800.0);
+    }
+    arbolex::economics::CashFlow flow;
+    flow.SetRotationLength(0, 60);
+    flow.DimNPVArrays();
+    for (auto _ : state) {
+        arbolex::ui::NpvWindow window;
+        arbolex::economics::NpvWindowLogic npv(flow, revenue, log, window, interactive,
+                                                clipboard);
+        window.attach(npv);
+        npv.Form_Load();
+        npv.cmdNPV_Click();
+        window.showWindow();
+        QCoreApplication::processEvents();
+        benchmark::DoNotOptimize(window.isShown());
+        window.close();
+    }
+}
+BENCHMARK(BM_ShowNpvWindow60Years)->Unit(benchmark::kMillisecond);
+
+} // namespace
+
+int main(int argc, char **argv) {
+    if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM")) {
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+    }
+    QApplication app(argc, argv);
+    benchmark::Initialize(&argc, argv);
+    benchmark::RunSpecifiedBenchmarks();
+    benchmark::Shutdown();
+    return 0;
+}
