@@ -9,6 +9,7 @@
 #include "shell/errorlog.hpp"
 #include "shell/iclipboard.hpp"
 #include "shell/interactive.hpp"
+#include "silentinteractive.hpp"
 #include "thinning/headlessthinview.hpp"
 #include "thinning/thinwindowlogic.hpp"
 #include "workflow/headlessmainview.hpp"
@@ -27,13 +28,7 @@ namespace {
 using arbolex::thinning::ThinControl;
 using arbolex::workflow::MainControl;
 
-class SilentInteractive : public arbolex::shell::IInteractive {
-public:
-    void message(const QString &, const QString &, int) override { ++messages; }
-    bool askYesNo(const QString &, const QString &) override { return answer; }
-    int messages = 0;
-    bool answer = false;
-};
+using arbolex::bench::SilentInteractive;
 
 /// A main window and a thinning window without a screen.
 struct Windows {

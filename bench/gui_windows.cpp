@@ -5,6 +5,7 @@
 #include "shell/errorlog.hpp"
 #include "shell/iclipboard.hpp"
 #include "shell/interactive.hpp"
+#include "silentinteractive.hpp"
 #include "ui/npvwindow.hpp"
 
 #include <QApplication>
@@ -14,11 +15,7 @@
 
 namespace {
 
-class SilentInteractive : public arbolex::shell::IInteractive {
-public:
-    void message(const QString &, const QString &, int) override {}
-    bool askYesNo(const QString &, const QString &) override { return false; }
-};
+using arbolex::bench::SilentInteractive;
 
 void BM_ShowNpvWindow60Years(benchmark::State &state) {
     QTemporaryDir dir;
@@ -34,8 +31,7 @@ void BM_ShowNpvWindow60Years(benchmark::State &state) {
     flow.DimNPVArrays();
     for (auto _ : state) {
         arbolex::ui::NpvWindow window;
-        arbolex::economics::NpvWindowLogic npv(flow, revenue, log, window, interactive,
-                                                clipboard);
+        arbolex::economics::NpvWindowLogic npv(flow, revenue, log, window, interactive, clipboard);
         window.attach(npv);
         npv.Form_Load();
         npv.cmdNPV_Click();
