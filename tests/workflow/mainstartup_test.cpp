@@ -61,6 +61,7 @@ TEST_F(MainStartupTest, UnloadAndLoadRoundTrip) {
     type(MainControl::txtNetArea, QStringLiteral("12.5"));
     view.setPlacement(QRect(40, 60, 1000, 700));
     prices.data().userDefined[3] = 17.25;
+    logic.cashFlow().setInterestRate(3.25);
     logic.Form_Unload(settings);
 
     HeadlessMainView nextView;
@@ -77,6 +78,7 @@ TEST_F(MainStartupTest, UnloadAndLoadRoundTrip) {
     }
     EXPECT_EQ(nextView.placement(), QRect(40, 60, 1000, 700));
     EXPECT_EQ(nextPrices.data().userDefined[3], 17.25);
+    EXPECT_EQ(next.cashFlow().interestRate(), 3.25);
     EXPECT_TRUE(logLines().isEmpty());
 }
 
