@@ -47,5 +47,6 @@ Command thinCommand();
 Command growCommand();
 Command runCommand();
 Command assortCommand();
+Command rotationCommand();
 
 } // namespace arbolex::cli

@@ -16,8 +16,9 @@ using arbolex::cli::Command;
 /// entry here (and its file).
 const std::vector<Command> &commands() {
     static const std::vector<Command> table = {
-        arbolex::cli::projectCommand(), arbolex::cli::thinCommand(), arbolex::cli::growCommand(),
-        arbolex::cli::assortCommand(),  arbolex::cli::runCommand(),
+        arbolex::cli::projectCommand(),  arbolex::cli::thinCommand(),
+        arbolex::cli::growCommand(),     arbolex::cli::assortCommand(),
+        arbolex::cli::rotationCommand(), arbolex::cli::runCommand(),
     };
     return table;
 }
