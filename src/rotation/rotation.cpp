@@ -1,5 +1,7 @@
 #include "rotation/rotation.hpp"
 
+#include "rotation/optimiser.hpp"
+
 #include "rotation/yieldclass.hpp"
 #include "valuation/discounting.hpp"
 
@@ -182,7 +184,7 @@ std::optional<std::string> rotationProblem(const GrowthPath &path, const Regime 
 }
 
 std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const Regime &regime,
-                                   GrowthFailure &failure) {
+                                   GrowthFailure &failure, const ThinningLimits *limits) {
     const unsigned faultsBefore = grow.faultCount();
     auto engineFailed = [&](std::string text) {
         failure = {false, std::move(text)};
@@ -247,6 +249,10 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
         if (!thinning) {
             break;
         }
+        if (limits != nullptr &&
+            double{regime.thinVolume} > limits->maxRemovalShare * double{current.volume}) {
+            break;
+        }
         const float residualVolume = current.volume - regime.thinVolume;
         if (!(residualVolume > 0.0f)) {
             failure = {true, "the thinning at age " + ageText(stop) + " removes " +
@@ -262,6 +268,9 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
             !(residualBasalArea > 0.0f)) {
             return engineFailed("the thinning response could not remove " +
                                 volumeText(regime.thinVolume) + " m3/ha at age " + ageText(stop));
+        }
+        if (limits != nullptr && residualStocking < limits->minStocking) {
+            break;
         }
         Harvest t;
         t.age = stop;
@@ -337,6 +346,29 @@ RotationExplorer exploreRotations(const GrowthPath &path, const Regime &regime,
         e.rows.push_back(row);
     }
     return e;
+}
+
+Candidate scoreRotation(const GrowthPath &path, const Regime &regime, int rotation,
+                        const Economics &economics, Objective objective) {
+    Candidate c;
+    c.rotation = rotation;
+    Harvest finalCut;
+    const std::vector<Harvest> all = harvests(path, rotation, economics, finalCut);
+    c.regime = regime;
+    if (all.size() > 1) {
+        c.regime.thinUntil = all[all.size() - 2].age;
+    } else {
+        c.regime = {};
+    }
+    c.volume = meanAnnualIncrement(path, rotation) * rotation;
+    const Figures fig =
+        figures(cashFlows(all, rotation, economics), path.presentAge, economics.ratePercent);
+    c.npv = fig.npv.value_or(-std::numeric_limits<double>::infinity());
+    c.lev = fig.lev.value_or(-std::numeric_limits<double>::infinity());
+    c.score = objective == Objective::kLev   ? c.lev
+              : objective == Objective::kNpv ? c.npv
+                                             : c.volume;
+    return c;
 }
 
 } // namespace arbolex::rotation

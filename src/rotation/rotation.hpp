@@ -95,6 +95,10 @@ struct GrowthPath {
     /// The thinnings, oldest first; revenues 0 until a rotation is valued.
     std::vector<Harvest> thinnings;
 
+    /// Last age grown, years: the age limit, or the age of a thinning the
+    /// limits did not allow.
+    int lastAge() const { return presentAge + static_cast<int>(years.size()) - 1; }
+
     const engine::StandState &at(int age) const {
         return years[static_cast<std::size_t>(age - presentAge)];
     }
@@ -118,14 +122,24 @@ std::optional<std::string> regimeProblem(const Regime &regime, int presentAge, i
 std::optional<std::string> rotationProblem(const GrowthPath &path, const Regime &regime,
                                            int rotation);
 
+/// What a thinning may do: remove at most a share of the standing volume and
+/// leave at least a stocking.
+struct ThinningLimits {
+    double maxRemovalShare = 1.0;
+    /// Stems/ha.
+    float minStocking = 0.0f;
+};
+
 /// Grows `stand` under `regime` to the model's age limit with `grow` (the
 /// model is made active with its volume correction factor and the site index
 /// computed, as the model menu and the grow command do). Each thinning is the
 /// thinning window's volume method: the residual volume is the standing
 /// volume less `thinVolume`, and NEWTON gives the residual basal area and
-/// stocking. Returns std::nullopt and fills `failure` when it cannot.
+/// stocking. With `limits`, the path ends at the first thinning they do not
+/// allow (its crop recorded, the thinning not made). Returns std::nullopt and
+/// fills `failure` when it cannot.
 std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const Regime &regime,
-                                   GrowthFailure &failure);
+                                   GrowthFailure &failure, const ThinningLimits *limits = nullptr);
 
 /// One year of the cash flow of a rotation from bare land, euro/ha.
 struct CashFlowYear {
