@@ -48,5 +48,7 @@ Command growCommand();
 Command runCommand();
 Command assortCommand();
 Command rotationCommand();
+Command optimiseCommand();
+Command uncertaintyCommand();
 
 } // namespace arbolex::cli

@@ -16,9 +16,10 @@ using arbolex::cli::Command;
 /// entry here (and its file).
 const std::vector<Command> &commands() {
     static const std::vector<Command> table = {
-        arbolex::cli::projectCommand(),  arbolex::cli::thinCommand(),
-        arbolex::cli::growCommand(),     arbolex::cli::assortCommand(),
-        arbolex::cli::rotationCommand(), arbolex::cli::runCommand(),
+        arbolex::cli::projectCommand(),     arbolex::cli::thinCommand(),
+        arbolex::cli::growCommand(),        arbolex::cli::assortCommand(),
+        arbolex::cli::rotationCommand(),    arbolex::cli::optimiseCommand(),
+        arbolex::cli::uncertaintyCommand(), arbolex::cli::runCommand(),
     };
     return table;
 }

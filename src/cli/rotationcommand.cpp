@@ -6,7 +6,6 @@
 #include "cli/options.hpp"
 #include "cli/rotationinput.hpp"
 #include "cli/standinput.hpp"
-#include "valuation/discounting.hpp"
 
 #include <QJsonArray>
 #include <QJsonDocument>
@@ -19,10 +18,6 @@ namespace arbolex::cli {
 namespace {
 
 using rotation::Harvest;
-
-QJsonValue money(const std::optional<double> &euro) {
-    return euro ? QJsonValue(valuation::roundToCents(*euro)) : QJsonValue(QJsonValue::Null);
-}
 
 /// A single-precision quantity as the tables print it ("%.9g").
 QJsonValue quantity(double x) {
@@ -47,7 +42,7 @@ QJsonObject harvestJson(const Harvest &h, bool withStocking) {
     QJsonObject o{{QStringLiteral("age"), h.age},
                   {QStringLiteral("volume"), quantity(h.volume)},
                   {QStringLiteral("mean_tree_volume"), h.meanTreeVolume},
-                  {QStringLiteral("revenue"), money(h.revenue)}};
+                  {QStringLiteral("revenue"), moneyJson(h.revenue)}};
     if (withStocking) {
         o.insert(QStringLiteral("stocking"), quantity(h.stocking));
     }
@@ -70,17 +65,17 @@ QJsonObject toJson(const Report &r, const engine::Grow &grow) {
     QJsonArray cashflow;
     for (const rotation::CashFlowYear &c : v.cashflow) {
         cashflow.append(QJsonObject{{QStringLiteral("age"), c.age},
-                                    {QStringLiteral("cost"), money(c.cost)},
-                                    {QStringLiteral("revenue"), money(c.revenue)}});
+                                    {QStringLiteral("cost"), moneyJson(c.cost)},
+                                    {QStringLiteral("revenue"), moneyJson(c.revenue)}});
     }
     QJsonArray byAge;
     for (const rotation::RotationRow &row : r.explorer.rows) {
         byAge.append(QJsonObject{{QStringLiteral("age"), row.age},
                                  {QStringLiteral("volume"), quantity(row.volume)},
                                  {QStringLiteral("mai"), row.mai},
-                                 {QStringLiteral("npv"), money(row.npv)},
-                                 {QStringLiteral("lev"), money(row.lev)},
-                                 {QStringLiteral("forest_value"), money(row.forestValue)}});
+                                 {QStringLiteral("npv"), moneyJson(row.npv)},
+                                 {QStringLiteral("lev"), moneyJson(row.lev)},
+                                 {QStringLiteral("forest_value"), moneyJson(row.forestValue)}});
     }
     QJsonObject o{{QStringLiteral("model"), QString::fromStdString(grow.label())},
                   {QStringLiteral("site_index"), quantity(r.path.siteIndex)},
@@ -91,10 +86,10 @@ QJsonObject toJson(const Report &r, const engine::Grow &grow) {
                   {QStringLiteral("biological_rotation"), r.explorer.biologicalRotation},
                   {QStringLiteral("yield_class"), v.yieldClass},
                   {QStringLiteral("mai"), v.mai},
-                  {QStringLiteral("npv"), money(v.npv)},
-                  {QStringLiteral("lev"), money(v.lev)},
-                  {QStringLiteral("eaa"), money(v.eaa)},
-                  {QStringLiteral("forest_value"), money(v.forestValue)},
+                  {QStringLiteral("npv"), moneyJson(v.npv)},
+                  {QStringLiteral("lev"), moneyJson(v.lev)},
+                  {QStringLiteral("eaa"), moneyJson(v.eaa)},
+                  {QStringLiteral("forest_value"), moneyJson(v.forestValue)},
                   {QStringLiteral("irr"), v.irr.outcome == valuation::IrrOutcome::kRoot
                                               ? QJsonValue(v.irr.ratePercent)
                                               : QJsonValue(QJsonValue::Null)},
@@ -111,14 +106,9 @@ QJsonObject toJson(const Report &r, const engine::Grow &grow) {
     return o;
 }
 
-QString moneyText(const std::optional<double> &euro) {
-    return euro ? formatNumber(valuation::roundToCents(*euro)) : QString();
-}
-
 void writeTsv(QTextStream &out, const Report &r, const engine::Grow &grow) {
     const rotation::RotationValue &v = r.value;
-    writePreamble(out, grow, true);
-    out << "# rate\t" << formatNumber(r.ratePercent) << '\n';
+    writeRotationPreamble(out, grow, r.ratePercent);
     out << "rotation\t" << v.rotation << '\n'
         << "economic_rotation\t" << r.explorer.economicRotation << '\n'
         << "biological_rotation\t" << r.explorer.biologicalRotation << '\n'
@@ -157,54 +147,29 @@ void writeTsv(QTextStream &out, const Report &r, const engine::Grow &grow) {
 }
 
 int runRotation(CommandContext &context) {
-    auto usage = [&](const QString &text) {
-        context.err << "arbolex-cli rotation: " << text << '\n';
-        return kExitBadArguments;
-    };
-    StandInput stand;
-    rotation::Regime regime;
-    rotation::Economics economics;
-    std::optional<int> chosen;
-    QString format;
+    RotationInput in;
     try {
-        std::vector<const char *> known = standOptionNames();
-        for (const auto &names : {regimeOptionNames(), economicsOptionNames()}) {
-            known.insert(known.end(), names.begin(), names.end());
-        }
-        known.insert(known.end(), {"rotation", "format"});
-        const Options options(context.arguments, known);
-        stand = readStand(options);
-        regime = readRegime(options);
-        if (options.has("rotation")) {
-            chosen = options.wholeNumber("rotation", 1, 1000);
-        }
-        format = readFormat(options);
-        economics = readEconomics(options, context.dataFolder);
+        const Options options(context.arguments, rotationOptionNames());
+        in = readRotationInput(options, context.dataFolder);
     } catch (const UsageError &error) {
-        return usage(error.text);
+        context.err << "arbolex-cli rotation: " << error.text << '\n';
+        return kExitBadArguments;
     }
 
     StreamReport report(context.err, context.dataFolder);
     engine::Grow grow(&report);
-    rotation::GrowthFailure failure;
-    const std::optional<rotation::GrowthPath> path =
-        rotation::growPath(grow, stand, regime, failure);
-    if (!path) {
-        if (failure.badInput) {
-            return usage(QString::fromStdString(failure.text));
-        }
-        context.err << "arbolex-cli rotation: " << QString::fromStdString(failure.text) << '\n';
-        return kExitEngineFailure;
+    const QString command = QStringLiteral("rotation");
+    const GrownRotation grown = growRotation(grow, in, command, context.err);
+    if (!grown.path) {
+        return grown.status;
     }
+    const rotation::GrowthPath &path = *grown.path;
     const rotation::RotationExplorer explorer =
-        rotation::exploreRotations(*path, regime, economics);
-    const int age = chosen.value_or(explorer.economicRotation);
-    if (const auto problem = rotation::rotationProblem(*path, regime, age)) {
-        return usage(QString::fromStdString(*problem));
-    }
-    const rotation::RotationValue value = rotation::valueRotation(*path, age, economics);
-    const Report r{*path, value, explorer, economics.ratePercent};
-    if (format == QLatin1String("json")) {
+        rotation::exploreRotations(path, in.regime, in.economics);
+    const rotation::RotationValue value =
+        rotation::valueRotation(path, grown.rotation, in.economics);
+    const Report r{path, value, explorer, in.economics.ratePercent};
+    if (in.format == QLatin1String("json")) {
         context.out << QJsonDocument(toJson(r, grow)).toJson(QJsonDocument::Indented);
     } else {
         writeTsv(context.out, r, grow);

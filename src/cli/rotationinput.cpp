@@ -1,8 +1,10 @@
 #include "cli/rotationinput.hpp"
 
+#include "cli/command.hpp"
 #include "economics/prices.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/settings.hpp"
+#include "valuation/discounting.hpp"
 
 #include <algorithm>
 #include <iterator>
@@ -116,6 +118,62 @@ QString readFormat(const Options &options) {
         throw UsageError{QStringLiteral("--format takes tsv or json")};
     }
     return format;
+}
+
+std::vector<const char *> rotationOptionNames(std::initializer_list<const char *> more) {
+    std::vector<const char *> known = standOptionNames();
+    for (const auto &names : {regimeOptionNames(), economicsOptionNames()}) {
+        known.insert(known.end(), names.begin(), names.end());
+    }
+    known.insert(known.end(), {"rotation", "format"});
+    known.insert(known.end(), more.begin(), more.end());
+    return known;
+}
+
+RotationInput readRotationInput(const Options &options, const QString &dataFolder) {
+    RotationInput input;
+    input.stand = readStand(options);
+    input.regime = readRegime(options);
+    if (options.has("rotation")) {
+        input.rotation = options.wholeNumber("rotation", 1, kLongestAge);
+    }
+    input.format = readFormat(options);
+    input.economics = readEconomics(options, dataFolder);
+    return input;
+}
+
+void writeRotationPreamble(QTextStream &out, const engine::Grow &grow, double ratePercent) {
+    writePreamble(out, grow, true);
+    out << "# rate\t" << formatNumber(ratePercent) << '\n';
+}
+
+GrownRotation growRotation(engine::Grow &grow, const RotationInput &input, const QString &command,
+                           QTextStream &err) {
+    auto refuse = [&](const std::string &text) {
+        err << "arbolex-cli " << command << ": " << QString::fromStdString(text) << '\n';
+    };
+    rotation::GrowthFailure failure;
+    std::optional<rotation::GrowthPath> path =
+        rotation::growPath(grow, input.stand, input.regime, failure);
+    if (!path) {
+        refuse(failure.text);
+        return {std::nullopt, 0, failure.badInput ? kExitBadArguments : kExitEngineFailure};
+    }
+    const int age = input.rotation.value_or(
+        rotation::exploreRotations(*path, input.regime, input.economics).economicRotation);
+    if (const auto problem = rotation::rotationProblem(*path, input.regime, age)) {
+        refuse(*problem);
+        return {std::nullopt, 0, kExitBadArguments};
+    }
+    return {std::move(path), age, kExitSuccess};
+}
+
+QJsonValue moneyJson(const std::optional<double> &euro) {
+    return euro ? QJsonValue(valuation::roundToCents(*euro)) : QJsonValue(QJsonValue::Null);
+}
+
+QString moneyText(const std::optional<double> &euro) {
+    return euro ? formatNumber(valuation::roundToCents(*euro)) : QString();
 }
 
 } // namespace arbolex::cli

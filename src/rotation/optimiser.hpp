@@ -22,8 +22,10 @@ struct OptimiserSettings {
     Objective objective = Objective::kLev;
     /// Largest share of the standing volume one thinning may remove.
     double maxRemovalShare = 0.35;
-    /// Smallest stocking a thinning may leave, stems/ha.
-    float minStocking = 0.0f;
+    /// Smallest stocking a thinning may leave, stems/ha: about a final crop.
+    /// Without it, frequent heavy thinnings drive the thinning response to a
+    /// few stems per ha, far outside the stands the models were fitted to.
+    float minStocking = 400.0f;
     /// How many regimes to report.
     int top = 5;
     /// The coarse grid: first thinning ages (empty: every third year from the

@@ -18,8 +18,9 @@ namespace {
 
 using arbolex::cli::testing::Outcome;
 
-constexpr const char *kStand =
-    "rotation --model 0 --age 15 --stocking 2500 --height 7 --basal-area 20";
+constexpr const char *kStandOptions =
+    "--model 0 --age 15 --stocking 2500 --height 7 --basal-area 20";
+const QString kStand = QStringLiteral("rotation ") + QLatin1String(kStandOptions);
 constexpr const char *kRegime = "--thin-from 20 --thin-every 5 --thin-volume 40 --thin-until 35";
 
 QStringList words(const QString &commandLine) {
@@ -43,7 +44,7 @@ protected:
     bool m_copied = arbolex::testing::copyShippedData(m_data.path());
 };
 
-const QString kThinned = QLatin1String(kStand) + QLatin1Char(' ') + QLatin1String(kRegime);
+const QString kThinned = kStand + QLatin1Char(' ') + QLatin1String(kRegime);
 
 TEST_F(RotationCliTest, JsonCarriesEveryFigureAndTheyHoldTogether) {
     const QJsonObject o = json(kThinned + QStringLiteral(" --rate 3 --establishment-cost 1500"));
@@ -77,7 +78,7 @@ TEST_F(RotationCliTest, JsonCarriesEveryFigureAndTheyHoldTogether) {
 }
 
 TEST_F(RotationCliTest, ChosenRotationAndPriceListAreTheOnesUsed) {
-    const QString unthinned = QLatin1String(kStand) + QStringLiteral(" --rotation 50");
+    const QString unthinned = kStand + QStringLiteral(" --rotation 50");
     const QJsonObject longTerm = json(unthinned);
     EXPECT_EQ(longTerm[QStringLiteral("rotation")].toInt(), 50);
     EXPECT_TRUE(longTerm[QStringLiteral("thinnings")].toArray().isEmpty());
@@ -112,10 +113,11 @@ TEST_F(RotationCliTest, TableCarriesTheSameFiguresAsJson) {
 struct BadRotation {
     const char *arguments; ///< after the stand
     const char *complaint; ///< part of what stderr must say
+    const char *command = "rotation";
 };
 
 void PrintTo(const BadRotation &c, std::ostream *os) {
-    *os << c.arguments;
+    *os << c.command << ' ' << c.arguments;
 }
 
 class RotationCliBadArgumentsTest : public RotationCliTest,
@@ -123,7 +125,8 @@ class RotationCliBadArgumentsTest : public RotationCliTest,
 
 TEST_P(RotationCliBadArgumentsTest, ExitsWithTwoAndSaysWhy) {
     const Outcome r =
-        run(QLatin1String(kStand) + QLatin1Char(' ') + QLatin1String(GetParam().arguments));
+        run(QLatin1String(GetParam().command) + QLatin1Char(' ') + QLatin1String(kStandOptions) +
+            QLatin1Char(' ') + QLatin1String(GetParam().arguments));
     EXPECT_EQ(r.exitCode, 2);
     EXPECT_TRUE(r.out.isEmpty());
     EXPECT_TRUE(r.err.contains(QLatin1String(GetParam().complaint))) << r.err.toStdString();
@@ -155,5 +158,72 @@ TEST_F(RotationCliTest, UnthinnedModelRefusesARegime) {
     EXPECT_EQ(r.exitCode, 2);
     EXPECT_TRUE(r.err.contains(QLatin1String("has no thinning response"))) << r.err.toStdString();
 }
+
+} // namespace
+
+namespace {
+
+TEST_F(RotationCliTest, OptimisedRegimesGiveTheirFiguresBackToRotation) {
+    const QJsonObject o = json(QStringLiteral("optimise") + kThinned.mid(8) +
+                               QStringLiteral(" --rate 3 --establishment-cost 1500 --top 3"));
+    const QJsonArray best = o[QStringLiteral("best")].toArray();
+    ASSERT_EQ(best.size(), 3);
+    const QJsonObject first = best[0].toObject();
+    const QJsonObject current = o[QStringLiteral("current")].toObject();
+    EXPECT_EQ(current[QStringLiteral("thin_until")].toInt(), 35);
+    EXPECT_NEAR(o[QStringLiteral("gain")].toDouble(),
+                first[QStringLiteral("lev")].toDouble() - current[QStringLiteral("lev")].toDouble(),
+                0.011);
+    for (const QJsonValue &regime : best) {
+        const QJsonObject b = regime.toObject();
+        QString line = kStand + QStringLiteral(" --rate 3 --establishment-cost 1500");
+        if (!b[QStringLiteral("thin_from")].isNull()) {
+            for (const char *key : {"thin_from", "thin_every", "thin_volume", "thin_until"}) {
+                line += QStringLiteral(" --") +
+                        QString::fromLatin1(key).replace(QLatin1Char('_'), QLatin1Char('-')) +
+                        QLatin1Char(' ') + QString::number(b[QLatin1String(key)].toDouble());
+            }
+        }
+        line +=
+            QStringLiteral(" --rotation ") + QString::number(b[QStringLiteral("rotation")].toInt());
+        const QJsonObject again = json(line);
+        EXPECT_EQ(again[QStringLiteral("lev")], b[QStringLiteral("lev")]) << line.toStdString();
+        EXPECT_EQ(again[QStringLiteral("npv")], b[QStringLiteral("npv")]) << line.toStdString();
+    }
+}
+
+TEST_F(RotationCliTest, UncertaintyRepeatsWithItsSeed) {
+    const QString line =
+        kThinned + QStringLiteral(" --rate 3 --annual-cost 150 --draws 3000 --seed 7 "
+                                  "--price-spread 0.3 --rate-range 2 4");
+    const QJsonObject a = json(QStringLiteral("uncertainty") + line.mid(8));
+    const QJsonObject b = json(QStringLiteral("uncertainty") + line.mid(8));
+    EXPECT_EQ(a, b);
+    EXPECT_EQ(a[QStringLiteral("draws")].toInt(), 3000);
+    const double p = a[QStringLiteral("probability_npv_below_zero")].toDouble();
+    EXPECT_GE(p, 0.0);
+    EXPECT_LE(p, 1.0);
+    const QJsonObject npv = a[QStringLiteral("npv")].toObject();
+    EXPECT_LT(npv[QStringLiteral("p5")].toDouble(), npv[QStringLiteral("p95")].toDouble());
+    EXPECT_EQ(a[QStringLiteral("tornado")].toArray().size(), 4);
+    int draws = 0;
+    for (const QJsonValue &n :
+         a[QStringLiteral("histogram")].toObject()[QStringLiteral("counts")].toArray()) {
+        draws += n.toInt();
+    }
+    EXPECT_EQ(draws, 3000);
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    CliSearch, RotationCliBadArgumentsTest,
+    ::testing::Values(
+        BadRotation{"--objective profit", "--objective takes lev, npv or volume", "optimise"},
+        BadRotation{"--max-removal 150", "--max-removal is a percentage up to 100", "optimise"},
+        BadRotation{"--top 0", "--top must be a whole number from 1 to 100", "optimise"},
+        BadRotation{"--rate -2", "--rate must be above 0", "optimise"},
+        BadRotation{"--rate-range 4 2", "--rate-range: LO is above HI", "uncertainty"},
+        BadRotation{"--rate-range 0 3", "\"0\" is not a rate above 0", "uncertainty"},
+        BadRotation{"--rate-range 2", "--rate-range takes two rates", "uncertainty"},
+        BadRotation{"--rotation 70", "past the model's age limit 60", "uncertainty"}));
 
 } // namespace
