@@ -14,25 +14,46 @@ namespace {
 /// Revenue and cost by age of one rotation, and how to value them moved.
 class Flows {
 public:
-    Flows(const GrowthPath &path, int rotation, const Economics &economics)
-        : m_presentAge(path.presentAge) {
-        for (const CashFlowYear &c : valueRotation(path, rotation, economics).cashflow) {
-            m_revenue.push_back(c.revenue);
-            m_cost.push_back(c.cost);
-        }
-        m_net.resize(m_revenue.size());
-    }
-
     struct Value {
         std::optional<double> npv;
         std::optional<double> lev;
     };
 
+    Flows(const GrowthPath &path, int rotation, const Economics &economics)
+        : m_presentAge(path.presentAge), m_prices(economics.prices) {
+        const RotationValue v = valueRotation(path, rotation, economics);
+        for (const CashFlowYear &c : v.cashflow) {
+            m_revenue.push_back(c.revenue);
+            m_cost.push_back(c.cost);
+        }
+        m_harvests = v.thinnings;
+        m_harvests.push_back(v.finalCut);
+        m_net.resize(m_revenue.size());
+    }
+
+    /// Revenue by age with every harvest's volume, and so its mean tree, times
+    /// `volumeFactor`: the mean tree may move to another price class.
+    std::vector<double> revenueWithVolume(double volumeFactor) const {
+        std::vector<double> revenue(m_revenue.size(), 0.0);
+        for (const Harvest &h : m_harvests) {
+            const int k = priceClassOf(h.meanTreeVolume * volumeFactor);
+            revenue[static_cast<std::size_t>(h.age)] +=
+                volumeFactor * double{h.volume} * m_prices[static_cast<std::size_t>(k)];
+        }
+        return revenue;
+    }
+
     /// NPV and LEV with the revenue times `revenueFactor`, the costs times
     /// `costFactor`, at `ratePercent`.
     Value value(double revenueFactor, double costFactor, double ratePercent) {
+        return value(m_revenue, revenueFactor, costFactor, ratePercent);
+    }
+
+    /// The same with `revenue` by age in place of the rotation's own.
+    Value value(const std::vector<double> &revenue, double revenueFactor, double costFactor,
+                double ratePercent) {
         for (std::size_t a = 0; a < m_net.size(); ++a) {
-            m_net[a] = revenueFactor * m_revenue[a] - costFactor * m_cost[a];
+            m_net[a] = revenueFactor * revenue[a] - costFactor * m_cost[a];
         }
         const std::vector<double> fromPresent(m_net.begin() + m_presentAge, m_net.end());
         return {valuation::netPresentValue(fromPresent, ratePercent),
@@ -41,6 +62,8 @@ public:
 
 private:
     int m_presentAge;
+    PriceList m_prices;
+    std::vector<Harvest> m_harvests;
     std::vector<double> m_revenue;
     std::vector<double> m_cost;
     std::vector<double> m_net;
@@ -85,14 +108,17 @@ std::vector<TornadoBar> tornado(const GrowthPath &path, int rotation, const Econ
     };
     const Move moves[] = {{"timber prices \u00b120 %", 0.8, 1.2, 1.0, 1.0, r, r},
                           {"interest rate \u00b11 point", 1.0, 1.0, 1.0, 1.0, r - 1.0, r + 1.0},
-                          {"costs \u00b120 %", 1.0, 1.0, 0.8, 1.2, r, r},
-                          {"volume \u00b110 %", 0.9, 1.1, 1.0, 1.0, r, r}};
+                          {"costs \u00b120 %", 1.0, 1.0, 0.8, 1.2, r, r}};
     std::vector<TornadoBar> bars;
     for (const Move &m : moves) {
         const Flows::Value low = flows.value(m.revenueLow, m.costLow, m.rateLow);
         const Flows::Value high = flows.value(m.revenueHigh, m.costHigh, m.rateHigh);
         bars.push_back({m.factor, low.npv, high.npv, low.lev, high.lev});
     }
+    // Volume moves the mean trees too, so it is valued harvest by harvest.
+    const Flows::Value low = flows.value(flows.revenueWithVolume(0.9), 1.0, 1.0, r);
+    const Flows::Value high = flows.value(flows.revenueWithVolume(1.1), 1.0, 1.0, r);
+    bars.push_back({"volume \u00b110 %", low.npv, high.npv, low.lev, high.lev});
     return bars;
 }
 

@@ -25,7 +25,8 @@ struct TornadoBar {
 };
 
 /// The tornado of the rotation felled at `rotation` on `path`. Volume moves
-/// the revenue of every harvest in proportion, at its mean tree's price class.
+/// every harvest's volume and mean tree in proportion (the stems stay), so a
+/// mean tree may change its price class.
 std::vector<TornadoBar> tornado(const GrowthPath &path, int rotation, const Economics &economics);
 
 struct MonteCarloSettings {
