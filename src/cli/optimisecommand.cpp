@@ -10,6 +10,10 @@
 #include <QJsonDocument>
 #include <QJsonObject>
 
+#include <cstdio>
+
+#include <unistd.h>
+
 namespace arbolex::cli {
 
 namespace {
@@ -106,9 +110,21 @@ int runOptimise(CommandContext &context) {
         current = rotation::scoreRotation(*grown.path, in.regime, grown.rotation, in.economics,
                                           settings.objective);
     }
+    // A person watching a terminal sees the search advance; a script's stderr
+    // carries only messages.
+    rotation::Progress progress;
+    if (isatty(fileno(stderr)) != 0) {
+        progress = [&context](double fraction) {
+            context.err << "\roptimise: " << qRound(fraction * 100.0) << " %" << Qt::flush;
+            if (fraction >= 1.0) {
+                context.err << '\n';
+            }
+            return true;
+        };
+    }
     rotation::GrowthFailure failure;
     const std::optional<rotation::OptimiserResult> result =
-        rotation::optimise(grow, in.stand, in.economics, settings, failure);
+        rotation::optimise(grow, in.stand, in.economics, settings, failure, progress);
     if (!result) {
         context.err << "arbolex-cli optimise: " << QString::fromStdString(failure.text) << '\n';
         return failure.badInput ? kExitBadArguments : kExitEngineFailure;
