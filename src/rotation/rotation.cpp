@@ -1,7 +1,6 @@
 #include "rotation/rotation.hpp"
 
 #include "rotation/optimiser.hpp"
-
 #include "rotation/yieldclass.hpp"
 #include "valuation/discounting.hpp"
 
@@ -119,8 +118,12 @@ std::vector<Harvest> harvests(const GrowthPath &path, int rotation, const Econom
         }
     }
     const engine::StandState &s = path.at(rotation);
-    finalCut = {rotation, s.volume, s.stocking, s.basalArea, shownMeanTree(s.volume, s.stocking),
-                0,        0.0};
+    finalCut = {};
+    finalCut.age = rotation;
+    finalCut.volume = s.volume;
+    finalCut.stocking = s.stocking;
+    finalCut.basalArea = s.basalArea;
+    finalCut.meanTreeVolume = shownMeanTree(s.volume, s.stocking);
     finalCut.priceClass = priceClassOf(finalCut.meanTreeVolume);
     price(finalCut, economics.prices);
     all.push_back(finalCut);
