@@ -30,7 +30,7 @@ QString overview() {
                                   "\n"
                                   "commands:\n");
     for (const Command &c : commands()) {
-        text += QStringLiteral("  ") + c.name.leftJustified(10) + c.summary + QLatin1Char('\n');
+        text += QStringLiteral("  ") + c.name.leftJustified(12) + c.summary + QLatin1Char('\n');
     }
     text += QStringLiteral(
         "\n"

@@ -227,3 +227,20 @@ INSTANTIATE_TEST_SUITE_P(
         BadRotation{"--rotation 70", "past the model's age limit 60", "uncertainty"}));
 
 } // namespace
+
+namespace {
+
+TEST_F(RotationCliTest, OverviewAndHelpNameTheRotationCommands) {
+    const QString overview = run(QStringLiteral("--help")).out.join(QLatin1Char('\n'));
+    for (const char *line : {"  rotation    a regime grown", "  optimise    the best thinning",
+                             "  uncertainty Monte Carlo"}) {
+        EXPECT_TRUE(overview.contains(QLatin1String(line))) << line;
+    }
+    const Outcome help = run(QStringLiteral("optimise --help"));
+    EXPECT_EQ(help.exitCode, 0);
+    for (const char *option : {"--thin-until", "--max-removal", "--prices", "--objective"}) {
+        EXPECT_TRUE(help.out.join(QLatin1Char('\n')).contains(QLatin1String(option))) << option;
+    }
+}
+
+} // namespace
