@@ -47,5 +47,8 @@ Command thinCommand();
 Command growCommand();
 Command runCommand();
 Command assortCommand();
+Command rotationCommand();
+Command optimiseCommand();
+Command uncertaintyCommand();
 
 } // namespace arbolex::cli

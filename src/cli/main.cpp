@@ -16,8 +16,10 @@ using arbolex::cli::Command;
 /// entry here (and its file).
 const std::vector<Command> &commands() {
     static const std::vector<Command> table = {
-        arbolex::cli::projectCommand(), arbolex::cli::thinCommand(), arbolex::cli::growCommand(),
-        arbolex::cli::assortCommand(),  arbolex::cli::runCommand(),
+        arbolex::cli::projectCommand(),     arbolex::cli::thinCommand(),
+        arbolex::cli::growCommand(),        arbolex::cli::assortCommand(),
+        arbolex::cli::rotationCommand(),    arbolex::cli::optimiseCommand(),
+        arbolex::cli::uncertaintyCommand(), arbolex::cli::runCommand(),
     };
     return table;
 }
@@ -28,7 +30,7 @@ QString overview() {
                                   "\n"
                                   "commands:\n");
     for (const Command &c : commands()) {
-        text += QStringLiteral("  ") + c.name.leftJustified(10) + c.summary + QLatin1Char('\n');
+        text += QStringLiteral("  ") + c.name.leftJustified(12) + c.summary + QLatin1Char('\n');
     }
     text += QStringLiteral(
         "\n"

@@ -6,6 +6,7 @@
 
 #include "cli/options.hpp"
 #include "engine/grow.hpp"
+#include "rotation/rotation.hpp"
 #include "shell/errorlog.hpp"
 
 #include <QTextStream>
@@ -36,14 +37,8 @@ private:
 
 /// A sub-compartment as typed: model, age (years), stocking (stems/ha), top
 /// height (m) and basal area (m²/ha), the latter given directly or from the
-/// mean diameter.
-struct StandInput {
-    std::int16_t model = 0;
-    float age = 0.0f;
-    float stocking = 0.0f;
-    float height = 0.0f;
-    float basalArea = 0.0f;
-};
+/// mean diameter. The stand a rotation starts from.
+using StandInput = rotation::Stand;
 
 /// The option names of the stand, without their dashes.
 std::vector<const char *> standOptionNames();

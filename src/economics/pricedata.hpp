@@ -1,5 +1,7 @@
 #pragma once
 
+#include "rotation/priceclasses.hpp"
+
 #include <QString>
 
 #include <array>
@@ -11,12 +13,10 @@ class ErrorLog;
 
 namespace arbolex::economics {
 
-/// Number of mean-tree-volume classes of a price list.
-inline constexpr int kPriceClassCount = 13;
-
+using rotation::kPriceClassCount;
 /// Thirteen standing timber prices, euro per m³, indexed 0 to 12 by mean tree
 /// volume class (the classes are the captions kTimberCategoryCaptions).
-using PriceList = std::array<double, kPriceClassCount>;
+using rotation::PriceList;
 
 /// One of the five user-defined assortment categories.
 struct UserCategory {

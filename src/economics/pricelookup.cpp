@@ -13,14 +13,18 @@ constexpr QLatin1String
 /// Statement numbers of the three caption conversions.
 enum LookupLine : int { kFirstUpperBound = 10, kLowerBound = 20, kUpperBound = 30 };
 
+QString boundText(std::string_view text) {
+    return QString::fromLatin1(text.data(), static_cast<qsizetype>(text.size()));
+}
+
 /// Upper bound text of a caption: of its last 5 characters, the first 4.
 QString upperBoundText(QLatin1String caption) {
-    return {caption.right(5).left(4)};
+    return boundText(rotation::upperBoundText({caption.data(), std::size_t(caption.size())}));
 }
 
 /// Lower bound text of a caption: its first 4 characters.
 QString lowerBoundText(QLatin1String caption) {
-    return {caption.left(4)};
+    return boundText(rotation::lowerBoundText({caption.data(), std::size_t(caption.size())}));
 }
 
 void showFailure(const PriceClassWalk &walk, shell::IInteractive &interactive) {

@@ -15,15 +15,18 @@ class IInteractive;
 namespace arbolex::economics {
 
 /// Captions of the 13 mean-tree-volume classes (m³ per tree), shown by the
-/// timber prices window as `lblTimbCat`(0 to 12). The price lookup reads the
-/// class bounds back from these texts, so they are part of the design: the
-/// bounds have three decimals and leave gaps of 0.001 m³ between classes.
-inline constexpr std::array<QLatin1String, kPriceClassCount> kTimberCategoryCaptions = {
-    QLatin1String("Up to .074:"),    QLatin1String(".075 to .124:"), QLatin1String(".125 to .174:"),
-    QLatin1String(".175 to .224:"),  QLatin1String(".225 to .274:"), QLatin1String(".275 to .424:"),
-    QLatin1String(".425 to .499:"),  QLatin1String(".500 to .599:"), QLatin1String(".600 to .699:"),
-    QLatin1String(".700 to .799:"),  QLatin1String(".800 to .899:"), QLatin1String(".900 to .999:"),
-    QLatin1String("1.000 and Over:")};
+/// timber prices window as `lblTimbCat`(0 to 12): the texts of
+/// rotation::kTimberCategoryCaptions. The price lookup reads the class bounds
+/// back from these texts, so they are part of the design: the bounds have
+/// three decimals and leave gaps of 0.001 m³ between classes.
+inline constexpr std::array<QLatin1String, kPriceClassCount> kTimberCategoryCaptions = [] {
+    std::array<QLatin1String, kPriceClassCount> captions{};
+    for (std::size_t i = 0; i < captions.size(); ++i) {
+        const std::string_view text = rotation::kTimberCategoryCaptions[i];
+        captions[i] = QLatin1String(text.data(), static_cast<qsizetype>(text.size()));
+    }
+    return captions;
+}();
 
 /// Outcome of walking the class captions for one mean tree volume.
 struct PriceClassWalk {

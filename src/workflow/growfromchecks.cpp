@@ -1,5 +1,6 @@
 // The grow-from fields: the key filter, the lost-focus handlers that show the
 // site index, the form and range checks, and reading and writing the values.
+#include "rotation/rotation.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
@@ -123,7 +124,7 @@ bool MainWindowLogic::ChkGrowFromFlds() {
 }
 
 int MainWindowLogic::maxTargetAge() const {
-    return m_grow.modelId() == 7 ? 58 : 60;
+    return rotation::modelAgeLimit(m_grow.modelId());
 }
 
 bool MainWindowLogic::ChkGrowFromBnds() {

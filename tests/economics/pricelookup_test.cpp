@@ -4,6 +4,7 @@
 
 #include "economics/pricelookup.hpp"
 #include "economics/prices.hpp"
+#include "rotation/priceclasses.hpp"
 
 #include <gtest/gtest.h>
 
@@ -45,6 +46,7 @@ TEST(PriceLookupTest, ClassOfMeanTreeVolume) {
         EXPECT_EQ(TrouveIndicePrix(c.volume, classPrices(), ui, english), 100.0 + c.priceClass)
             << c.volume;
         EXPECT_EQ(priceClassOf(c.volume, ui, english), c.priceClass) << c.volume;
+        EXPECT_EQ(rotation::priceClassOf(c.volume), c.priceClass) << c.volume;
     }
     EXPECT_TRUE(ui.messages.isEmpty());
 
@@ -55,6 +57,21 @@ TEST(PriceLookupTest, ClassOfMeanTreeVolume) {
     ASSERT_EQ(ui.messages.size(), 2);
     EXPECT_EQ(ui.messages[0].text, QStringLiteral("Error 13  Type mismatch in line 10 in "
                                                   "procedure TrouveIndicePrix of Feuille frmMain"));
+}
+
+TEST(PriceLookupTest, RotationsClassEveryVolumeAsTheWindowsDo) {
+    // Every volume to the half litre, bounds, gaps and beyond, under a locale
+    // that reads the captions and under one that does not: a rotation reads
+    // the captions without a locale.
+    testing::FakeInteractive ui;
+    const QLocale english(QLocale::English, QLocale::UnitedStates);
+    const QLocale german(QLocale::German, QLocale::Germany);
+    for (int halfLitres = -2; halfLitres <= 2400; ++halfLitres) {
+        const double volume = halfLitres * 0.0005;
+        EXPECT_EQ(rotation::priceClassOf(volume), priceClassOf(volume, ui, english)) << volume;
+    }
+    EXPECT_EQ(rotation::priceClassOf(0.5), 7);
+    EXPECT_EQ(priceClassOf(0.5, ui, german), 0);
 }
 
 TEST(PriceLookupTest, PricesInUseAreAbsoluteButTheLookupKeepsTheSign) {

@@ -1,8 +1,8 @@
-#include "workflow/yieldclass.hpp"
+#include "rotation/yieldclass.hpp"
 
 #include <cmath>
 
-namespace arbolex::workflow {
+namespace arbolex::rotation {
 
 int yieldClass(const std::vector<double> &meanAnnualIncrements) {
     bool culminated = false;
@@ -23,4 +23,4 @@ int yieldClass(const std::vector<double> &meanAnnualIncrements) {
     return rounded % 2 == 1 ? rounded + 1 : rounded;
 }
 
-} // namespace arbolex::workflow
+} // namespace arbolex::rotation

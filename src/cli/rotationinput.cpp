@@ -1,0 +1,179 @@
+#include "cli/rotationinput.hpp"
+
+#include "cli/command.hpp"
+#include "economics/prices.hpp"
+#include "shell/errorlog.hpp"
+#include "shell/settings.hpp"
+#include "valuation/discounting.hpp"
+
+#include <algorithm>
+#include <iterator>
+
+namespace arbolex::cli {
+
+namespace {
+
+/// Ages and intervals of a regime, years.
+constexpr int kLongestAge = 200;
+
+struct PriceChoice {
+    const char *word;
+    economics::PriceSet set;
+};
+
+constexpr PriceChoice kPriceChoices[] = {{"current", economics::kCurrentPrices},
+                                         {"user", economics::kUserPrices},
+                                         {"longterm", economics::kLongTermPrices},
+                                         {"private", economics::kPrivatePrices}};
+
+double cost(const Options &options, const char *name) {
+    if (!options.has(name)) {
+        return 0.0;
+    }
+    const double c = options.number(name);
+    if (c < 0.0) {
+        throw UsageError{QStringLiteral("--") + QLatin1String(name) +
+                         QStringLiteral(" must not be negative")};
+    }
+    return c;
+}
+
+} // namespace
+
+std::vector<const char *> regimeOptionNames() {
+    return {"thin-from", "thin-every", "thin-volume", "thin-until"};
+}
+
+QString regimeOptionsHelp() {
+    return QStringLiteral(
+        "  --thin-from AGE     age of the first thinning, years (no thinning without it)\n"
+        "  --thin-every YEARS  years between thinnings\n"
+        "  --thin-volume M3    volume each thinning removes, m3/ha\n"
+        "  --thin-until AGE    age of the last thinning (default: up to the final cut)\n");
+}
+
+rotation::Regime readRegime(const Options &options) {
+    rotation::Regime regime;
+    if (!options.has("thin-from") && !options.has("thin-every") && !options.has("thin-volume") &&
+        !options.has("thin-until")) {
+        return regime;
+    }
+    regime.thinFrom = options.wholeNumber("thin-from", 1, kLongestAge);
+    regime.thinEvery = options.wholeNumber("thin-every", 1, kLongestAge);
+    regime.thinVolume = options.positive("thin-volume");
+    if (options.has("thin-until")) {
+        regime.thinUntil = options.wholeNumber("thin-until", 1, kLongestAge);
+    }
+    return regime;
+}
+
+std::vector<const char *> economicsOptionNames() {
+    return {"rate", "establishment-cost", "annual-cost", "prices"};
+}
+
+QString economicsOptionsHelp() {
+    return QStringLiteral("  --rate P                  interest rate, percent, above 0 (default ") +
+           QString::number(shell::kDefaultInterestRate) +
+           QStringLiteral(
+               ")\n"
+               "  --establishment-cost C    cost at age 0, euro/ha (default 0)\n"
+               "  --annual-cost C           cost of every year, euro/ha (default 0)\n"
+               "  --prices current|user|longterm|private\n"
+               "                            price list (default longterm: the long-term\n"
+               "                            average prices the net present value uses)\n");
+}
+
+rotation::Economics readEconomics(const Options &options, const QString &dataFolder) {
+    rotation::Economics economics;
+    economics.ratePercent =
+        options.has("rate") ? options.number("rate") : shell::kDefaultInterestRate;
+    if (!(economics.ratePercent > 0.0)) {
+        throw UsageError{
+            QStringLiteral("--rate must be above 0: the land expectation value needs interest")};
+    }
+    economics.establishmentCost = cost(options, "establishment-cost");
+    economics.annualCost = cost(options, "annual-cost");
+    economics::PriceSet set = economics::kLongTermPrices;
+    if (options.has("prices")) {
+        const QString word = options.text("prices");
+        const auto found =
+            std::find_if(std::begin(kPriceChoices), std::end(kPriceChoices),
+                         [&](const PriceChoice &c) { return word == QLatin1String(c.word); });
+        if (found == std::end(kPriceChoices)) {
+            throw UsageError{QStringLiteral("--prices takes current, user, longterm or private")};
+        }
+        set = found->set;
+    }
+    economics::Prices prices;
+    shell::ErrorLog log(dataFolder);
+    economics::GetPricesFromFiles(dataFolder, prices.data(), log);
+    prices.selectPriceSet(set);
+    economics.prices = prices.pricesInUse();
+    return economics;
+}
+
+QString readFormat(const Options &options) {
+    const QString format = options.has("format") ? options.text("format") : QStringLiteral("tsv");
+    if (format != QLatin1String("tsv") && format != QLatin1String("json")) {
+        throw UsageError{QStringLiteral("--format takes tsv or json")};
+    }
+    return format;
+}
+
+std::vector<const char *> rotationOptionNames(std::initializer_list<const char *> more) {
+    std::vector<const char *> known = standOptionNames();
+    for (const auto &names : {regimeOptionNames(), economicsOptionNames()}) {
+        known.insert(known.end(), names.begin(), names.end());
+    }
+    known.insert(known.end(), {"rotation", "format"});
+    known.insert(known.end(), more.begin(), more.end());
+    return known;
+}
+
+RotationInput readRotationInput(const Options &options, const QString &dataFolder) {
+    RotationInput input;
+    input.stand = readStand(options);
+    input.regime = readRegime(options);
+    if (options.has("rotation")) {
+        input.rotation = options.wholeNumber("rotation", 1, kLongestAge);
+    }
+    input.format = readFormat(options);
+    input.economics = readEconomics(options, dataFolder);
+    return input;
+}
+
+void writeRotationPreamble(QTextStream &out, const engine::Grow &grow, double ratePercent) {
+    writePreamble(out, grow, true);
+    out << "# rate\t" << formatNumber(ratePercent) << '\n';
+}
+
+GrownRotation growRotation(engine::Grow &grow, const RotationInput &input, const QString &command,
+                           QTextStream &err) {
+    auto refuse = [&](const std::string &text) {
+        err << "arbolex-cli " << command << ": " << QString::fromStdString(text) << '\n';
+    };
+    rotation::GrowthFailure failure;
+    std::optional<rotation::GrowthPath> path =
+        rotation::growPath(grow, input.stand, input.regime, failure);
+    if (!path) {
+        refuse(failure.text);
+        return {std::nullopt, 0, failure.badInput ? kExitBadArguments : kExitEngineFailure};
+    }
+    const int age = input.rotation.value_or(
+        rotation::exploreRotations(*path, input.regime, input.economics).economicRotation);
+    if (const auto problem = rotation::rotationProblem(*path, input.regime, age)) {
+        refuse(*problem);
+        return {std::nullopt, 0, kExitBadArguments};
+    }
+    return {std::move(path), age, kExitSuccess};
+}
+
+QJsonValue moneyJson(const std::optional<double> &euro) {
+    return euro ? QJsonValue(valuation::roundToCents(*euro)) : QJsonValue(QJsonValue::Null);
+}
+
+QString moneyText(const std::optional<double> &euro) {
+    return euro ? formatNumber(valuation::roundToCents(*euro)) : QString();
+}
+
+} // namespace arbolex::cli

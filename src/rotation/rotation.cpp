@@ -1,0 +1,377 @@
+#include "rotation/rotation.hpp"
+
+#include "rotation/optimiser.hpp"
+#include "rotation/yieldclass.hpp"
+#include "valuation/discounting.hpp"
+
+#include <algorithm>
+#include <cmath>
+#include <cstdio>
+#include <limits>
+
+namespace arbolex::rotation {
+
+namespace {
+
+std::string ageText(int age) {
+    return std::to_string(age);
+}
+
+/// Volume, m³, written with two decimals as the thinning window shows it.
+std::string volumeText(float volume) {
+    char text[32];
+    std::snprintf(text, sizeof text, "%.2f", static_cast<double>(volume));
+    return text;
+}
+
+/// Last thinning age the regime names below `ageLimit`, or std::nullopt.
+std::optional<int> lastThinningAge(const Regime &regime, int ageLimit) {
+    if (!regime.thins()) {
+        return std::nullopt;
+    }
+    const int last = std::min(regime.thinUntil.value_or(ageLimit - 1), ageLimit - 1);
+    if (last < regime.thinFrom) {
+        return std::nullopt;
+    }
+    return regime.thinFrom + (last - regime.thinFrom) / regime.thinEvery * regime.thinEvery;
+}
+
+/// Mean tree volume, m³: volume over the whole number of trees, 0 without trees.
+double meanTree(float volume, float stocking) {
+    const double trees = std::nearbyint(double{stocking});
+    return trees > 0.0 ? double{volume} / trees : 0.0;
+}
+
+/// The final cut's mean tree as the projection table shows it, to the litre:
+/// its price class is read from that figure.
+double shownMeanTree(float volume, float stocking) {
+    return std::round(meanTree(volume, stocking) * 1000.0) / 1000.0;
+}
+
+/// Stand volume removed by the thinnings before `age`, m³/ha.
+double removedBefore(const GrowthPath &path, int age) {
+    double removed = 0.0;
+    for (const Harvest &t : path.thinnings) {
+        if (t.age < age) {
+            removed += double{t.volume};
+        }
+    }
+    return removed;
+}
+
+double meanAnnualIncrement(const GrowthPath &path, int age) {
+    return age > 0 ? (double{path.at(age).volume} + removedBefore(path, age)) / age : 0.0;
+}
+
+/// Cash flow by age 0..rotation and the harvests valued at `economics.prices`.
+struct Flows {
+    std::vector<double> revenue;
+    std::vector<double> cost;
+    std::vector<double> net;
+};
+
+Flows cashFlows(const std::vector<Harvest> &harvests, int rotation, const Economics &economics) {
+    const auto years = static_cast<std::size_t>(rotation) + 1;
+    Flows f{std::vector<double>(years, 0.0), std::vector<double>(years, 0.0), {}};
+    for (std::size_t a = 0; a < years; ++a) {
+        f.cost[a] = a == 0 ? economics.establishmentCost : economics.annualCost;
+    }
+    for (const Harvest &h : harvests) {
+        f.revenue[static_cast<std::size_t>(h.age)] += h.revenue;
+    }
+    f.net.resize(years);
+    for (std::size_t a = 0; a < years; ++a) {
+        f.net[a] = f.revenue[a] - f.cost[a];
+    }
+    return f;
+}
+
+struct Figures {
+    std::optional<double> npv;
+    std::optional<double> lev;
+    std::optional<double> forestValue;
+};
+
+Figures figures(const Flows &f, int presentAge, double ratePercent) {
+    Figures out;
+    const std::vector<double> fromPresent(f.net.begin() + presentAge, f.net.end());
+    out.npv = valuation::netPresentValue(fromPresent, ratePercent);
+    out.lev = valuation::landExpectationValue(f.net, ratePercent);
+    if (out.lev) {
+        out.forestValue = valuation::forestValue(fromPresent, *out.lev, ratePercent);
+    }
+    return out;
+}
+
+void price(Harvest &h, const PriceList &prices) {
+    h.revenue = double{h.volume} * prices[static_cast<std::size_t>(h.priceClass)];
+}
+
+/// Thinnings before `rotation` and the final cut at it, valued.
+std::vector<Harvest> harvests(const GrowthPath &path, int rotation, const Economics &economics,
+                              Harvest &finalCut) {
+    std::vector<Harvest> all;
+    for (const Harvest &t : path.thinnings) {
+        if (t.age < rotation) {
+            all.push_back(t);
+            price(all.back(), economics.prices);
+        }
+    }
+    const engine::StandState &s = path.at(rotation);
+    finalCut = {};
+    finalCut.age = rotation;
+    finalCut.volume = s.volume;
+    finalCut.stocking = s.stocking;
+    finalCut.basalArea = s.basalArea;
+    finalCut.meanTreeVolume = shownMeanTree(s.volume, s.stocking);
+    finalCut.priceClass = priceClassOf(finalCut.meanTreeVolume);
+    price(finalCut, economics.prices);
+    all.push_back(finalCut);
+    return all;
+}
+
+} // namespace
+
+int modelAgeLimit(std::int16_t model) {
+    return model == 7 ? 58 : 60;
+}
+
+std::optional<std::string> regimeProblem(const Regime &regime, int presentAge, int ageLimit) {
+    if (!regime.thins()) {
+        return std::nullopt;
+    }
+    if (regime.thinEvery < 1) {
+        return "the years between thinnings must be 1 or more";
+    }
+    if (!(regime.thinVolume > 0.0f)) {
+        return "the volume of a thinning must be above 0 m3/ha";
+    }
+    if (regime.thinFrom < presentAge) {
+        return "the first thinning (age " + ageText(regime.thinFrom) +
+               ") is before the present age " + ageText(presentAge);
+    }
+    if (regime.thinFrom >= ageLimit) {
+        return "the first thinning (age " + ageText(regime.thinFrom) +
+               ") is not before the model's age limit " + ageText(ageLimit);
+    }
+    if (regime.thinUntil && *regime.thinUntil < regime.thinFrom) {
+        return "the last thinning (age " + ageText(*regime.thinUntil) +
+               ") is before the first (age " + ageText(regime.thinFrom) + ")";
+    }
+    return std::nullopt;
+}
+
+std::optional<std::string> rotationProblem(const GrowthPath &path, const Regime &regime,
+                                           int rotation) {
+    if (rotation > path.ageLimit) {
+        return "the rotation (age " + ageText(rotation) + ") is past the model's age limit " +
+               ageText(path.ageLimit);
+    }
+    if (rotation < path.presentAge || rotation < 1) {
+        return "the rotation (age " + ageText(rotation) + ") is before the present age " +
+               ageText(path.presentAge);
+    }
+    if (regime.thins()) {
+        // Without a last thinning the regime stops before the final cut by
+        // itself; with one, every thinning it names must come before it.
+        const int thinsAt = regime.thinUntil
+                                ? regime.thinFrom + (*regime.thinUntil - regime.thinFrom) /
+                                                        regime.thinEvery * regime.thinEvery
+                                : regime.thinFrom;
+        if (thinsAt >= rotation) {
+            return "the regime thins at age " + ageText(thinsAt) +
+                   ", not before the final cut at age " + ageText(rotation);
+        }
+    }
+    return std::nullopt;
+}
+
+std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const Regime &regime,
+                                   GrowthFailure &failure, const ThinningLimits *limits) {
+    const unsigned faultsBefore = grow.faultCount();
+    auto engineFailed = [&](std::string text) {
+        failure = {false, std::move(text)};
+        return std::nullopt;
+    };
+    grow.GetModel(stand.model);
+    // The correction factor follows the site index current at selection.
+    grow.GetVCF();
+    GrowthPath path;
+    path.ageLimit = modelAgeLimit(stand.model);
+    if (!grow.SiteIndex(stand.age, stand.height) || grow.faultCount() != faultsBefore) {
+        return engineFailed("the site index of the stand could not be computed");
+    }
+    float siteIndex = grow.siteIndex();
+    path.siteIndex = siteIndex;
+    grow.TM(siteIndex);
+    float age = stand.age;
+    float basalArea = stand.basalArea;
+    float stocking = stand.stocking;
+    float height = stand.height;
+    auto target = static_cast<float>(path.ageLimit);
+    grow.STATEYR(age, basalArea, stocking, height, target, siteIndex);
+    path.presentAge = static_cast<int>(age);
+    if (path.presentAge > path.ageLimit) {
+        failure = {true, "the stand (age " + ageText(path.presentAge) +
+                             ") is past the model's age limit " + ageText(path.ageLimit)};
+        return std::nullopt;
+    }
+    if (const auto problem = regimeProblem(regime, path.presentAge, path.ageLimit)) {
+        failure = {true, *problem};
+        return std::nullopt;
+    }
+    if (regime.thins() && grow.T(1) == 0.0) {
+        failure = {true, "model " + ageText(stand.model) + " (" + grow.label() +
+                             ") has no thinning response: it cannot be thinned"};
+        return std::nullopt;
+    }
+    path.years.push_back(
+        {age, basalArea, stocking, height, grow.GetV7(basalArea, stocking, height)});
+
+    const std::optional<int> lastThinning = lastThinningAge(regime, path.ageLimit);
+    int nextThinning = regime.thinFrom;
+    // Where growth goes on from: the last state recorded, or the stand just
+    // thinned (the record of a thinning age keeps the crop before it).
+    engine::StandState current = path.years.back();
+    std::vector<engine::StandState> states;
+    while (true) {
+        const bool thinning = lastThinning && nextThinning <= *lastThinning;
+        const int stop = thinning ? nextThinning : path.ageLimit;
+        if (stop > static_cast<int>(current.age)) {
+            states.clear();
+            if (!grow.PROJ(current.age, current.basalArea, current.stocking, current.topHeight,
+                           static_cast<float>(stop), 1.0f, states) ||
+                grow.faultCount() != faultsBefore) {
+                return engineFailed("the projection to age " + ageText(stop) +
+                                    " could not be completed");
+            }
+            // The first state is where the projection started from.
+            path.years.insert(path.years.end(), states.begin() + 1, states.end());
+            current = path.years.back();
+        }
+        if (!thinning) {
+            break;
+        }
+        if (limits != nullptr &&
+            double{regime.thinVolume} > limits->maxRemovalShare * double{current.volume}) {
+            break;
+        }
+        const float residualVolume = current.volume - regime.thinVolume;
+        if (!(residualVolume > 0.0f)) {
+            failure = {true, "the thinning at age " + ageText(stop) + " removes " +
+                                 volumeText(regime.thinVolume) + " m3/ha of the " +
+                                 volumeText(current.volume) + " m3/ha standing"};
+            return std::nullopt;
+        }
+        float residualStocking = 0.0f;
+        float residualBasalArea = 0.0f;
+        if (!grow.NEWTON(current.stocking, current.basalArea, current.topHeight, residualVolume,
+                         residualStocking, residualBasalArea) ||
+            grow.faultCount() != faultsBefore || !(residualStocking > 0.0f) ||
+            !(residualBasalArea > 0.0f)) {
+            return engineFailed("the thinning response could not remove " +
+                                volumeText(regime.thinVolume) + " m3/ha at age " + ageText(stop));
+        }
+        if (limits != nullptr && residualStocking < limits->minStocking) {
+            break;
+        }
+        Harvest t;
+        t.age = stop;
+        t.volume = current.volume - residualVolume;
+        t.stocking = current.stocking - residualStocking;
+        t.basalArea = current.basalArea - residualBasalArea;
+        t.meanTreeVolume = meanTree(t.volume, t.stocking);
+        t.priceClass = priceClassOf(t.meanTreeVolume);
+        path.thinnings.push_back(t);
+        current = {current.age, residualBasalArea, residualStocking, current.topHeight,
+                   residualVolume};
+        nextThinning += regime.thinEvery;
+    }
+    return path;
+}
+
+RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics) {
+    RotationValue v;
+    v.rotation = rotation;
+    std::vector<Harvest> all = harvests(path, rotation, economics, v.finalCut);
+    v.thinnings.assign(all.begin(), all.end() - 1);
+    const Flows f = cashFlows(all, rotation, economics);
+    for (int a = 0; a <= rotation; ++a) {
+        const auto i = static_cast<std::size_t>(a);
+        v.cashflow.push_back({a, f.cost[i], f.revenue[i]});
+    }
+    v.mai = meanAnnualIncrement(path, rotation);
+    std::vector<double> mai;
+    for (int a = path.presentAge; a <= rotation; ++a) {
+        mai.push_back(meanAnnualIncrement(path, a));
+    }
+    v.yieldClass = yieldClass(mai);
+    const Figures fig = figures(f, path.presentAge, economics.ratePercent);
+    v.npv = fig.npv;
+    v.lev = fig.lev;
+    v.forestValue = fig.forestValue;
+    if (v.lev) {
+        v.eaa = valuation::equivalentAnnualAnnuity(*v.lev, economics.ratePercent);
+    }
+    v.irr = valuation::internalRateOfReturn(f.net);
+    v.breakEvenPriceFactor =
+        valuation::breakEvenPriceFactor(f.revenue, f.cost, economics.ratePercent);
+    return v;
+}
+
+int firstRotation(const GrowthPath &path, const Regime &regime) {
+    const std::optional<int> last =
+        regime.thinUntil ? lastThinningAge(regime, path.ageLimit)
+                         : (regime.thins() ? std::optional<int>(regime.thinFrom) : std::nullopt);
+    return std::max({path.presentAge, last ? *last + 1 : 0, 1});
+}
+
+RotationExplorer exploreRotations(const GrowthPath &path, const Regime &regime,
+                                  const Economics &economics) {
+    RotationExplorer e;
+    double bestMai = -std::numeric_limits<double>::infinity();
+    double bestLev = -std::numeric_limits<double>::infinity();
+    for (int r = firstRotation(path, regime); r <= path.ageLimit; ++r) {
+        Harvest finalCut;
+        const Flows f = cashFlows(harvests(path, r, economics, finalCut), r, economics);
+        const Figures fig = figures(f, path.presentAge, economics.ratePercent);
+        RotationRow row{r,       finalCut.volume, meanAnnualIncrement(path, r),
+                        fig.npv, fig.lev,         fig.forestValue};
+        // The earliest age wins a tie.
+        if (row.mai > bestMai) {
+            bestMai = row.mai;
+            e.biologicalRotation = r;
+        }
+        if (row.lev && *row.lev > bestLev) {
+            bestLev = *row.lev;
+            e.economicRotation = r;
+        }
+        e.rows.push_back(row);
+    }
+    return e;
+}
+
+Candidate scoreRotation(const GrowthPath &path, const Regime &regime, int rotation,
+                        const Economics &economics, Objective objective) {
+    Candidate c;
+    c.rotation = rotation;
+    Harvest finalCut;
+    const std::vector<Harvest> all = harvests(path, rotation, economics, finalCut);
+    c.regime = regime;
+    if (all.size() > 1) {
+        c.regime.thinUntil = all[all.size() - 2].age;
+    } else {
+        c.regime = {};
+    }
+    c.volume = meanAnnualIncrement(path, rotation) * rotation;
+    const Figures fig =
+        figures(cashFlows(all, rotation, economics), path.presentAge, economics.ratePercent);
+    c.npv = fig.npv.value_or(-std::numeric_limits<double>::infinity());
+    c.lev = fig.lev.value_or(-std::numeric_limits<double>::infinity());
+    c.score = objective == Objective::kLev   ? c.lev
+              : objective == Objective::kNpv ? c.npv
+                                             : c.volume;
+    return c;
+}
+
+} // namespace arbolex::rotation

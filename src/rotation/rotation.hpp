@@ -1,0 +1,214 @@
+#pragma once
+
+// A rotation: a regime applied to the present stand (thinnings that remove a
+// given volume per ha, then the final cut), grown by the engine and valued
+// from its yearly cash flow. One library for every caller: the economics
+// window, the optimiser and the command-line program (docs/economics.md).
+
+#include "engine/grow.hpp"
+#include "engine/standstate.hpp"
+#include "rotation/priceclasses.hpp"
+#include "valuation/forestvalue.hpp"
+
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace arbolex::rotation {
+
+/// Oldest age a projection of `model` may reach, years: 60, but 58 for model 7.
+int modelAgeLimit(std::int16_t model);
+
+/// A sub-compartment today, per hectare.
+struct Stand {
+    std::int16_t model = 0;
+    /// Age, years.
+    float age = 0.0f;
+    /// Stocking, stems/ha.
+    float stocking = 0.0f;
+    /// Top height, m.
+    float height = 0.0f;
+    /// Basal area, m²/ha.
+    float basalArea = 0.0f;
+};
+
+/// Thinnings of a rotation: each removes `thinVolume` at the ages thinFrom,
+/// thinFrom + thinEvery, … up to and including thinUntil (without it, up to
+/// the age before the final cut), and only before the final cut.
+struct Regime {
+    /// Age of the first thinning, years; 0 for a rotation without thinning.
+    int thinFrom = 0;
+    /// Years between two thinnings, at least 1.
+    int thinEvery = 1;
+    /// Volume removed by each thinning, m³/ha to 7 cm top.
+    float thinVolume = 0.0f;
+    /// Age of the last thinning, years.
+    std::optional<int> thinUntil;
+
+    bool thins() const { return thinFrom > 0; }
+};
+
+/// What the money of a rotation is counted with.
+struct Economics {
+    /// Interest rate, percent.
+    double ratePercent = 0.0;
+    /// Cost of establishment, euro/ha, at age 0.
+    double establishmentCost = 0.0;
+    /// Yearly cost, euro/ha, at every age from 1 to the final cut.
+    double annualCost = 0.0;
+    /// Standing prices, euro/m³, by mean tree volume class.
+    PriceList prices{};
+};
+
+/// A thinning or the final cut, per hectare.
+struct Harvest {
+    /// Age, years.
+    int age = 0;
+    /// Volume removed, m³/ha.
+    float volume = 0.0f;
+    /// Stems removed, stems/ha.
+    float stocking = 0.0f;
+    /// Basal area removed, m²/ha.
+    float basalArea = 0.0f;
+    /// Volume of the mean tree removed, m³.
+    double meanTreeVolume = 0.0;
+    /// Price class 0 to 12 of the mean tree.
+    int priceClass = 0;
+    /// Revenue, euro/ha: volume × standing price of the mean tree's class.
+    double revenue = 0.0;
+};
+
+/// The stand under a regime, year by year from the present age to the age
+/// limit, with every thinning of the regime up to there. One path serves every
+/// final-cut age: a rotation of R years takes the state at R and the thinnings
+/// before R.
+struct GrowthPath {
+    /// Present age, years: the stand's age moved to the nearest whole year.
+    int presentAge = 0;
+    /// Last age of the path, years.
+    int ageLimit = 0;
+    /// Site index, m (top height at age 30).
+    float siteIndex = 0.0f;
+    /// State at presentAge + i, before any thinning of that age.
+    std::vector<engine::StandState> years;
+    /// The thinnings, oldest first; revenues 0 until a rotation is valued.
+    std::vector<Harvest> thinnings;
+
+    /// Last age grown, years: the age limit, or the age of a thinning the
+    /// limits did not allow.
+    int lastAge() const { return presentAge + static_cast<int>(years.size()) - 1; }
+
+    const engine::StandState &at(int age) const {
+        return years[static_cast<std::size_t>(age - presentAge)];
+    }
+};
+
+/// Why a path could not be grown.
+struct GrowthFailure {
+    /// True when the input is at fault (a regime the stand cannot carry, a
+    /// stand past the age limit); false when the engine failed (and reported).
+    bool badInput = false;
+    std::string text;
+};
+
+/// What is wrong with a regime for a stand of `presentAge` and a model whose
+/// projections end at `ageLimit`, or std::nullopt when it can be grown.
+std::optional<std::string> regimeProblem(const Regime &regime, int presentAge, int ageLimit);
+
+/// What is wrong with a final cut at `rotation` after `regime` on `path`, or
+/// std::nullopt when it is a rotation: not before the present age, not past
+/// the age limit, and after every thinning the regime names.
+std::optional<std::string> rotationProblem(const GrowthPath &path, const Regime &regime,
+                                           int rotation);
+
+/// What a thinning may do: remove at most a share of the standing volume and
+/// leave at least a stocking.
+struct ThinningLimits {
+    double maxRemovalShare = 1.0;
+    /// Stems/ha.
+    float minStocking = 0.0f;
+};
+
+/// Grows `stand` under `regime` to the model's age limit with `grow` (the
+/// model is made active with its volume correction factor and the site index
+/// computed, as the model menu and the grow command do). Each thinning is the
+/// thinning window's volume method: the residual volume is the standing
+/// volume less `thinVolume`, and NEWTON gives the residual basal area and
+/// stocking. With `limits`, the path ends at the first thinning they do not
+/// allow (its crop recorded, the thinning not made). Returns std::nullopt and
+/// fills `failure` when it cannot.
+std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const Regime &regime,
+                                   GrowthFailure &failure, const ThinningLimits *limits = nullptr);
+
+/// One year of the cash flow of a rotation from bare land, euro/ha.
+struct CashFlowYear {
+    int age = 0;
+    double cost = 0.0;
+    double revenue = 0.0;
+};
+
+/// A rotation valued.
+struct RotationValue {
+    /// Final-cut age, years.
+    int rotation = 0;
+    /// The thinnings before the final cut, valued.
+    std::vector<Harvest> thinnings;
+    /// The final cut: the whole standing crop.
+    Harvest finalCut;
+    /// Cost and revenue of every age from 0 to the rotation. Ages before the
+    /// present carry the costs only: the path does not see their thinnings.
+    std::vector<CashFlowYear> cashflow;
+    /// Mean annual increment at the final cut, m³/ha/year: standing volume and
+    /// the thinnings over the age.
+    double mai = 0.0;
+    /// Yield class: the culminated maximum of the MAI from the present age to
+    /// the rotation, made even (0 when it has not culminated).
+    int yieldClass = 0;
+    /// Net present value, euro/ha, of the cash flows from the present age,
+    /// discounted to it as the cash-flow window does.
+    std::optional<double> npv;
+    /// Land expectation value, euro/ha.
+    std::optional<double> lev;
+    /// Equivalent annual annuity, euro/ha/year.
+    std::optional<double> eaa;
+    /// Forest value of the stand today, euro/ha.
+    std::optional<double> forestValue;
+    valuation::InternalRate irr;
+    /// Factor on all timber prices that brings the LEV to 0.
+    std::optional<double> breakEvenPriceFactor;
+};
+
+/// Values the rotation that ends with the final cut at `rotation` (checked
+/// with rotationProblem beforehand).
+RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics);
+
+/// One final-cut age of the rotation explorer.
+struct RotationRow {
+    int age = 0;
+    /// Standing volume at the final cut, m³/ha.
+    float volume = 0.0f;
+    double mai = 0.0;
+    std::optional<double> npv;
+    std::optional<double> lev;
+    std::optional<double> forestValue;
+};
+
+/// The final cut at every age from the year after the last thinning (the
+/// present age without thinnings) to the age limit.
+struct RotationExplorer {
+    std::vector<RotationRow> rows;
+    /// Age of the largest MAI (the biological rotation), years.
+    int biologicalRotation = 0;
+    /// Age of the largest LEV (the economic rotation), years; 0 when no LEV
+    /// could be computed (no positive rate).
+    int economicRotation = 0;
+};
+
+/// First final-cut age the explorer shows for `regime` on `path`.
+int firstRotation(const GrowthPath &path, const Regime &regime);
+
+RotationExplorer exploreRotations(const GrowthPath &path, const Regime &regime,
+                                  const Economics &economics);
+
+} // namespace arbolex::rotation

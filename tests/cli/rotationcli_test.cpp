@@ -1,0 +1,246 @@
+// arbolex-cli rotation, run as a user runs it over the shipped price lists:
+// its JSON figures hold together, the chosen rotation and price list are the
+// ones used, and a command line that names no rotation exits with 2.
+#include "cli/clirun.hpp"
+#include "mocks/programservices.hpp"
+
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+#include <QTemporaryDir>
+
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <ostream>
+
+namespace {
+
+using arbolex::cli::testing::Outcome;
+
+constexpr const char *kStandOptions =
+    "--model 0 --age 15 --stocking 2500 --height 7 --basal-area 20";
+const QString kStand = QStringLiteral("rotation ") + QLatin1String(kStandOptions);
+constexpr const char *kRegime = "--thin-from 20 --thin-every 5 --thin-volume 40 --thin-until 35";
+
+QStringList words(const QString &commandLine) {
+    return commandLine.split(QLatin1Char(' '), Qt::SkipEmptyParts);
+}
+
+class RotationCliTest : public ::testing::Test {
+protected:
+    Outcome run(const QString &commandLine) {
+        return arbolex::cli::testing::runCli(words(commandLine), m_data.path());
+    }
+
+    /// The JSON document of a command that must succeed.
+    QJsonObject json(const QString &commandLine) {
+        const Outcome r = run(commandLine + QStringLiteral(" --format json"));
+        EXPECT_EQ(r.exitCode, 0) << r.err.toStdString();
+        return QJsonDocument::fromJson(r.out.join(QLatin1Char('\n')).toUtf8()).object();
+    }
+
+    QTemporaryDir m_data;
+    bool m_copied = arbolex::testing::copyShippedData(m_data.path());
+};
+
+const QString kThinned = kStand + QLatin1Char(' ') + QLatin1String(kRegime);
+
+TEST_F(RotationCliTest, JsonCarriesEveryFigureAndTheyHoldTogether) {
+    const QJsonObject o = json(kThinned + QStringLiteral(" --rate 3 --establishment-cost 1500"));
+    for (const char *key : {"npv", "lev", "eaa", "forest_value", "irr", "break_even_price_factor",
+                            "rotation", "economic_rotation", "biological_rotation", "yield_class",
+                            "thinnings", "final_cut", "cashflow", "by_age"}) {
+        EXPECT_TRUE(o.contains(QLatin1String(key))) << key;
+    }
+    const int rotation = o[QStringLiteral("rotation")].toInt();
+    EXPECT_EQ(rotation, o[QStringLiteral("economic_rotation")].toInt());
+    const double lev = o[QStringLiteral("lev")].toDouble();
+    EXPECT_NEAR(o[QStringLiteral("eaa")].toDouble(), lev * 0.03, 0.01);
+    // Felled at R, replanted for ever: the stand today is its NPV and the
+    // bare land's value discounted from the final cut.
+    EXPECT_NEAR(o[QStringLiteral("forest_value")].toDouble(),
+                o[QStringLiteral("npv")].toDouble() + lev / std::pow(1.03, rotation - 15), 0.02);
+    const QJsonArray thinnings = o[QStringLiteral("thinnings")].toArray();
+    ASSERT_EQ(thinnings.size(), 4);
+    EXPECT_EQ(thinnings[3].toObject()[QStringLiteral("age")].toInt(), 35);
+    const QJsonArray cashflow = o[QStringLiteral("cashflow")].toArray();
+    ASSERT_EQ(cashflow.size(), rotation + 1);
+    EXPECT_EQ(cashflow[0].toObject()[QStringLiteral("cost")].toDouble(), 1500.0);
+    // The explorer's row at the rotation is the rotation itself; it starts
+    // after the last thinning.
+    const QJsonArray byAge = o[QStringLiteral("by_age")].toArray();
+    EXPECT_EQ(byAge.first().toObject()[QStringLiteral("age")].toInt(), 36);
+    const QJsonObject row = byAge[rotation - 36].toObject();
+    EXPECT_EQ(row[QStringLiteral("lev")].toDouble(), lev);
+    EXPECT_EQ(row[QStringLiteral("npv")], o[QStringLiteral("npv")]);
+    EXPECT_TRUE(o[QStringLiteral("irr")].isDouble());
+}
+
+TEST_F(RotationCliTest, ChosenRotationAndPriceListAreTheOnesUsed) {
+    const QString unthinned = kStand + QStringLiteral(" --rotation 50");
+    const QJsonObject longTerm = json(unthinned);
+    EXPECT_EQ(longTerm[QStringLiteral("rotation")].toInt(), 50);
+    EXPECT_TRUE(longTerm[QStringLiteral("thinnings")].toArray().isEmpty());
+    // A mean tree of .500 to .599 m³ sells at class 7: 30.4 €/m³ over the
+    // long term, 32.15 €/m³ at current prices (the shipped lists).
+    const QJsonObject cut = longTerm[QStringLiteral("final_cut")].toObject();
+    ASSERT_EQ(cut[QStringLiteral("mean_tree_volume")].toDouble(), 0.55);
+    const double volume = cut[QStringLiteral("volume")].toDouble();
+    EXPECT_NEAR(cut[QStringLiteral("revenue")].toDouble(), volume * 30.4, 0.005);
+    const QJsonObject current = json(unthinned + QStringLiteral(" --prices current"));
+    EXPECT_NEAR(
+        current[QStringLiteral("final_cut")].toObject()[QStringLiteral("revenue")].toDouble(),
+        volume * 32.15, 0.005);
+    // Revenue only: no rate makes it worth nothing.
+    EXPECT_TRUE(longTerm[QStringLiteral("irr")].isNull());
+    EXPECT_EQ(longTerm[QStringLiteral("irr_note")].toString(), QStringLiteral("no sign change"));
+}
+
+TEST_F(RotationCliTest, TableCarriesTheSameFiguresAsJson) {
+    const QJsonObject o = json(kThinned + QStringLiteral(" --rate 2.5"));
+    const Outcome r = run(kThinned + QStringLiteral(" --rate 2.5"));
+    ASSERT_EQ(r.exitCode, 0);
+    for (const char *key : {"npv", "lev", "forest_value"}) {
+        const QString prefix = QLatin1String(key) + QLatin1Char('\t');
+        const auto line = std::find_if(r.out.begin(), r.out.end(),
+                                       [&](const QString &l) { return l.startsWith(prefix); });
+        ASSERT_NE(line, r.out.end()) << key;
+        EXPECT_EQ(line->mid(prefix.size()).toDouble(), o[QLatin1String(key)].toDouble()) << key;
+    }
+}
+
+struct BadRotation {
+    const char *arguments; ///< after the stand
+    const char *complaint; ///< part of what stderr must say
+    const char *command = "rotation";
+};
+
+void PrintTo(const BadRotation &c, std::ostream *os) {
+    *os << c.command << ' ' << c.arguments;
+}
+
+class RotationCliBadArgumentsTest : public RotationCliTest,
+                                    public ::testing::WithParamInterface<BadRotation> {};
+
+TEST_P(RotationCliBadArgumentsTest, ExitsWithTwoAndSaysWhy) {
+    const Outcome r =
+        run(QLatin1String(GetParam().command) + QLatin1Char(' ') + QLatin1String(kStandOptions) +
+            QLatin1Char(' ') + QLatin1String(GetParam().arguments));
+    EXPECT_EQ(r.exitCode, 2);
+    EXPECT_TRUE(r.out.isEmpty());
+    EXPECT_TRUE(r.err.contains(QLatin1String(GetParam().complaint))) << r.err.toStdString();
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Cli, RotationCliBadArgumentsTest,
+    ::testing::Values(
+        BadRotation{"--thin-from 20 --thin-every 5 --thin-volume 40 --thin-until 40 --rotation 40",
+                    "the regime thins at age 40, not before the final cut at age 40"},
+        BadRotation{"--thin-from 45 --thin-every 5 --thin-volume 40 --rotation 40",
+                    "the regime thins at age 45"},
+        BadRotation{"--rotation 61", "past the model's age limit 60"},
+        BadRotation{"--rotation 10", "before the present age 15"},
+        BadRotation{"--rate -1", "--rate must be above 0"},
+        BadRotation{"--annual-cost -5", "--annual-cost must not be negative"},
+        BadRotation{"--prices cheapest", "--prices takes current, user, longterm or private"},
+        BadRotation{"--format csv", "--format takes tsv or json"},
+        BadRotation{"--thin-from 20 --thin-volume 40", "--thin-every is required"},
+        BadRotation{"--thin-from 20 --thin-every 5 --thin-volume 900",
+                    "the thinning at age 20 removes 900.00 m3/ha"},
+        BadRotation{"--thin-from 10 --thin-every 5 --thin-volume 40",
+                    "before the present age 15"}));
+
+TEST_F(RotationCliTest, UnthinnedModelRefusesARegime) {
+    const Outcome r = run(QStringLiteral(
+        "rotation --model 1 --age 15 --stocking 2500 --height 7 --basal-area 20 --thin-from 20 "
+        "--thin-every 5 --thin-volume 40"));
+    EXPECT_EQ(r.exitCode, 2);
+    EXPECT_TRUE(r.err.contains(QLatin1String("has no thinning response"))) << r.err.toStdString();
+}
+
+} // namespace
+
+namespace {
+
+TEST_F(RotationCliTest, OptimisedRegimesGiveTheirFiguresBackToRotation) {
+    const QJsonObject o = json(QStringLiteral("optimise") + kThinned.mid(8) +
+                               QStringLiteral(" --rate 3 --establishment-cost 1500 --top 3"));
+    const QJsonArray best = o[QStringLiteral("best")].toArray();
+    ASSERT_EQ(best.size(), 3);
+    const QJsonObject first = best[0].toObject();
+    const QJsonObject current = o[QStringLiteral("current")].toObject();
+    EXPECT_EQ(current[QStringLiteral("thin_until")].toInt(), 35);
+    EXPECT_NEAR(o[QStringLiteral("gain")].toDouble(),
+                first[QStringLiteral("lev")].toDouble() - current[QStringLiteral("lev")].toDouble(),
+                0.011);
+    for (const QJsonValue &regime : best) {
+        const QJsonObject b = regime.toObject();
+        QString line = kStand + QStringLiteral(" --rate 3 --establishment-cost 1500");
+        if (!b[QStringLiteral("thin_from")].isNull()) {
+            for (const char *key : {"thin_from", "thin_every", "thin_volume", "thin_until"}) {
+                line += QStringLiteral(" --") +
+                        QString::fromLatin1(key).replace(QLatin1Char('_'), QLatin1Char('-')) +
+                        QLatin1Char(' ') + QString::number(b[QLatin1String(key)].toDouble());
+            }
+        }
+        line +=
+            QStringLiteral(" --rotation ") + QString::number(b[QStringLiteral("rotation")].toInt());
+        const QJsonObject again = json(line);
+        EXPECT_EQ(again[QStringLiteral("lev")], b[QStringLiteral("lev")]) << line.toStdString();
+        EXPECT_EQ(again[QStringLiteral("npv")], b[QStringLiteral("npv")]) << line.toStdString();
+    }
+}
+
+TEST_F(RotationCliTest, UncertaintyRepeatsWithItsSeed) {
+    const QString line =
+        kThinned + QStringLiteral(" --rate 3 --annual-cost 150 --draws 3000 --seed 7 "
+                                  "--price-spread 0.3 --rate-range 2 4");
+    const QJsonObject a = json(QStringLiteral("uncertainty") + line.mid(8));
+    const QJsonObject b = json(QStringLiteral("uncertainty") + line.mid(8));
+    EXPECT_EQ(a, b);
+    EXPECT_EQ(a[QStringLiteral("draws")].toInt(), 3000);
+    const double p = a[QStringLiteral("probability_npv_below_zero")].toDouble();
+    EXPECT_GE(p, 0.0);
+    EXPECT_LE(p, 1.0);
+    const QJsonObject npv = a[QStringLiteral("npv")].toObject();
+    EXPECT_LT(npv[QStringLiteral("p5")].toDouble(), npv[QStringLiteral("p95")].toDouble());
+    EXPECT_EQ(a[QStringLiteral("tornado")].toArray().size(), 4);
+    int draws = 0;
+    for (const QJsonValue &n :
+         a[QStringLiteral("histogram")].toObject()[QStringLiteral("counts")].toArray()) {
+        draws += n.toInt();
+    }
+    EXPECT_EQ(draws, 3000);
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    CliSearch, RotationCliBadArgumentsTest,
+    ::testing::Values(
+        BadRotation{"--objective profit", "--objective takes lev, npv or volume", "optimise"},
+        BadRotation{"--max-removal 150", "--max-removal is a percentage up to 100", "optimise"},
+        BadRotation{"--top 0", "--top must be a whole number from 1 to 100", "optimise"},
+        BadRotation{"--rate -2", "--rate must be above 0", "optimise"},
+        BadRotation{"--rate-range 4 2", "--rate-range: LO is above HI", "uncertainty"},
+        BadRotation{"--rate-range 0 3", "\"0\" is not a rate above 0", "uncertainty"},
+        BadRotation{"--rate-range 2", "--rate-range takes two rates", "uncertainty"},
+        BadRotation{"--rotation 70", "past the model's age limit 60", "uncertainty"}));
+
+} // namespace
+
+namespace {
+
+TEST_F(RotationCliTest, OverviewAndHelpNameTheRotationCommands) {
+    const QString overview = run(QStringLiteral("--help")).out.join(QLatin1Char('\n'));
+    for (const char *line : {"  rotation    a regime grown", "  optimise    the best thinning",
+                             "  uncertainty Monte Carlo"}) {
+        EXPECT_TRUE(overview.contains(QLatin1String(line))) << line;
+    }
+    const Outcome help = run(QStringLiteral("optimise --help"));
+    EXPECT_EQ(help.exitCode, 0);
+    for (const char *option : {"--thin-until", "--max-removal", "--prices", "--objective"}) {
+        EXPECT_TRUE(help.out.join(QLatin1Char('\n')).contains(QLatin1String(option))) << option;
+    }
+}
+
+} // namespace
