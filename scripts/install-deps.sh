@@ -7,8 +7,11 @@ set -euo pipefail
 packages=(build-essential cmake ninja-build pkg-config
           libgtest-dev libgmock-dev libbenchmark-dev clang-format)
 if [[ "${1:-}" != "--no-gui" ]]; then
+    # desktop-file-utils, appstream and shared-mime-info check the installed
+    # desktop entry, metainfo and MIME type in the tests.
     packages+=(qt6-base-dev qt6-multimedia-dev libgl-dev
-               fonts-dejavu-core xvfb xauth)
+               fonts-dejavu-core xvfb xauth
+               desktop-file-utils appstream shared-mime-info)
 fi
 
 missing=()
