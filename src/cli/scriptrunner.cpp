@@ -179,6 +179,13 @@ std::optional<thinning::ThinControl> thinControl(const QString &name) {
     return thinning::thinControlFromName(name.mid(kThinWindow.size()));
 }
 
+/// The net present value window takes typing and presses only while it is
+/// open, as on the screen: its grid is filled when it opens.
+QString npvWindowClosed(const QString &control) {
+    return QStringLiteral("'") + control +
+           QStringLiteral("': the net present value window is not open");
+}
+
 constexpr QLatin1String kTimberPricesWindow("frmTimberPrices.");
 
 /// The timber-prices control `name` names ("frmTimberPrices.txtTimbVal(13)"), if any.
@@ -191,7 +198,16 @@ std::optional<economics::TimberPricesItem> timberPricesItem(const QString &name)
 } // namespace
 
 QString ScriptRunner::set(const QString &control, const QString &text) {
+    if ((npvGridCell(control) || npvControl(control)) && !m_session.npvView().isShown()) {
+        return npvWindowClosed(control);
+    }
     if (const auto cell = npvGridCell(control)) {
+        // The window offers only the cells of its grid.
+        const std::vector<QStringList> &grid = m_session.npv().grid();
+        const auto row = static_cast<std::size_t>(cell->first);
+        if (row >= grid.size() || cell->second >= grid[row].size()) {
+            return QStringLiteral("no cell named '") + control + QLatin1Char('\'');
+        }
         m_session.npv().typeInCell(cell->first, cell->second, text);
         return {};
     }
@@ -241,6 +257,9 @@ QString ScriptRunner::press(const QString &control) {
         return {};
     }
     if (const auto npv = npvControl(control)) {
+        if (!m_session.npvView().isShown()) {
+            return npvWindowClosed(control);
+        }
         if (!m_session.npv().press(*npv)) {
             return QStringLiteral("no command named '") + control + QLatin1Char('\'');
         }

@@ -78,6 +78,9 @@ TEST_F(RunnerTest, ScriptErrorsNameTheirLine) {
         {{QStringLiteral("select")}, 1},
         {{QStringLiteral("answer maybe")}, 1},
         {{QStringLiteral("print nowhere")}, 1},
+        // The net present value window takes nothing until it is open.
+        {{QStringLiteral("model 0"), QStringLiteral("set frmNPV.NPV_Grid(1,1) Planting")}, 2},
+        {{QStringLiteral("press frmNPV.cmdNPV")}, 1},
     };
     for (const Case &c : cases) {
         EXPECT_EQ(run(c.lines).line, c.line) << c.lines.join(QLatin1Char('|')).toStdString();
