@@ -330,6 +330,16 @@ QString ScriptRunner::print(const QString &control) {
     return {};
 }
 
+ScriptRunner::Outcome runScriptText(const QByteArray &script, HeadlessSession &session,
+                                    QSettings &settings, QTextStream &out) {
+    const QStringList lines = QString::fromUtf8(script).split(QLatin1Char('\n'));
+    session.main().Form_Load(settings, QRect(0, 0, 1280, 800));
+    ScriptRunner runner(session, out);
+    const ScriptRunner::Outcome outcome = runner.run(lines);
+    out.flush();
+    return outcome;
+}
+
 int runScriptFile(const QString &scriptPath, const QString &dataFolder, QTextStream &out,
                   QTextStream &err) {
     QFile file(scriptPath);
@@ -337,18 +347,12 @@ int runScriptFile(const QString &scriptPath, const QString &dataFolder, QTextStr
         err << "arbolex-cli: cannot read the script " << scriptPath << '\n';
         return 2;
     }
-    const QStringList lines = QString::fromUtf8(file.readAll()).split(QLatin1Char('\n'));
-
     HeadlessSession session(dataFolder, out);
     // A run without a screen has no window placement worth keeping: its
     // settings live in a scratch file, never in the user's own settings.
     QTemporaryDir scratch;
     QSettings settings(scratch.filePath(QStringLiteral("settings.ini")), QSettings::IniFormat);
-    session.main().Form_Load(settings, QRect(0, 0, 1280, 800));
-
-    ScriptRunner runner(session, out);
-    const ScriptRunner::Outcome outcome = runner.run(lines);
-    out.flush();
+    const ScriptRunner::Outcome outcome = runScriptText(file.readAll(), session, settings, out);
     if (!outcome.ok()) {
         err << scriptPath << ':' << outcome.line << ": " << outcome.error << '\n';
         return 2;
