@@ -6,7 +6,7 @@ JOBS    ?= $(shell nproc)
 CMAKE_FLAGS ?=
 GEN     := -G Ninja
 
-.PHONY: all deps build run test bench test-asan test-noqt format format-check tidy ci clean
+.PHONY: all deps build run test bench test-asan test-noqt fuzz format format-check tidy ci clean
 
 all: build
 
@@ -44,6 +44,21 @@ test-noqt:
 	@cmake --build build-noqt -j $(JOBS)
 	@cd build-noqt && ctest --output-on-failure -j $(JOBS)
 
+# The libFuzzer harnesses of the file readers (tests/fuzz/), built with clang,
+# AddressSanitizer and UndefinedBehaviorSanitizer in build-fuzz, each run for
+# FUZZ_TIME seconds, or FUZZ_RUNS executions when given
+# (make fuzz FUZZ_RUNS=1000000); FUZZERS="NAME..." runs only those.
+FUZZ_TIME ?= 20
+FUZZ_RUNS ?=
+FUZZERS ?=
+
+fuzz:
+	@scripts/install-deps.sh --fuzz
+	@CC=clang CXX=clang++ cmake -S . -B build-fuzz $(GEN) -DCMAKE_BUILD_TYPE=RelWithDebInfo \
+	    -DARBOLEX_WERROR=ON -DARBOLEX_FUZZ=ON -DARBOLEX_WITH_GUI=OFF -DARBOLEX_BENCH=OFF >/dev/null
+	@cmake --build build-fuzz -j $(JOBS) --target arbolex_fuzzers
+	@FUZZERS="$(FUZZERS)" scripts/fuzz.sh build-fuzz $(if $(FUZZ_RUNS),-runs=$(FUZZ_RUNS),-max_total_time=$(FUZZ_TIME))
+
 format:
 	@git ls-files '*.cpp' '*.hpp' | xargs clang-format -i
 
@@ -54,7 +69,7 @@ format-check: deps
 tidy: build
 	@git ls-files 'src/*.cpp' | xargs -n 1 -P $(JOBS) clang-tidy -p $(BUILD) --quiet 2>/dev/null
 
-ci: format-check test test-noqt test-asan
+ci: format-check test test-noqt test-asan fuzz
 
 clean:
-	@rm -rf $(BUILD) build-asan build-noqt
+	@rm -rf $(BUILD) build-asan build-noqt build-fuzz

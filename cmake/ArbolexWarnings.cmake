@@ -15,6 +15,14 @@ if(ARBOLEX_SANITIZE)
         -fsanitize=address,undefined -fno-sanitize-recover=undefined -fno-omit-frame-pointer)
     target_link_options(arbolex_compile_settings INTERFACE -fsanitize=address,undefined)
 endif()
+# The fuzzing build: coverage for libFuzzer and both sanitizers in every
+# library, so a fault deep in a reader stops the harness.
+if(ARBOLEX_FUZZ)
+    target_compile_options(arbolex_compile_settings INTERFACE
+        -fsanitize=fuzzer-no-link,address,undefined -fno-sanitize-recover=undefined
+        -fno-omit-frame-pointer)
+    target_link_options(arbolex_compile_settings INTERFACE -fsanitize=address,undefined)
+endif()
 
 # Qt string discipline for the application and the windows.
 add_library(arbolex_qt_settings INTERFACE)

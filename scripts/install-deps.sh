@@ -1,14 +1,22 @@
 #!/usr/bin/env bash
 # Installs the Debian packages that ARBOLEX needs to build, test and run.
 # Idempotent: prints nothing and touches nothing when every package is present.
-# Usage: scripts/install-deps.sh [--no-gui]   (--no-gui: engine-only build)
+# Usage: scripts/install-deps.sh [--no-gui | --fuzz]
+#   --no-gui  the engine-only build
+#   --fuzz    also clang and its libFuzzer and sanitizer runtimes (make fuzz)
 set -euo pipefail
 
 packages=(build-essential cmake ninja-build pkg-config
           libgtest-dev libgmock-dev libbenchmark-dev clang-format)
 if [[ "${1:-}" != "--no-gui" ]]; then
+    # desktop-file-utils, appstream and shared-mime-info check the installed
+    # desktop entry, metainfo and MIME type in the tests.
     packages+=(qt6-base-dev qt6-multimedia-dev libgl-dev
-               fonts-dejavu-core xvfb xauth)
+               fonts-dejavu-core xvfb xauth
+               desktop-file-utils appstream shared-mime-info)
+fi
+if [[ "${1:-}" == "--fuzz" ]]; then
+    packages+=(clang clang-14 libclang-rt-14-dev)
 fi
 
 missing=()

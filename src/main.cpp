@@ -10,6 +10,7 @@
 #include "shell/datafolder.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
+#include "shell/version.hpp"
 #include "thinning/thinwindowlogic.hpp"
 #include "ui/assortuserwindow.hpp"
 #include "ui/assortwindow.hpp"
@@ -222,12 +223,6 @@ struct Options {
     QCommandLineOption quitWhenShown{QStringLiteral("quit-when-shown")};
 };
 
-void nameApplication() {
-    QCoreApplication::setOrganizationName(arbolex::ui::text::programName());
-    QCoreApplication::setApplicationName(arbolex::ui::text::programName());
-    QCoreApplication::setApplicationVersion(arbolex::ui::text::programVersion());
-}
-
 /// True when the command line asks only for the usage or the version, which
 /// are printed without opening a display.
 bool asksForTextOnly(int argc, char *argv[]) {
@@ -246,7 +241,7 @@ bool asksForTextOnly(int argc, char *argv[]) {
 int main(int argc, char *argv[]) {
     if (asksForTextOnly(argc, argv)) {
         QCoreApplication core(argc, argv);
-        nameApplication();
+        arbolex::shell::nameProgram();
         QCommandLineParser parser;
         const Options options(parser);
         parser.process(core); // prints and ends the program
@@ -254,7 +249,7 @@ int main(int argc, char *argv[]) {
     }
 
     QApplication app(argc, argv);
-    nameApplication();
+    arbolex::shell::nameProgram();
     QCommandLineParser parser;
     const Options options(parser);
     parser.process(app);

@@ -1,49 +1,15 @@
 // arbolex-cli assort: how the stand's volume to 7 cm top divides into the
 // fixed top-diameter classes, or into the categories of a category file.
+#include "cli/categoryfile.hpp"
 #include "cli/command.hpp"
 #include "cli/options.hpp"
 #include "cli/standinput.hpp"
-#include "economics/pricedata.hpp"
-#include "shell/seqfile.hpp"
 
 #include <vector>
 
 namespace arbolex::cli {
 
 namespace {
-
-/// A category of the file: its name and bounds.
-struct NamedCategory {
-    QString name;
-    engine::AssortmentCategory bounds;
-};
-
-/// Reads the categories of a file in the format of "UD_Assort.qdm" (name,
-/// small end, big end, five times); a category whose small end is 0 is not
-/// defined and is left out. Throws UsageError when the file cannot be read.
-std::vector<NamedCategory> readCategories(const QString &path) {
-    shell::SequentialReader in(path);
-    if (in.openError().number != 0) {
-        throw UsageError{QStringLiteral("cannot read the category file \"%1\": %2")
-                             .arg(path, in.openError().description)};
-    }
-    std::vector<NamedCategory> categories;
-    for (int i = 0; i < economics::kUserCategoryCount; ++i) {
-        NamedCategory c;
-        for (const shell::RuntimeError &e :
-             {in.readString(c.name), in.readNumber(c.bounds.smallEnd),
-              in.readNumber(c.bounds.bigEnd)}) {
-            if (e.number != 0) {
-                throw UsageError{QStringLiteral("category %1 of \"%2\": %3")
-                                     .arg(QString::number(i + 1), path, e.description)};
-            }
-        }
-        if (c.bounds.smallEnd != 0.0f) {
-            categories.push_back(c);
-        }
-    }
-    return categories;
-}
 
 int runAssort(CommandContext &context) {
     StandInput stand;
@@ -54,7 +20,7 @@ int runAssort(CommandContext &context) {
         const Options options(context.arguments, known);
         stand = readStand(options);
         if (options.has("categories")) {
-            named = readCategories(options.text("categories"));
+            named = readCategoryFile(options.text("categories"));
         }
     } catch (const UsageError &error) {
         context.err << "arbolex-cli assort: " << error.text << '\n';

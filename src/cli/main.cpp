@@ -2,6 +2,7 @@
 // the table below; every subcommand lives in a file of its own.
 #include "cli/command.hpp"
 #include "shell/datafolder.hpp"
+#include "shell/version.hpp"
 
 #include <QCoreApplication>
 
@@ -27,6 +28,7 @@ const std::vector<Command> &commands() {
 QString overview() {
     QString text = QStringLiteral("usage: arbolex-cli <command> [options]\n"
                                   "       arbolex-cli <command> --help\n"
+                                  "       arbolex-cli --version\n"
                                   "\n"
                                   "commands:\n");
     for (const Command &c : commands()) {
@@ -36,7 +38,8 @@ QString overview() {
         "\n"
         "Engine messages and failure lines go to stderr as MSG<TAB>title<TAB>text<TAB>style\n"
         "and LOG<TAB>line; failure lines are also appended to ErrorLog.txt in the data\n"
-        "folder: --data-dir DIR, else $ARBOLEX_DATA_DIR, else the program's folder.\n"
+        "folder: --data-dir DIR, else $ARBOLEX_DATA_DIR, else the program's folder, or\n"
+        "for an installed program the user's data location (filled from the defaults).\n"
         "Exit status: 0 done, 1 the engine failed, 2 the command line is wrong.\n");
     return text;
 }
@@ -51,11 +54,16 @@ int main(int argc, char *argv[]) {
     QCoreApplication application(argc, argv);
     QTextStream out(stdout);
     QTextStream err(stderr);
+    arbolex::shell::nameProgram();
     const QStringList arguments = QCoreApplication::arguments().mid(1);
 
     if (arguments.isEmpty()) {
         err << overview();
         return arbolex::cli::kExitBadArguments;
+    }
+    if (arguments.first() == QLatin1String("--version")) {
+        out << "arbolex-cli " << arbolex::shell::programVersion() << '\n';
+        return arbolex::cli::kExitSuccess;
     }
     if (isHelp(arguments.first())) {
         out << overview();

@@ -179,6 +179,13 @@ std::optional<thinning::ThinControl> thinControl(const QString &name) {
     return thinning::thinControlFromName(name.mid(kThinWindow.size()));
 }
 
+/// The net present value window takes typing and presses only while it is
+/// open, as on the screen: its grid is filled when it opens.
+QString npvWindowClosed(const QString &control) {
+    return QStringLiteral("'") + control +
+           QStringLiteral("': the net present value window is not open");
+}
+
 constexpr QLatin1String kTimberPricesWindow("frmTimberPrices.");
 
 /// The timber-prices control `name` names ("frmTimberPrices.txtTimbVal(13)"), if any.
@@ -191,7 +198,16 @@ std::optional<economics::TimberPricesItem> timberPricesItem(const QString &name)
 } // namespace
 
 QString ScriptRunner::set(const QString &control, const QString &text) {
+    if ((npvGridCell(control) || npvControl(control)) && !m_session.npvView().isShown()) {
+        return npvWindowClosed(control);
+    }
     if (const auto cell = npvGridCell(control)) {
+        // The window offers only the cells of its grid.
+        const std::vector<QStringList> &grid = m_session.npv().grid();
+        const auto row = static_cast<std::size_t>(cell->first);
+        if (row >= grid.size() || cell->second >= grid[row].size()) {
+            return QStringLiteral("no cell named '") + control + QLatin1Char('\'');
+        }
         m_session.npv().typeInCell(cell->first, cell->second, text);
         return {};
     }
@@ -241,6 +257,9 @@ QString ScriptRunner::press(const QString &control) {
         return {};
     }
     if (const auto npv = npvControl(control)) {
+        if (!m_session.npvView().isShown()) {
+            return npvWindowClosed(control);
+        }
         if (!m_session.npv().press(*npv)) {
             return QStringLiteral("no command named '") + control + QLatin1Char('\'');
         }
@@ -311,6 +330,16 @@ QString ScriptRunner::print(const QString &control) {
     return {};
 }
 
+ScriptRunner::Outcome runScriptText(const QByteArray &script, HeadlessSession &session,
+                                    QSettings &settings, QTextStream &out) {
+    const QStringList lines = QString::fromUtf8(script).split(QLatin1Char('\n'));
+    session.main().Form_Load(settings, QRect(0, 0, 1280, 800));
+    ScriptRunner runner(session, out);
+    const ScriptRunner::Outcome outcome = runner.run(lines);
+    out.flush();
+    return outcome;
+}
+
 int runScriptFile(const QString &scriptPath, const QString &dataFolder, QTextStream &out,
                   QTextStream &err) {
     QFile file(scriptPath);
@@ -318,18 +347,12 @@ int runScriptFile(const QString &scriptPath, const QString &dataFolder, QTextStr
         err << "arbolex-cli: cannot read the script " << scriptPath << '\n';
         return 2;
     }
-    const QStringList lines = QString::fromUtf8(file.readAll()).split(QLatin1Char('\n'));
-
     HeadlessSession session(dataFolder, out);
     // A run without a screen has no window placement worth keeping: its
     // settings live in a scratch file, never in the user's own settings.
     QTemporaryDir scratch;
     QSettings settings(scratch.filePath(QStringLiteral("settings.ini")), QSettings::IniFormat);
-    session.main().Form_Load(settings, QRect(0, 0, 1280, 800));
-
-    ScriptRunner runner(session, out);
-    const ScriptRunner::Outcome outcome = runner.run(lines);
-    out.flush();
+    const ScriptRunner::Outcome outcome = runScriptText(file.readAll(), session, settings, out);
     if (!outcome.ok()) {
         err << scriptPath << ':' << outcome.line << ": " << outcome.error << '\n';
         return 2;

@@ -17,6 +17,7 @@
 
 #include "cli/headlesssession.hpp"
 
+#include <QSettings>
 #include <QStringList>
 #include <QTextStream>
 
@@ -51,6 +52,11 @@ private:
     QTextStream &m_out;
     std::map<QString, std::function<void()>> m_commands;
 };
+
+/// The main window's load, then the lines of `script` (UTF-8, split at line
+/// feeds) until the first wrong one; the unload is left to the caller.
+ScriptRunner::Outcome runScriptText(const QByteArray &script, HeadlessSession &session,
+                                    QSettings &settings, QTextStream &out);
 
 /// Runs SCRIPT against the data folder: the main window's load, the script,
 /// the unload. Returns the exit status (0, or 2 for an error of the script).

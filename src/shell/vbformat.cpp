@@ -4,7 +4,6 @@
 #include <charconv>
 #include <cmath>
 #include <cstdlib>
-#include <ranges>
 #include <string>
 
 namespace arbolex::shell {
@@ -43,12 +42,14 @@ Pattern parsePattern(QStringView pattern) {
 /// Adds one unit in the last digit of a string of decimal digits; returns
 /// false when the carry runs out of the left end.
 bool incrementDigits(std::string &digits) {
-    for (char &digit : std::views::reverse(digits)) {
-        if (digit != '9') {
-            ++digit;
+    // Reverse iterators rather than std::views::reverse, which clang 14 cannot
+    // compile with the standard library of gcc 12 (the fuzzing build).
+    for (auto digit = digits.rbegin(); digit != digits.rend(); ++digit) {
+        if (*digit != '9') {
+            ++*digit;
             return true;
         }
-        digit = '0';
+        *digit = '0';
     }
     return false;
 }

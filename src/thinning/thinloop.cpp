@@ -9,6 +9,7 @@
 #include "workflow/mainmessages.hpp"
 #include "workflow/mainwindowlogic.hpp"
 
+#include <algorithm>
 #include <cmath>
 
 namespace arbolex::thinning {
@@ -26,6 +27,10 @@ public:
 private:
     bool &m_flag;
 };
+
+/// More passes than any rotation holds; the loop stops earlier, when a grow
+/// is refused.
+constexpr double kMostLoopPasses = 1.0e6;
 
 double wholeYears(const QString &text) {
     return std::nearbyint(shell::val(text));
@@ -84,7 +89,11 @@ void ThinWindowLogic::cmdLoop_Click() {
             shell::raiseAppFault(shell::RuntimeError::divisionByZero());
         }
         // n + 1 passes: the last one leaves a previewed thinning in the window.
-        const auto passes = static_cast<long>(std::nearbyint((until - age) / frequency));
+        // The age field takes any digits: an age far beyond every model gives
+        // a count no long holds, and then no pass at all.
+        const double passCount = std::nearbyint((until - age) / frequency);
+        const long passes =
+            passCount >= 0.0 ? static_cast<long>(std::min(passCount, kMostLoopPasses)) : -1;
         const LoopUnderWay underWay(m_flags.loopUnderWay);
         for (long i = 0; i <= passes; ++i) {
             cmdAccept_Click();

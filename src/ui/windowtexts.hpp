@@ -5,6 +5,7 @@
 // one edit.
 
 #include "engine/catalogue.hpp"
+#include "shell/version.hpp"
 
 #include <QString>
 
@@ -13,10 +14,10 @@ namespace arbolex::ui::text {
 // ---- Program --------------------------------------------------------------------
 
 inline QString programName() {
-    return QStringLiteral("ARBOLEX");
+    return shell::programName();
 }
 inline QString programVersion() {
-    return QStringLiteral("0.1.0");
+    return shell::programVersion();
 }
 inline QString programPurpose() {
     return QStringLiteral("Growth and yield of even-aged conifer plantations: projects a "

@@ -9,6 +9,7 @@
 #include "workflow/yieldclass.hpp"
 
 #include <cmath>
+#include <limits>
 
 namespace arbolex::workflow {
 
@@ -21,9 +22,16 @@ QString wholeText(double value) {
     return QString::number(static_cast<qint64>(std::nearbyint(value)));
 }
 
-/// Nearest whole number, halves to even, as increments round their terms.
+/// Nearest whole number, halves to even, as increments round their terms. A
+/// term no int holds (a stand grown far beyond its model) overflows, as the
+/// sums of those terms do, instead of an undefined cast.
 int roundWhole(double value) {
-    return static_cast<int>(std::nearbyint(value));
+    const double rounded = std::nearbyint(value);
+    if (!(rounded >= std::numeric_limits<int>::min() &&
+          rounded <= std::numeric_limits<int>::max())) {
+        shell::raiseAppFault(shell::RuntimeError::overflow());
+    }
+    return static_cast<int>(rounded);
 }
 
 } // namespace

@@ -62,7 +62,8 @@ void MainWindowLogic::cmdFinalCut_Click() {
             // same age, so the thinning keeps its row and its revenue.
             TableRow felled;
             felled.kind = RowKind::Growth;
-            const RowRecord &stand = m_table.row(standRow).record;
+            // A copy: the append below may move every row of the table.
+            const RowRecord stand = m_table.row(standRow).record;
             felled.record.age = stand.age;
             felled.record.topHeight = stand.topHeight;
             felled.record.basalArea = stand.basalArea;

@@ -2,6 +2,7 @@
 #include "cli/runnerfixture.hpp"
 #include "mocks/programservices.hpp"
 #include "mocks/qtprinters.hpp"
+#include "shell/testfiles.hpp"
 
 #include "cli/scriptrunner.hpp"
 
@@ -11,6 +12,8 @@
 #include <QTemporaryDir>
 
 #include <gtest/gtest.h>
+
+#include <algorithm>
 
 namespace arbolex::testing {
 namespace {
@@ -78,11 +81,31 @@ TEST_F(RunnerTest, ScriptErrorsNameTheirLine) {
         {{QStringLiteral("select")}, 1},
         {{QStringLiteral("answer maybe")}, 1},
         {{QStringLiteral("print nowhere")}, 1},
+        // The net present value window takes nothing until it is open.
+        {{QStringLiteral("model 0"), QStringLiteral("set frmNPV.NPV_Grid(1,1) Planting")}, 2},
+        {{QStringLiteral("press frmNPV.cmdNPV")}, 1},
     };
     for (const Case &c : cases) {
         EXPECT_EQ(run(c.lines).line, c.line) << c.lines.join(QLatin1Char('|')).toStdString();
         EXPECT_FALSE(outcome.error.isEmpty());
     }
+}
+
+TEST_F(RunnerTest, IncrementsOfAStandBeyondItsModelOverflow) {
+    // Scots pine 43 m tall at 15: the volumes run away, and an increment's
+    // terms no longer fit a whole number. That is the Overflow of the grid's
+    // procedure, logged; the conversion it replaces was undefined, which the
+    // sanitizer build (make test-asan) stops at.
+    ASSERT_TRUE(run({QStringLiteral("model 8"), QStringLiteral("set txtFromA 15"),
+                     QStringLiteral("set txtFromN 2500"), QStringLiteral("set txtFromH 43"),
+                     QStringLiteral("set txtFromB 20"), QStringLiteral("set txtToA 50"),
+                     QStringLiteral("set txtByA 5"), QStringLiteral("press cmdGrow")})
+                    .ok());
+    const QStringList log = logMessages(dir.path());
+    EXPECT_TRUE(std::any_of(log.begin(), log.end(), [](const QString &line) {
+        return line.startsWith(QStringLiteral("Error 6 Overflow in line ")) &&
+               line.endsWith(QStringLiteral(" in Misc.AppendGrid()"));
+    })) << log.join(QLatin1Char('|')).toStdString();
 }
 
 TEST_F(RunnerTest, AQuestionWithoutAnAnswerStopsTheScript) {

@@ -152,6 +152,18 @@ TEST_F(ThinningTest, LoopPassesRoundHalvesToEven) {
     }
 }
 
+TEST_F(ThinningTest, LoopFromAnAgeBeyondEveryModelMakesNoPass) {
+    openThinning(QStringLiteral("20"));
+    typeThin(ThinControl::txtRemV, QStringLiteral("30"));
+    thin.cmdThin_Click();
+    typeThin(ThinControl::txtThinFreq, QStringLiteral("3"));
+    typeThin(ThinControl::txtThinUntil, QStringLiteral("50"));
+    const int rows = logic.table().rowCount();
+    type(MainControl::txtFromA, QString(70, QLatin1Char('2'))); // beyond a long
+    thin.cmdLoop_Click();
+    EXPECT_EQ(logic.table().rowCount(), rows);
+}
+
 TEST_F(ThinningTest, LoopFieldsAreChecked) {
     openThinning();
     thin.cmdLoop_Click();
