@@ -83,8 +83,6 @@ void MainWindow::attach(workflow::MainWindowLogic &logic, QSettings &settings) {
     m_settings = &settings;
     m_model = new ProjectionModel(logic.table(), this);
     m_grid->setModel(m_model);
-    connect(m_model, &QAbstractItemModel::modelReset, this, &MainWindow::fitColumns);
-    connect(m_model, &QAbstractItemModel::rowsInserted, this, &MainWindow::fitColumns);
     connect(m_grid->selectionModel(), &QItemSelectionModel::selectionChanged, this,
             &MainWindow::selectionToLogic);
     connect(m_grid->selectionModel(), &QItemSelectionModel::currentRowChanged, this,

@@ -36,18 +36,16 @@ void MainWindowLogic::AjustArraysAfterDelete(int firstDeleted) {
     m_states.clear();
     m_firstNew = 0;
     timberRevenueChanged();
-    // The rotation is open again: no final cut, no cash flow.
+    // The rotation is open again unless its final cut survived; no cash flow.
     m_felled = false;
+    bool thinnings = false;
     for (int r = 1; r <= m_table.lastRow(); ++r) {
         m_felled = m_felled || m_table.row(r).finalCut;
+        thinnings = thinnings || m_table.row(r).isThinning();
     }
     m_cashFlow.reset();
     if (m_npv != nullptr) {
         m_npv->view().close();
-    }
-    bool thinnings = false;
-    for (int r = 1; r <= m_table.lastRow(); ++r) {
-        thinnings = thinnings || m_table.row(r).isThinning();
     }
     if (m_thinning != nullptr) {
         m_thinning->flags().noThinningYet = !thinnings;
