@@ -10,8 +10,13 @@ packages=(build-essential cmake ninja-build pkg-config
           libgtest-dev libgmock-dev libbenchmark-dev clang-format)
 if [[ "${1:-}" != "--no-gui" ]]; then
     # desktop-file-utils, appstream and shared-mime-info check the installed
-    # desktop entry, metainfo and MIME type in the tests.
-    packages+=(qt6-base-dev qt6-multimedia-dev libgl-dev
+    # desktop entry, metainfo and MIME type in the tests; qt6-charts-dev and
+    # qt6-svg-dev draw and export the charts (Qt Charts needs the OpenGL module
+    # present to configure); libgdal-dev reads and writes the
+    # estate's spreadsheets and GIS layers; poppler-utils turns reports into
+    # pages to look at.
+    packages+=(qt6-base-dev qt6-multimedia-dev qt6-charts-dev libqt6opengl6-dev qt6-svg-dev libgl-dev
+               libgdal-dev poppler-utils
                fonts-dejavu-core xvfb xauth
                desktop-file-utils appstream shared-mime-info)
 fi
