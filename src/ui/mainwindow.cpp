@@ -105,10 +105,12 @@ void MainWindow::SetModelFromfrmModelChoice(int modelId) {
 void MainWindow::buildMenus() {
     QMenu *models = menuBar()->addMenu(text::menuModel());
     models->setObjectName(QStringLiteral("mnuModel"));
+    models->setToolTipsVisible(true);
     m_modelActions = new QActionGroup(this);
     m_modelActions->setExclusive(true);
     for (int id = 0; id < engine::kModelCount; ++id) {
-        QAction *entry = models->addAction(text::modelEntry(id));
+        QAction *entry = models->addAction(text::modelMenuEntry(id));
+        entry->setToolTip(text::modelDetails(id));
         entry->setCheckable(true);
         entry->setData(id);
         m_modelActions->addAction(entry);

@@ -5,6 +5,7 @@
 // one edit.
 
 #include "engine/catalogue.hpp"
+#include "engine/modeldescription.hpp"
 #include "shell/version.hpp"
 
 #include <QString>
@@ -32,6 +33,22 @@ inline QString modelEntry(int modelId) {
     return (modelId < 10 ? QStringLiteral("\u2007") : QString()) + QString::number(modelId) +
            QStringLiteral("   ") +
            QString::fromLatin1(engine::catalogue().at(static_cast<std::size_t>(modelId)).label);
+}
+
+/// Entry of the model menu: the list entry, then the species, the regime and
+/// what an alternative calibration changes from the base entry it shares its
+/// label with.
+inline QString modelMenuEntry(int modelId) {
+    return modelEntry(modelId) + QStringLiteral("    \u2014  ") +
+           QString::fromStdString(engine::modelMenuNote(modelId));
+}
+/// One line on the model: species, regime, what an alternative changes.
+inline QString modelSummary(int modelId) {
+    return QString::fromStdString(engine::modelSummary(modelId));
+}
+/// A few sentences on the model, for tooltips and the model window's description.
+inline QString modelDetails(int modelId) {
+    return QString::fromStdString(engine::modelDetails(modelId));
 }
 
 // ---- Main window ------------------------------------------------------------------
