@@ -8,6 +8,7 @@
 #include "economics/timberpriceswindowlogic.hpp"
 #include "engine/grow.hpp"
 #include "shell/datafolder.hpp"
+#include "shell/datahistory.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/version.hpp"
@@ -267,6 +268,11 @@ int main(int argc, char *argv[]) {
     interactive.setParentWidget(&window);
     MainWindowLogic logic(grow, prices, log, folder, window, interactive);
     window.attach(logic, settings);
+    // Copies of the data files the exit writes over, in the user's data location.
+    const arbolex::shell::DataHistory history(arbolex::shell::DataHistory::folderIn(
+        arbolex::shell::programDataPlaces(app.applicationDirPath()).userFolder));
+    logic.attachDataHistory(&history);
+    window.attachDataHistory(history, folder);
     // The thinning window opens over the main window; the main window's thin
     // command reaches it through its logic.
     arbolex::ui::ThinWindow thinWindow(&window);

@@ -21,7 +21,9 @@ constexpr std::array<std::pair<std::string_view, std::string_view>, 5> kSpecies{
 
 constexpr int kBaseEntries = 10;
 
-const CatalogueEntry &entry(int modelId) { return catalogue()[static_cast<std::size_t>(modelId)]; }
+const CatalogueEntry &entry(int modelId) {
+    return catalogue()[static_cast<std::size_t>(modelId)];
+}
 
 std::string_view speciesOf(std::string_view label) {
     const std::string_view code = label.substr(0, label.find(' '));
@@ -94,11 +96,15 @@ std::string differencesText(const ModelDescription &model, bool brief = false) {
     return text;
 }
 
-std::string regimeText(bool thinned) { return thinned ? "thinned" : "un-thinned"; }
+std::string regimeText(bool thinned) {
+    return thinned ? "thinned" : "un-thinned";
+}
 
 } // namespace
 
-bool HasVolumeCorrection(int modelId) { return modelId == 16 || modelId == 17; }
+bool HasVolumeCorrection(int modelId) {
+    return modelId == 16 || modelId == 17;
+}
 
 ModelDescription describeModel(int modelId) {
     const CatalogueEntry &own = entry(modelId);
@@ -106,7 +112,8 @@ ModelDescription describeModel(int modelId) {
     model.species = speciesOf(own.label);
     model.thinnedRegime = std::string_view(own.label).find("(Thinned)") != std::string_view::npos;
     model.baseModel = baseOf(modelId);
-    model.thinningResponse = std::any_of(own.t.begin(), own.t.end(), [](double c) { return c != 0.0; });
+    model.thinningResponse =
+        std::any_of(own.t.begin(), own.t.end(), [](double c) { return c != 0.0; });
     model.volumeCorrection = HasVolumeCorrection(modelId);
     const CatalogueEntry &base = entry(model.baseModel);
     if (own.s != base.s) {
@@ -144,13 +151,14 @@ std::string modelMenuNote(int modelId) {
         return text;
     }
     text += "; as " + std::to_string(model.baseModel);
-    return text + (model.differences.empty() ? ", value for value" : ", " + differencesText(model, true));
+    return text +
+           (model.differences.empty() ? ", value for value" : ", " + differencesText(model, true));
 }
 
 std::string modelDetails(int modelId) {
     const ModelDescription model = describeModel(modelId);
-    std::string text = std::string(model.species) + ", " + regimeText(model.thinnedRegime) +
-                       " regime. ";
+    std::string text =
+        std::string(model.species) + ", " + regimeText(model.thinnedRegime) + " regime. ";
     if (model.thinnedRegime) {
         text += model.thinningResponse ? "Thinnings change the stand's development."
                                        : "No thinning response: thinnings remove trees without "

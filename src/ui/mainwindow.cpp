@@ -5,6 +5,7 @@
 #include "engine/catalogue.hpp"
 #include "ui/groupheaderview.hpp"
 #include "ui/projectionmodel.hpp"
+#include "ui/restoredatadialog.hpp"
 #include "ui/stringgridmodel.hpp"
 #include "ui/windowtexts.hpp"
 #include "workflow/mainmessages.hpp"
@@ -155,6 +156,13 @@ void MainWindow::buildMenus() {
         }
     });
     help->addSeparator();
+    QAction *restore = help->addAction(text::menuRestoreData());
+    restore->setObjectName(QStringLiteral("mnuRestoreData"));
+    connect(restore, &QAction::triggered, this, [this] {
+        if (m_logic != nullptr && m_dataHistory != nullptr) {
+            RestoreDataDialog(*m_dataHistory, m_dataFolder, *m_logic, this).exec();
+        }
+    });
     connect(help->addAction(text::menuAbout()), &QAction::triggered, this, &MainWindow::about);
 }
 

@@ -15,6 +15,9 @@ class QSettings;
 class QStackedWidget;
 class QTableView;
 
+namespace arbolex::shell {
+class DataHistory;
+}
 namespace arbolex::workflow {
 class MainWindowLogic;
 }
@@ -37,6 +40,12 @@ public:
     /// Binds the window to its logic; `settings` receives the placement when
     /// the window closes. Both must outlive the window.
     void attach(workflow::MainWindowLogic &logic, QSettings &settings);
+
+    /// The history Help → Restore data files… lists, of the data folder `dataFolder`.
+    void attachDataHistory(const shell::DataHistory &history, const QString &dataFolder) {
+        m_dataHistory = &history;
+        m_dataFolder = dataFolder;
+    }
 
     /// Takes the model chosen in the model choice window.
     void SetModelFromfrmModelChoice(int modelId);
@@ -90,6 +99,8 @@ private:
     void about();
 
     workflow::MainWindowLogic *m_logic = nullptr;
+    const shell::DataHistory *m_dataHistory = nullptr;
+    QString m_dataFolder;
     QSettings *m_settings = nullptr;
 
     std::array<QWidget *, workflow::kMainControlCount> m_controls{};

@@ -6,9 +6,11 @@
 
 #include "engine/catalogue.hpp"
 #include "engine/modeldescription.hpp"
+#include "shell/datahistory.hpp"
 #include "shell/version.hpp"
 
 #include <QString>
+#include <QStringList>
 
 namespace arbolex::ui::text {
 
@@ -65,6 +67,46 @@ inline QString menuThreshold() {
 inline QString menuNotes() {
     return QStringLiteral("&Notes on this model\u2026");
 }
+inline QString menuRestoreData() {
+    return QStringLiteral("Restore data files\u2026");
+}
+
+// ---- Restore data files --------------------------------------------------------------
+
+inline QString restoreDataTitle() {
+    return QStringLiteral("Restore data files");
+}
+inline QString restoreDataIntro(const QString &folder) {
+    return QStringLiteral("Before the price lists and the assortment categories are written at "
+                          "exit, the files they replace are kept here, the last %1 of each. "
+                          "Restore puts a kept copy back in the data folder (the file it "
+                          "replaces is kept in turn) and reads the lists again.\n\nKept in: %2")
+        .arg(QString::number(shell::DataHistory::kCopiesKept), folder);
+}
+inline QStringList restoreDataColumns() {
+    return {QStringLiteral("File"), QStringLiteral("Kept on"), QStringLiteral("Size")};
+}
+inline QString restoreDataButton() {
+    return QStringLiteral("&Restore");
+}
+inline QString restoreDataNone() {
+    return QStringLiteral("No copies kept yet.");
+}
+inline QString restoreDataConfirm(const QString &file, const QString &when) {
+    return QStringLiteral("PLEASE CONFIRM - Replace %1 in the data folder with the copy kept on "
+                          "%2? The present file is kept in the history first.")
+        .arg(file, when);
+}
+inline QString restoreDataFault(const QString &file, const QString &why) {
+    return QStringLiteral("FAULT - %1 could not be restored: %2. Nothing was changed.")
+        .arg(file, why);
+}
+inline QString restoreDataDone(const QString &file, const QString &when) {
+    return QStringLiteral("%1 as kept on %2 is back in the data folder, and the price lists and "
+                          "categories have been read again.")
+        .arg(file, when);
+}
+
 inline QString menuEdit() {
     return QStringLiteral("&Edit");
 }

@@ -20,6 +20,7 @@
 class QSettings;
 
 namespace arbolex::shell {
+class DataHistory;
 class ErrorLog;
 class IClipboard;
 class IInteractive;
@@ -177,6 +178,11 @@ public:
     void attachTimberPrices(economics::TimberPricesWindowLogic *prices) { m_timberPrices = prices; }
     /// The assortment report window's logic that the assort command opens.
     void attachAssortments(assortments::AssortWindowLogic *assort) { m_assort = assort; }
+    /// The history that keeps the data files the exit writes over.
+    void attachDataHistory(const shell::DataHistory *history) { m_dataHistory = history; }
+    /// Reads the price lists and the categories from the data folder again
+    /// (after a file was restored), keeping the price set in use.
+    void reloadDataFiles();
 
     /// The table as the thinning rows change it.
     ProjectionTable &tableForThinning() { return m_table; }
@@ -237,6 +243,7 @@ private:
     shell::IClipboard *m_clipboard = nullptr;
     economics::TimberPricesWindowLogic *m_timberPrices = nullptr;
     assortments::AssortWindowLogic *m_assort = nullptr;
+    const shell::DataHistory *m_dataHistory = nullptr;
     economics::TimberRevenue m_timberRevenue;
     economics::CashFlow m_cashFlow;
     /// Set by the final cut; no growing or thinning until rows are cleared or deleted.

@@ -145,7 +145,9 @@ TEST_F(MainWindowGuiTest, ModelMenuListsTheCatalogueAndSwitchesTheModel) {
         EXPECT_TRUE(entries[id]->text().contains(QString::number(id)));
     }
     // Calibrations that share a label are told apart, and not only by number.
-    const auto note = [&](int id) { return entries[id]->text().section(QChar(0x2014), 1); };
+    const auto note = [&](int id) {
+        return entries[id]->text().section(QChar(0x2014), 1);
+    };
     EXPECT_NE(note(0), note(16));
     EXPECT_NE(note(16), note(19));
 
