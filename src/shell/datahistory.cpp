@@ -61,9 +61,8 @@ QList<KeptCopy> DataHistory::copies() const {
         }
         all.append({name.left(at), keptAt, entry.size(), entry.absoluteFilePath()});
     }
-    std::stable_sort(all.begin(), all.end(), [](const KeptCopy &a, const KeptCopy &b) {
-        return a.keptAt > b.keptAt;
-    });
+    std::stable_sort(all.begin(), all.end(),
+                     [](const KeptCopy &a, const KeptCopy &b) { return a.keptAt > b.keptAt; });
     return all;
 }
 

@@ -97,8 +97,7 @@ void RestoreDataDialog::restoreSelected() {
     }
     const QString when = QLocale().toString(copy->keptAt, QLocale::ShortFormat);
     if (QMessageBox::question(this, text::restoreDataTitle(),
-                              text::restoreDataConfirm(copy->fileName, when)) !=
-        QMessageBox::Yes) {
+                              text::restoreDataConfirm(copy->fileName, when)) != QMessageBox::Yes) {
         return;
     }
     QString error;

@@ -56,14 +56,15 @@ TEST_F(DataHistoryTest, RestoreKeepsThePresentFileSoItCanBeUndone) {
     writeBytes(prices, "empty\r\n");
 
     QString error;
-    ASSERT_TRUE(history.restore(history.copies().front(), dataDir.path(), error)) << error.toStdString();
+    ASSERT_TRUE(history.restore(history.copies().front(), dataDir.path(), error))
+        << error.toStdString();
     EXPECT_EQ(readBytes(prices), "good\r\n");
     ASSERT_EQ(history.copies().size(), 2);
     EXPECT_EQ(readBytes(history.copies().front().path), "empty\r\n");
 
     // A data folder that is gone refuses the restore and says why.
-    EXPECT_FALSE(history.restore(history.copies().back(), dataDir.filePath(QStringLiteral("gone")),
-                                 error));
+    EXPECT_FALSE(
+        history.restore(history.copies().back(), dataDir.filePath(QStringLiteral("gone")), error));
     EXPECT_FALSE(error.isEmpty());
 }
 
