@@ -31,8 +31,6 @@
 #include <QCommandLineParser>
 #include <QDir>
 #include <QFile>
-#include <QMenu>
-#include <QMenuBar>
 #include <QScreen>
 #include <QSettings>
 #include <QTimer>
@@ -191,15 +189,13 @@ bool demoAssort(MainWindowLogic &logic, ThinWindowLogic &thin,
 /// "Kilbrack 12b.arbolex" in the temporary folder, with the net area typed
 /// afterwards so the caption carries the unsaved mark:
 ///   open            the main window with that document;
-///   menu            the same with the File menu open;
 ///   identification  the same with the "Sub-compartment" dialog open;
 ///   fault           a damaged file opened: its "FAULT - " message.
 /// False for an unknown stage.
 bool demoDocument(MainWindowLogic &logic, ThinWindowLogic &thin,
-                  arbolex::document::DocumentController &documents,
-                  arbolex::ui::MainWindow &window, const QString &stage) {
-    if (stage != QLatin1String("open") && stage != QLatin1String("menu") &&
-        stage != QLatin1String("identification") && stage != QLatin1String("fault")) {
+                  arbolex::document::DocumentController &documents, const QString &stage) {
+    if (stage != QLatin1String("open") && stage != QLatin1String("identification") &&
+        stage != QLatin1String("fault")) {
         return false;
     }
     demoThin(logic, thin, QStringLiteral("loop"));
@@ -210,11 +206,7 @@ bool demoDocument(MainWindowLogic &logic, ThinWindowLogic &thin,
     documents.saveAs(temp.filePath(QStringLiteral("Kilbrack 12b.arbolex")));
     logic.typeText(MainControl::txtNetArea, QStringLiteral("12.5"));
     documents.refreshCaption();
-    if (stage == QLatin1String("menu")) {
-        QMenu *file = window.fileMenu();
-        file->popup(window.menuBar()->mapToGlobal(
-            window.menuBar()->actionGeometry(file->menuAction()).bottomLeft()));
-    } else if (stage == QLatin1String("identification")) {
+    if (stage == QLatin1String("identification")) {
         documents.editIdentification();
     } else if (stage == QLatin1String("fault")) {
         const QString damaged = temp.filePath(QStringLiteral("Kilbrack 12c.arbolex"));
@@ -395,7 +387,7 @@ int main(int argc, char *argv[]) {
     } else if (parser.isSet(options.demoDocument)) {
         const QString stage = parser.value(options.demoDocument);
         QTimer::singleShot(0, &window, [&, stage] {
-            if (!demoDocument(logic, thinLogic, documents, window, stage)) {
+            if (!demoDocument(logic, thinLogic, documents, stage)) {
                 qWarning("unknown document demonstration: %s", qPrintable(stage));
             }
         });
