@@ -3,6 +3,7 @@
 // the user choose the model in the model choice window.
 #include "assortments/assortuserlogic.hpp"
 #include "assortments/assortwindowlogic.hpp"
+#include "document/documentcontroller.hpp"
 #include "economics/npvwindowlogic.hpp"
 #include "economics/prices.hpp"
 #include "economics/timberpriceswindowlogic.hpp"
@@ -15,6 +16,7 @@
 #include "thinning/thinwindowlogic.hpp"
 #include "ui/assortuserwindow.hpp"
 #include "ui/assortwindow.hpp"
+#include "ui/documentmenu.hpp"
 #include "ui/mainwindow.hpp"
 #include "ui/modelchoicedialog.hpp"
 #include "ui/npvwindow.hpp"
@@ -28,6 +30,8 @@
 #include <QAction>
 #include <QApplication>
 #include <QCommandLineParser>
+#include <QDir>
+#include <QFile>
 #include <QScreen>
 #include <QSettings>
 #include <QTimer>
@@ -182,6 +186,42 @@ bool demoAssort(MainWindowLogic &logic, ThinWindowLogic &thin,
     return false;
 }
 
+/// The document demonstrations, from the thinning loop's stand saved as
+/// "Kilbrack 12b.arbolex" in the temporary folder, with the net area typed
+/// afterwards so the caption carries the unsaved mark:
+///   open            the main window with that document;
+///   identification  the same with the "Sub-compartment" dialog open;
+///   fault           a damaged file opened: its "FAULT - " message.
+/// False for an unknown stage.
+bool demoDocument(MainWindowLogic &logic, ThinWindowLogic &thin,
+                  arbolex::document::DocumentController &documents, const QString &stage) {
+    if (stage != QLatin1String("open") && stage != QLatin1String("identification") &&
+        stage != QLatin1String("fault")) {
+        return false;
+    }
+    demoThin(logic, thin, QStringLiteral("loop"));
+    documents.setIdentification({QStringLiteral("Kilbrack"), QStringLiteral("12"),
+                                 QStringLiteral("b"),
+                                 QStringLiteral("Sitka spruce, planted 1998 on peaty gley")});
+    const QDir temp = QDir::temp();
+    documents.saveAs(temp.filePath(QStringLiteral("Kilbrack 12b.arbolex")));
+    logic.typeText(MainControl::txtNetArea, QStringLiteral("12.5"));
+    documents.refreshCaption();
+    if (stage == QLatin1String("identification")) {
+        documents.editIdentification();
+    } else if (stage == QLatin1String("fault")) {
+        const QString damaged = temp.filePath(QStringLiteral("Kilbrack 12c.arbolex"));
+        QFile file(damaged);
+        if (file.open(QIODevice::WriteOnly | QIODevice::Truncate)) {
+            file.write("{\n    \"format\": \"ARBOLEX sub-compartment\",\n    \"version\": 1,\n"
+                       "    \"model\": 0,\n    \"table\": {\"rows\": [\n");
+        }
+        file.close();
+        documents.open(damaged);
+    }
+    return true;
+}
+
 /// The options of the command line.
 struct Options {
     explicit Options(QCommandLineParser &parser) {
@@ -200,6 +240,11 @@ struct Options {
         parser.addOption(demoPrices);
         demoAssort.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(demoAssort);
+        demoDocument.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(demoDocument);
+        parser.addPositionalArgument(QStringLiteral("file"),
+                                     QStringLiteral("A sub-compartment (.arbolex) to open."),
+                                     QStringLiteral("[FILE]"));
         quitWhenShown.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(quitWhenShown);
     }
@@ -220,6 +265,8 @@ struct Options {
     QCommandLineOption demoPrices{QStringLiteral("demo-prices")};
     QCommandLineOption demoAssort{QStringLiteral("demo-assort"), QString(),
                                   QStringLiteral("STAGE")};
+    QCommandLineOption demoDocument{QStringLiteral("demo-document"), QString(),
+                                    QStringLiteral("STAGE")};
     /// Ends the program once the main window is on screen: start-up is timed with it.
     QCommandLineOption quitWhenShown{QStringLiteral("quit-when-shown")};
 };
@@ -306,6 +353,18 @@ int main(int argc, char *argv[]) {
     QObject::connect(window.assortUserAction(), &QAction::triggered, &window,
                      [&assortUserLogic] { assortUserLogic.mnuAssortUser_Click(); });
     logic.Form_Load(settings, QGuiApplication::primaryScreen()->availableGeometry());
+    // The sub-compartment as a document: the File menu, and the question
+    // before the window closes on unsaved work.
+    arbolex::ui::DocumentMenu documentMenu(window.fileMenu(), &window);
+    arbolex::document::DocumentController documents(logic, interactive, &settings,
+                                                    &documentMenu);
+    documentMenu.attach(documents);
+    window.setCloseCheck([&documents] { return documents.maySafelyDiscard(); });
+    documents.start();
+    if (const QStringList files = parser.positionalArguments(); !files.isEmpty()) {
+        const QString file = files.first();
+        QTimer::singleShot(0, &window, [&documents, file] { documents.open(file); });
+    }
 
     if (parser.isSet(options.demoRotation)) {
         const QString stage = parser.value(options.demoRotation);
@@ -329,6 +388,13 @@ int main(int argc, char *argv[]) {
         QTimer::singleShot(0, &window, [&logic, &thinLogic, stage] {
             if (!demoThin(logic, thinLogic, stage)) {
                 qWarning("unknown thinning demonstration: %s", qPrintable(stage));
+            }
+        });
+    } else if (parser.isSet(options.demoDocument)) {
+        const QString stage = parser.value(options.demoDocument);
+        QTimer::singleShot(0, &window, [&, stage] {
+            if (!demoDocument(logic, thinLogic, documents, stage)) {
+                qWarning("unknown document demonstration: %s", qPrintable(stage));
             }
         });
     } else if (parser.isSet(options.demoPrices)) {

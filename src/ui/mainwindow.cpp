@@ -2,6 +2,7 @@
 #include "ui/fieldinput.hpp"
 
 #include "assortments/assortmessages.hpp"
+#include "document/documentmessages.hpp"
 #include "engine/catalogue.hpp"
 #include "ui/groupheaderview.hpp"
 #include "ui/projectionmodel.hpp"
@@ -104,6 +105,7 @@ void MainWindow::SetModelFromfrmModelChoice(int modelId) {
 // ---- Building the window ------------------------------------------------------------
 
 void MainWindow::buildMenus() {
+    m_fileMenu = menuBar()->addMenu(document::text::menuFile());
     QMenu *models = menuBar()->addMenu(text::menuModel());
     models->setObjectName(QStringLiteral("mnuModel"));
     models->setToolTipsVisible(true);
@@ -565,6 +567,10 @@ void MainWindow::setPlacement(const QRect &placement) {
 // ---- Events --------------------------------------------------------------------------------
 
 void MainWindow::closeEvent(QCloseEvent *event) {
+    if (m_closeCheck && !m_closeCheck()) {
+        event->ignore();
+        return;
+    }
     if (m_logic != nullptr && m_settings != nullptr) {
         m_logic->Form_Unload(*m_settings);
     }

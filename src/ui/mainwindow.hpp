@@ -5,11 +5,13 @@
 #include <QMainWindow>
 
 #include <array>
+#include <functional>
 
 class QAction;
 class QActionGroup;
 class QLabel;
 class QLineEdit;
+class QMenu;
 class QPushButton;
 class QSettings;
 class QStackedWidget;
@@ -56,6 +58,10 @@ public:
     QTableView *summaryGrid() const { return m_summaryGrid; }
     ProjectionModel *gridModel() const { return m_model; }
     QActionGroup *modelMenu() const { return m_modelActions; }
+    /// The File menu, empty until the document menu fills it.
+    QMenu *fileMenu() const { return m_fileMenu; }
+    /// Asked before the window closes (unsaved work); false keeps it open.
+    void setCloseCheck(std::function<bool()> check) { m_closeCheck = std::move(check); }
     /// The entry `mnuAssortUser` that opens the user categories window.
     QAction *assortUserAction() const { return m_assortUserAction; }
 
@@ -107,6 +113,8 @@ private:
     /// Texts of the commands the window does not offer (yet).
     std::array<QString, workflow::kMainControlCount> m_absentText;
 
+    QMenu *m_fileMenu = nullptr;
+    std::function<bool()> m_closeCheck;
     QActionGroup *m_modelActions = nullptr;
     QAction *m_assortUserAction = nullptr;
     QTableView *m_grid = nullptr;

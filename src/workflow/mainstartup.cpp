@@ -1,4 +1,5 @@
 // The main window's load and unload, the model menu and its information boxes.
+#include "document/documentmessages.hpp"
 #include "economics/pricedata.hpp"
 #include "economics/prices.hpp"
 #include "shell/apperror.hpp"
@@ -135,8 +136,13 @@ void MainWindowLogic::mnuModel_Click(int index) {
 }
 
 void MainWindowLogic::updateCaption() {
-    m_view.setCaption(text::titleArbolex() + text::captionModelInUse() +
-                      QString::fromStdString(m_grow.label()));
+    QString caption = text::titleArbolex() + text::captionModelInUse() +
+                      QString::fromStdString(m_grow.label());
+    if (!m_documentName.isEmpty()) {
+        caption += document::text::captionDocument() + m_documentName +
+                   (m_modified ? document::text::unsavedMark() : QString());
+    }
+    m_view.setCaption(caption);
 }
 
 float MainWindowLogic::thresholdBasalArea() {

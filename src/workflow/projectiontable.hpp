@@ -76,6 +76,7 @@ struct TableRow {
     bool isGrowth() const { return kind == RowKind::Growth; }
     bool isThinning() const { return kind == RowKind::Thinning; }
     bool isText() const { return kind == RowKind::Text; }
+    bool operator==(const TableRow &) const = default;
 };
 
 /// The projection table `flxMain`: the header row, the data rows with their
