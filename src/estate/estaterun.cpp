@@ -45,11 +45,12 @@ private:
     long long m_read = 0;
 };
 
-void evaluate(RowEvaluator &evaluator, Chunk &chunk) {
+void evaluate(RowEvaluator &evaluator, const IRowSink &sink, Chunk &chunk) {
     chunk.results.clear();
     chunk.results.reserve(chunk.rows.size());
     for (const EstateRow &row : chunk.rows) {
         chunk.results.push_back(evaluator.evaluate(row.values));
+        sink.prepare(row, chunk.results.back());
     }
 }
 
@@ -85,9 +86,10 @@ private:
 /// queues and delivers them in order.
 class Pool {
 public:
-    Pool(int threads, const Layout &layout, const EstateDefaults &defaults) {
+    Pool(int threads, const Layout &layout, const EstateDefaults &defaults, const IRowSink &sink) {
         for (int t = 0; t < threads; ++t) {
-            m_threads.emplace_back([this, &layout, &defaults] { work(layout, defaults); });
+            m_threads.emplace_back(
+                [this, &layout, &defaults, &sink] { work(layout, defaults, sink); });
         }
     }
     Pool(const Pool &) = delete;
@@ -119,7 +121,7 @@ public:
     }
 
 private:
-    void work(const Layout &layout, const EstateDefaults &defaults) {
+    void work(const Layout &layout, const EstateDefaults &defaults, const IRowSink &sink) {
         RowEvaluator evaluator(layout, defaults);
         while (true) {
             std::shared_ptr<Chunk> chunk;
@@ -132,7 +134,7 @@ private:
                 chunk = std::move(m_pending.front());
                 m_pending.pop_front();
             }
-            evaluate(evaluator, *chunk);
+            evaluate(evaluator, sink, *chunk);
             {
                 const std::lock_guard lock(m_mutex);
                 chunk->done = true;
@@ -165,7 +167,7 @@ RunSummary runEstate(IRowSource &source, IRowSink &sink, const Layout &layout,
         RowEvaluator evaluator(layout, defaults);
         Chunk chunk;
         while (reader.fill(chunk)) {
-            evaluate(evaluator, chunk);
+            evaluate(evaluator, sink, chunk);
             if (!deliver(chunk)) {
                 break;
             }
@@ -173,7 +175,7 @@ RunSummary runEstate(IRowSource &source, IRowSink &sink, const Layout &layout,
         }
         return summary;
     }
-    Pool pool(settings.threads, layout, defaults);
+    Pool pool(settings.threads, layout, defaults, sink);
     std::deque<std::shared_ptr<Chunk>> inOrder;
     const std::size_t limit = kChunksPerThread * static_cast<std::size_t>(settings.threads);
     bool more = true;

@@ -36,6 +36,9 @@ public:
 class IRowSink {
 public:
     virtual ~IRowSink() = default;
+    /// Called once for every row, on the thread that grew it, in any order
+    /// and on several threads at once: may fill `result.prepared`.
+    virtual void prepare(const EstateRow & /*row*/, RowResult & /*result*/) const {}
     /// Called once for every row, in input order.
     virtual void write(const EstateRow &row, const RowResult &result) = 0;
 };

@@ -64,6 +64,10 @@ struct RowResult {
 
     /// The row's harvests by calendar year.
     std::vector<ForecastEntry> harvests;
+
+    /// What the sink made of the row on the thread that grew it (its results
+    /// line), so that only the writing is left for the thread that writes.
+    std::string prepared;
 };
 
 } // namespace arbolex::estate

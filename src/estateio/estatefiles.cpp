@@ -1,10 +1,20 @@
 #include "estateio/estatefiles.hpp"
 
+#include "estate/csvfile.hpp"
+
 #include <filesystem>
 
 namespace arbolex::estateio {
 
 namespace {
+
+std::vector<std::string> names(const std::vector<estate::ResultColumn> &columns) {
+    std::vector<std::string> out;
+    for (const estate::ResultColumn &c : columns) {
+        out.push_back(c.name);
+    }
+    return out;
+}
 
 /// Writes each row's results and lists the rows that were not grown.
 class FileSink : public estate::IRowSink {
@@ -12,19 +22,25 @@ public:
     FileSink(const estate::Layout &layout, const std::string &folder, const LayerReader &reader,
              const EstateCallbacks &callbacks)
         : m_layout(layout), m_callbacks(callbacks),
-          m_results(folder + "/" + kResultsFile, estate::resultColumns(layout)),
-          m_errors(folder + "/" + kErrorsFile, textColumns(estate::errorColumns())) {
+          m_results(folder + "/" + kResultsFile, names(estate::resultColumns(layout))),
+          m_errors(folder + "/" + kErrorsFile, estate::errorColumns()) {
         if (!reader.isTable()) {
             const TableWriter::Geometry geometry{reader.spatialReference(), reader.geometryType()};
-            m_layerResults = std::make_unique<TableWriter>(
-                folder + "/" + kResultsLayerFile, estate::resultColumns(layout), &geometry);
+            m_layerResults = std::make_unique<TableWriter>(folder + "/" + kResultsLayerFile,
+                                                           estate::resultColumns(layout), geometry);
         }
     }
 
+    void prepare(const estate::EstateRow &row, estate::RowResult &result) const override {
+        std::vector<std::string> values;
+        estate::resultValues(m_layout, row.line, row.values, result, values);
+        result.prepared = estate::csvLine(values);
+    }
+
     void write(const estate::EstateRow &row, const estate::RowResult &result) override {
-        estate::resultValues(m_layout, row.line, row.values, result, m_values);
-        m_results.write(m_values);
+        m_results.writeLine(result.prepared);
         if (m_layerResults) {
+            estate::resultValues(m_layout, row.line, row.values, result, m_values);
             m_layerResults->write(m_values, row.extra.get());
         }
         if (result.status != estate::RowStatus::kOk) {
@@ -47,28 +63,16 @@ public:
     }
 
 private:
-    static std::vector<estate::ResultColumn> textColumns(const std::vector<std::string> &names) {
-        std::vector<estate::ResultColumn> columns;
-        for (const std::string &n : names) {
-            columns.push_back({n, estate::ColumnType::kText});
-        }
-        return columns;
-    }
-
     const estate::Layout &m_layout;
     const EstateCallbacks &m_callbacks;
-    TableWriter m_results;
-    TableWriter m_errors;
+    estate::CsvFile m_results;
+    estate::CsvFile m_errors;
     std::unique_ptr<TableWriter> m_layerResults;
     std::vector<std::string> m_values;
 };
 
 void writeForecast(const std::string &path, const estate::Forecast &forecast, int firstYear) {
-    std::vector<estate::ResultColumn> columns;
-    for (const std::string &n : estate::forecastColumns()) {
-        columns.push_back({n, estate::ColumnType::kText});
-    }
-    TableWriter table(path, columns);
+    estate::CsvFile table(path, estate::forecastColumns());
     for (const estate::Forecast::Line &line : forecast.lines(firstYear)) {
         table.write(estate::forecastValues(line));
     }

@@ -2,7 +2,6 @@
 
 #include <cpl_conv.h>
 #include <cpl_error.h>
-#include <cpl_string.h>
 #include <cpl_vsi.h>
 #include <gdal.h>
 #include <ogr_api.h>
@@ -119,39 +118,29 @@ bool LayerReader::next(estate::EstateRow &row) {
 }
 
 TableWriter::TableWriter(const std::string &path, const std::vector<estate::ResultColumn> &columns,
-                         const Geometry *geometry)
+                         const Geometry &geometry)
     : m_path(path) {
     registerDrivers();
     CPLErrorReset();
-    const bool gpkg = geometry != nullptr;
-    GDALDriverH driver = GDALGetDriverByName(gpkg ? "GPKG" : "CSV");
+    GDALDriverH driver = GDALGetDriverByName("GPKG");
     if (driver == nullptr) {
-        throw GdalError(std::string("GDAL has no ") + (gpkg ? "GPKG" : "CSV") + " driver");
+        throw GdalError("GDAL has no GeoPackage driver");
     }
     VSIUnlink(path.c_str());
     m_dataset = GDALCreate(driver, path.c_str(), 0, 0, 0, GDT_Unknown, nullptr);
     if (m_dataset == nullptr) {
         throw GdalError(lastError("cannot create \"" + path + "\""));
     }
-    char **options = nullptr;
-    if (!gpkg) {
-        options = CSLSetNameValue(options, "LINEFORMAT", "LF");
-        options = CSLSetNameValue(options, "STRING_QUOTING", "IF_NEEDED");
-    }
-    std::string name = CPLGetBasename(path.c_str());
-    m_layer = GDALDatasetCreateLayer(
-        m_dataset, name.c_str(),
-        gpkg ? static_cast<OGRSpatialReferenceH>(geometry->spatialReference) : nullptr,
-        gpkg ? static_cast<OGRwkbGeometryType>(geometry->type) : wkbNone, options);
-    CSLDestroy(options);
+    const std::string name = CPLGetBasename(path.c_str());
+    m_layer = GDALDatasetCreateLayer(m_dataset, name.c_str(),
+                                     static_cast<OGRSpatialReferenceH>(geometry.spatialReference),
+                                     static_cast<OGRwkbGeometryType>(geometry.type), nullptr);
     if (m_layer == nullptr) {
         GDALClose(m_dataset);
-        throw GdalError(lastError("cannot create a table in \"" + path + "\""));
+        throw GdalError(lastError("cannot create a layer in \"" + path + "\""));
     }
     for (const estate::ResultColumn &c : columns) {
-        // A CSV file keeps every value exactly as written.
-        const OGRFieldType type = gpkg ? fieldType(c.type) : OFTString;
-        OGRFieldDefnH field = OGR_Fld_Create(c.name.c_str(), type);
+        OGRFieldDefnH field = OGR_Fld_Create(c.name.c_str(), fieldType(c.type));
         const OGRErr made = OGR_L_CreateField(m_layer, field, TRUE);
         OGR_Fld_Destroy(field);
         if (made != OGRERR_NONE) {
@@ -159,10 +148,9 @@ TableWriter::TableWriter(const std::string &path, const std::vector<estate::Resu
             throw GdalError(
                 lastError("cannot add the column \"" + c.name + "\" to \"" + path + "\""));
         }
-        m_types.push_back(gpkg ? c.type : estate::ColumnType::kText);
+        m_types.push_back(c.type);
     }
     m_feature = OGR_F_Create(OGR_L_GetLayerDefn(m_layer));
-    m_transactions = gpkg;
 }
 
 TableWriter::~TableWriter() {
@@ -178,7 +166,7 @@ TableWriter::~TableWriter() {
 }
 
 void TableWriter::write(const std::vector<std::string> &values, const void *geometry) {
-    if (m_transactions && m_inTransaction == 0) {
+    if (m_inTransaction == 0) {
         GDALDatasetStartTransaction(m_dataset, FALSE);
     }
     auto *feature = static_cast<OGRFeatureH>(m_feature);
@@ -191,13 +179,12 @@ void TableWriter::write(const std::vector<std::string> &values, const void *geom
             OGR_F_SetFieldString(feature, field, values[i].c_str());
         }
     }
-    if (m_transactions) {
-        OGR_F_SetGeometry(feature, static_cast<OGRGeometryH>(const_cast<void *>(geometry)));
-    }
+    // OGR copies the geometry and never changes the one it is given.
+    OGR_F_SetGeometry(feature, static_cast<OGRGeometryH>(const_cast<void *>(geometry)));
     if (OGR_L_CreateFeature(m_layer, feature) != OGRERR_NONE) {
         throw GdalError(lastError("cannot write to \"" + m_path + "\""));
     }
-    if (m_transactions && ++m_inTransaction == kFeaturesPerTransaction) {
+    if (++m_inTransaction == kFeaturesPerTransaction) {
         GDALDatasetCommitTransaction(m_dataset);
         m_inTransaction = 0;
     }

@@ -51,24 +51,25 @@ private:
     long long m_read = 0;
 };
 
-/// A table written through GDAL: a CSV file (every value as written) or a
-/// GeoPackage layer (typed columns, with a geometry per row).
+/// A GeoPackage layer written through GDAL: typed columns and a geometry per row.
 class TableWriter {
 public:
     struct Geometry {
+        /// OGRSpatialReferenceH of the layer (may be null).
         void *spatialReference = nullptr;
+        /// OGRwkbGeometryType of the layer.
         int type = 0;
     };
-    /// Creates `path` (replacing a file of that name) with `columns`; with
-    /// `geometry`, a GeoPackage. Throws GdalError.
+    /// Creates `path` (replacing a file of that name) with `columns`. Throws GdalError.
     TableWriter(const std::string &path, const std::vector<estate::ResultColumn> &columns,
-                const Geometry *geometry = nullptr);
+                const Geometry &geometry);
     ~TableWriter();
     TableWriter(const TableWriter &) = delete;
     TableWriter &operator=(const TableWriter &) = delete;
 
-    /// Writes one row; `geometry` (an OGR geometry) is copied. Throws GdalError.
-    void write(const std::vector<std::string> &values, const void *geometry = nullptr);
+    /// Writes one row; `geometry` (an OGR geometry, may be null) is copied.
+    /// Throws GdalError.
+    void write(const std::vector<std::string> &values, const void *geometry);
     /// Writes what is buffered and closes the file. Throws GdalError.
     void close();
 
@@ -77,13 +78,12 @@ private:
     void *m_layer = nullptr;
     void *m_feature = nullptr;
     std::vector<estate::ColumnType> m_types;
-    bool m_transactions = false;
     long long m_inTransaction = 0;
     std::string m_path;
 };
 
-/// Every row of a CSV file, as text (for reading back the estate's own
-/// tables). Throws GdalError.
+/// Every row of the first layer of `path`, as text (for reading back the
+/// estate's own tables). Throws GdalError.
 std::vector<std::vector<std::string>> readTable(const std::string &path,
                                                 std::vector<std::string> *columnNames = nullptr);
 
