@@ -51,7 +51,7 @@ std::optional<Layout> layoutOf(const std::vector<std::string> &names, std::strin
         }
     }
     if (!layout.has(Column::kBasalArea) && !layout.has(Column::kDbh)) {
-        problem = "the input has neither a column \"basal_area\" nor \"dbh\"";
+        problem = R"(the input has neither a column "basal_area" nor "dbh")";
         return std::nullopt;
     }
     return layout;

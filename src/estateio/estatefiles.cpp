@@ -10,6 +10,7 @@ namespace {
 
 std::vector<std::string> names(const std::vector<estate::ResultColumn> &columns) {
     std::vector<std::string> out;
+    out.reserve(columns.size());
     for (const estate::ResultColumn &c : columns) {
         out.push_back(c.name);
     }
