@@ -1,6 +1,8 @@
 // The work of one estate row (read, check, grow a thinned rotation to its
 // final cut at 50, value it, write its results line) and the same rows
 // through the estate's thread pool: the estate's speed without the files.
+#include "plantingeconomics.hpp"
+
 #include "estate/estaterun.hpp"
 #include "estate/resulttable.hpp"
 #include "estate/rowevaluator.hpp"
@@ -32,11 +34,7 @@ std::vector<estate::RowValues> rows() {
 
 estate::EstateDefaults defaults() {
     estate::EstateDefaults d;
-    d.economics = {
-        3.0,
-        1500.0,
-        20.0,
-        {3.85, 7.9, 11.75, 15.3, 18.6, 22.95, 27.1, 30.4, 33.85, 37.2, 40.35, 43.5, 47.05}};
+    d.economics = plantingEconomics();
     d.year = 2026;
     return d;
 }
