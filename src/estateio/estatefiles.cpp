@@ -94,19 +94,23 @@ estate::RunSummary runEstateFiles(const EstateJob &job, const EstateCallbacks &c
     if (made) {
         throw GdalError("cannot create the folder \"" + job.outFolder + "\": " + made.message());
     }
-    FileSink sink(*layout, job.outFolder, reader, callbacks);
-    const long long inputRows = reader.rowCount();
-    estate::EstateProgress progress;
-    if (callbacks.progress) {
-        progress = [&](long long done) {
-            return callbacks.progress(done, inputRows);
-        };
+    try {
+        FileSink sink(*layout, job.outFolder, reader, callbacks);
+        estate::EstateProgress progress;
+        if (callbacks.progress) {
+            // Counting the rows costs a pass over the input: only for a progress line.
+            progress = [&callbacks, inputRows = reader.rowCount()](long long done) {
+                return callbacks.progress(done, inputRows);
+            };
+        }
+        estate::RunSummary summary =
+            estate::runEstate(reader, sink, *layout, job.defaults, job.settings, progress);
+        sink.close();
+        writeForecast(job.outFolder + "/" + kForecastFile, summary.forecast, job.defaults.year);
+        return summary;
+    } catch (const estate::CsvFileError &error) {
+        throw GdalError(error.what());
     }
-    estate::RunSummary summary =
-        estate::runEstate(reader, sink, *layout, job.defaults, job.settings, progress);
-    sink.close();
-    writeForecast(job.outFolder + "/" + kForecastFile, summary.forecast, job.defaults.year);
-    return summary;
 }
 
 } // namespace arbolex::estateio

@@ -68,13 +68,16 @@ LayerReader::LayerReader(const std::string &path, const std::string &layerName, 
     }
     const char *driver = GDALGetDriverShortName(GDALGetDatasetDriver(m_dataset));
     m_isTable = std::string(driver) == "CSV";
-    m_rowCount = OGR_L_GetFeatureCount(m_layer, FALSE);
 }
 
 LayerReader::~LayerReader() {
     if (m_dataset != nullptr) {
         GDALClose(m_dataset);
     }
+}
+
+long long LayerReader::rowCount() const {
+    return OGR_L_GetFeatureCount(m_layer, FALSE);
 }
 
 void *LayerReader::spatialReference() const {

@@ -32,8 +32,9 @@ public:
     const std::vector<std::string> &columnNames() const { return m_names; }
     /// True for a table without geometry (a CSV file).
     bool isTable() const { return m_isTable; }
-    /// Rows of the layer when known without reading them all, else -1.
-    long long rowCount() const { return m_rowCount; }
+    /// Rows of the layer, or -1 when the driver cannot tell quickly (a CSV
+    /// file is scanned once, without reading its fields).
+    long long rowCount() const;
     /// Spatial reference of the layer (may be null), for a writer.
     void *spatialReference() const;
     /// Geometry type of the layer (OGRwkbGeometryType), for a writer.
@@ -47,7 +48,6 @@ private:
     std::vector<std::string> m_names;
     bool m_isTable = false;
     bool m_keepGeometry = false;
-    long long m_rowCount = -1;
     long long m_read = 0;
 };
 
