@@ -1,5 +1,6 @@
 #include "estate/rowevaluator.hpp"
 
+#include "engine/catalogue.hpp"
 #include "rotation/standchecks.hpp"
 
 #include <cmath>
@@ -52,6 +53,10 @@ RowResult RowEvaluator::evaluate(const RowValues &values) {
     if (auto *fault = std::get_if<std::string>(&planned)) {
         result.status = RowStatus::kRefused;
         result.message = std::move(*fault);
+        // A row refused for another value still names its model.
+        if (const auto model = modelOf(m_layout, values)) {
+            result.modelLabel = engine::catalogue()[static_cast<std::size_t>(*model)].label;
+        }
         return result;
     }
     const RowPlan &plan = std::get<RowPlan>(planned);

@@ -135,16 +135,25 @@ std::optional<long long> wholeNumber(const std::string &text) {
     return static_cast<long long>(*x);
 }
 
+std::optional<std::int16_t> modelOf(const Layout &layout, const RowValues &values) {
+    const std::optional<long long> model =
+        wholeNumber(RowReader(layout, values).text(Column::kModel));
+    if (!model || *model < 0 || *model >= engine::kModelCount) {
+        return std::nullopt;
+    }
+    return static_cast<std::int16_t>(*model);
+}
+
 std::variant<RowPlan, std::string> planRow(const Layout &layout, const RowValues &values,
                                            const EstateDefaults &defaults) {
     const RowReader row(layout, values);
     RowPlan plan;
-    const std::optional<long long> model = wholeNumber(row.text(Column::kModel));
-    if (!model || *model < 0 || *model >= engine::kModelCount) {
+    const std::optional<std::int16_t> model = modelOf(layout, values);
+    if (!model) {
         return "the model \"" + row.text(Column::kModel) + "\" is not a model from 0 to " +
                std::to_string(engine::kModelCount - 1);
     }
-    plan.stand.model = static_cast<std::int16_t>(*model);
+    plan.stand.model = *model;
 
     // The grow-from form check, in the window's order and words.
     const std::optional<double> age = row.value(Column::kAge);
@@ -172,6 +181,9 @@ std::variant<RowPlan, std::string> planRow(const Layout &layout, const RowValues
         basalArea ? static_cast<float>(*basalArea)
                   : rotation::basalAreaFromDbh(plan.stand.stocking, static_cast<float>(*dbh));
 
+    if (row.empty(Column::kAreaHa)) {
+        return std::string("the area_ha has no value");
+    }
     const std::optional<double> area = row.value(Column::kAreaHa);
     if (!area || !(*area > 0.0)) {
         return "the area_ha \"" + row.text(Column::kAreaHa) + "\" is not an area above 0 ha";

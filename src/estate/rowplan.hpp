@@ -7,6 +7,7 @@
 #include "estate/layout.hpp"
 #include "rotation/rotation.hpp"
 
+#include <cstdint>
 #include <optional>
 #include <string>
 #include <variant>
@@ -41,6 +42,9 @@ using RowValues = std::vector<std::string>;
 /// fault. The stand's ranges are checked once its model is known (standFault).
 std::variant<RowPlan, std::string> planRow(const Layout &layout, const RowValues &values,
                                            const EstateDefaults &defaults);
+
+/// The row's model, 0 to 21, or std::nullopt when it has none of them.
+std::optional<std::int16_t> modelOf(const Layout &layout, const RowValues &values);
 
 /// A whole number from the text of a value (spaces around it allowed), or
 /// std::nullopt.

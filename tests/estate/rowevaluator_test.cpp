@@ -42,6 +42,9 @@ TEST_P(EstateBadRowTest, IsRefusedWithItsMessage) {
     EXPECT_EQ(r.status, GetParam().status);
     EXPECT_EQ(r.message.substr(0, GetParam().message.size()), GetParam().message);
     EXPECT_TRUE(r.harvests.empty());
+    // A readable model is named even on a refused row.
+    EXPECT_EQ(r.modelLabel.empty(),
+              GetParam().row[2] == "SS" || GetParam().row[2] == "22" || GetParam().row[2] == "2.5");
 }
 
 using namespace rotation::standtext;
@@ -73,6 +76,8 @@ INSTANTIATE_TEST_SUITE_P(
                text(kRangeBasalArea)},
         BadRow{"area not positive", with(sitkaRow(), "area_ha", "0"), kRefused,
                "the area_ha \"0\" is not an area above 0 ha"},
+        BadRow{"area missing", with(sitkaRow(), "area_ha", ""), kRefused,
+               "the area_ha has no value"},
         BadRow{"interval not whole", with(sitkaRow(), "thin_every", "five"), kRefused,
                "the thin_every \"five\" is not a whole number from 1 to 200"},
         BadRow{"un-thinned model with a regime", with(sitkaRow(), "model", "1"), kRefused,
