@@ -3,6 +3,7 @@
 // into its results line as the estate command does. Fields are split at
 // commas only: the fuzzer reaches the row reader, not a CSV parser.
 #include "estate/csvfile.hpp"
+#include "estate/forecast.hpp"
 #include "estate/resulttable.hpp"
 #include "estate/rowevaluator.hpp"
 
