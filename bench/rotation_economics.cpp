@@ -2,6 +2,7 @@
 // (target under 200 ms on one core) and 10,000 Monte Carlo draws of a
 // rotation's valuation (target under 100 ms).
 #include "engine_stands.hpp"
+#include "plantingeconomics.hpp"
 
 #include "rotation/optimiser.hpp"
 #include "rotation/uncertainty.hpp"
@@ -14,18 +15,10 @@ namespace {
 const rotation::Stand kStand{kTypicalStand.model, kTypicalStand.age, kTypicalStand.stocking,
                              kTypicalStand.height, kTypicalStand.basalArea};
 
-/// Long-term prices of the shipped list and the costs of a planting.
-rotation::Economics economics() {
-    return {3.0,
-            1500.0,
-            20.0,
-            {3.85, 7.9, 11.75, 15.3, 18.6, 22.95, 27.1, 30.4, 33.85, 37.2, 40.35, 43.5, 47.05}};
-}
-
 // The default search of the optimiser: the coarse grid, then its refinement.
 void BM_OptimiseOneStand(benchmark::State &state) {
     engine::Grow grow;
-    const rotation::Economics e = economics();
+    const rotation::Economics e = plantingEconomics();
     const rotation::OptimiserSettings settings;
     int grown = 0;
     for (auto _ : state) {
@@ -44,7 +37,7 @@ void BM_MonteCarlo10000(benchmark::State &state) {
     rotation::GrowthFailure failure;
     const rotation::GrowthPath path =
         *rotation::growPath(grow, kStand, {20, 5, 40.0f, 35}, failure);
-    const rotation::Economics e = economics();
+    const rotation::Economics e = plantingEconomics();
     rotation::MonteCarloSettings settings;
     settings.draws = 10000;
     settings.costSpread = 0.1;

@@ -55,3 +55,10 @@ if [[ -n "$step" && -n "$baseline" ]]; then
         printf "projection step %.1f ns, its pow/exp/log calls alone %.1f ns (medians of 9): ratio %.2f (target <= 1.50)\n",
                s, b, s / b }'
 fi
+
+# The estate command over a synthetic estate of a million sub-compartments
+# (ESTATE_ROWS to change it, 0 to leave it out).
+if [[ "${ESTATE_ROWS:-1000000}" != 0 && -x "$bin_dir/arbolex-cli" ]]; then
+    echo
+    "$(dirname "$0")/bench-estate.sh" "$bin_dir" "${ESTATE_ROWS:-1000000}"
+fi

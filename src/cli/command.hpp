@@ -50,5 +50,6 @@ Command assortCommand();
 Command rotationCommand();
 Command optimiseCommand();
 Command uncertaintyCommand();
+Command estateCommand();
 
 } // namespace arbolex::cli

@@ -20,7 +20,8 @@ const std::vector<Command> &commands() {
         arbolex::cli::projectCommand(),     arbolex::cli::thinCommand(),
         arbolex::cli::growCommand(),        arbolex::cli::assortCommand(),
         arbolex::cli::rotationCommand(),    arbolex::cli::optimiseCommand(),
-        arbolex::cli::uncertaintyCommand(), arbolex::cli::runCommand(),
+        arbolex::cli::uncertaintyCommand(), arbolex::cli::estateCommand(),
+        arbolex::cli::runCommand(),
     };
     return table;
 }

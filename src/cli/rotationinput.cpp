@@ -159,13 +159,13 @@ GrownRotation growRotation(engine::Grow &grow, const RotationInput &input, const
         refuse(failure.text);
         return {std::nullopt, 0, failure.badInput ? kExitBadArguments : kExitEngineFailure};
     }
-    const int age = input.rotation.value_or(
-        rotation::exploreRotations(*path, input.regime, input.economics).economicRotation);
-    if (const auto problem = rotation::rotationProblem(*path, input.regime, age)) {
-        refuse(*problem);
+    const rotation::RotationChoice choice =
+        rotation::chooseRotation(*path, input.regime, input.economics, input.rotation);
+    if (choice.problem) {
+        refuse(*choice.problem);
         return {std::nullopt, 0, kExitBadArguments};
     }
-    return {std::move(path), age, kExitSuccess};
+    return {std::move(path), choice.age, kExitSuccess};
 }
 
 QJsonValue moneyJson(const std::optional<double> &euro) {

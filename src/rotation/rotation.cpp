@@ -187,7 +187,8 @@ std::optional<std::string> rotationProblem(const GrowthPath &path, const Regime 
 }
 
 std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const Regime &regime,
-                                   GrowthFailure &failure, const ThinningLimits *limits) {
+                                   GrowthFailure &failure, const ThinningLimits *limits,
+                                   std::optional<int> finalCut) {
     const unsigned faultsBefore = grow.faultCount();
     auto engineFailed = [&](std::string text) {
         failure = {false, std::move(text)};
@@ -228,7 +229,8 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
     path.years.push_back(
         {age, basalArea, stocking, height, grow.GetV7(basalArea, stocking, height)});
 
-    const std::optional<int> lastThinning = lastThinningAge(regime, path.ageLimit);
+    const int growTo = finalCut ? std::min(*finalCut, path.ageLimit) : path.ageLimit;
+    const std::optional<int> lastThinning = lastThinningAge(regime, growTo);
     int nextThinning = regime.thinFrom;
     // Where growth goes on from: the last state recorded, or the stand just
     // thinned (the record of a thinning age keeps the crop before it).
@@ -236,7 +238,7 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
     std::vector<engine::StandState> states;
     while (true) {
         const bool thinning = lastThinning && nextThinning <= *lastThinning;
-        const int stop = thinning ? nextThinning : path.ageLimit;
+        const int stop = thinning ? nextThinning : growTo;
         if (stop > static_cast<int>(current.age)) {
             states.clear();
             if (!grow.PROJ(current.age, current.basalArea, current.stocking, current.topHeight,
@@ -290,7 +292,8 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
     return path;
 }
 
-RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics) {
+RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics,
+                            Appraisal appraisal) {
     RotationValue v;
     v.rotation = rotation;
     std::vector<Harvest> all = harvests(path, rotation, economics, v.finalCut);
@@ -305,6 +308,7 @@ RotationValue valueRotation(const GrowthPath &path, int rotation, const Economic
     for (int a = path.presentAge; a <= rotation; ++a) {
         mai.push_back(meanAnnualIncrement(path, a));
     }
+    v.maxMai = mai.empty() ? 0.0 : *std::max_element(mai.begin(), mai.end());
     v.yieldClass = yieldClass(mai);
     const Figures fig = figures(f, path.presentAge, economics.ratePercent);
     v.npv = fig.npv;
@@ -312,6 +316,9 @@ RotationValue valueRotation(const GrowthPath &path, int rotation, const Economic
     v.forestValue = fig.forestValue;
     if (v.lev) {
         v.eaa = valuation::equivalentAnnualAnnuity(*v.lev, economics.ratePercent);
+    }
+    if (appraisal == Appraisal::kWithoutRates) {
+        return v;
     }
     v.irr = valuation::internalRateOfReturn(f.net);
     v.breakEvenPriceFactor =
@@ -349,6 +356,14 @@ RotationExplorer exploreRotations(const GrowthPath &path, const Regime &regime,
         e.rows.push_back(row);
     }
     return e;
+}
+
+RotationChoice chooseRotation(const GrowthPath &path, const Regime &regime,
+                              const Economics &economics, std::optional<int> rotation) {
+    RotationChoice choice;
+    choice.age = rotation ? *rotation : exploreRotations(path, regime, economics).economicRotation;
+    choice.problem = rotationProblem(path, regime, choice.age);
+    return choice;
 }
 
 Candidate scoreRotation(const GrowthPath &path, const Regime &regime, int rotation,

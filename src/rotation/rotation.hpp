@@ -136,10 +136,14 @@ struct ThinningLimits {
 /// thinning window's volume method: the residual volume is the standing
 /// volume less `thinVolume`, and NEWTON gives the residual basal area and
 /// stocking. With `limits`, the path ends at the first thinning they do not
-/// allow (its crop recorded, the thinning not made). Returns std::nullopt and
-/// fills `failure` when it cannot.
+/// allow (its crop recorded, the thinning not made). With `finalCut`, the
+/// path ends at that age (the age limit still bounds it): enough for the one
+/// rotation felled there, and no thinning after it can stop the path; the
+/// explorer needs a path grown to the limit. Returns std::nullopt and fills
+/// `failure` when it cannot.
 std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const Regime &regime,
-                                   GrowthFailure &failure, const ThinningLimits *limits = nullptr);
+                                   GrowthFailure &failure, const ThinningLimits *limits = nullptr,
+                                   std::optional<int> finalCut = std::nullopt);
 
 /// One year of the cash flow of a rotation from bare land, euro/ha.
 struct CashFlowYear {
@@ -162,6 +166,9 @@ struct RotationValue {
     /// Mean annual increment at the final cut, m³/ha/year: standing volume and
     /// the thinnings over the age.
     double mai = 0.0;
+    /// Largest mean annual increment from the present age to the rotation,
+    /// m³/ha/year.
+    double maxMai = 0.0;
     /// Yield class: the culminated maximum of the MAI from the present age to
     /// the rotation, made even (0 when it has not culminated).
     int yieldClass = 0;
@@ -179,9 +186,19 @@ struct RotationValue {
     std::optional<double> breakEvenPriceFactor;
 };
 
+/// How much of a rotation's value to compute.
+enum class Appraisal {
+    /// Every figure.
+    kFull,
+    /// Without the internal rate of return and the break-even price factor,
+    /// whose searches cost more than the rest of the valuation together.
+    kWithoutRates,
+};
+
 /// Values the rotation that ends with the final cut at `rotation` (checked
 /// with rotationProblem beforehand).
-RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics);
+RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics,
+                            Appraisal appraisal = Appraisal::kFull);
 
 /// One final-cut age of the rotation explorer.
 struct RotationRow {
@@ -210,5 +227,15 @@ int firstRotation(const GrowthPath &path, const Regime &regime);
 
 RotationExplorer exploreRotations(const GrowthPath &path, const Regime &regime,
                                   const Economics &economics);
+
+/// The final-cut age of a rotation: `rotation` when given, else the economic
+/// rotation of the explorer.
+struct RotationChoice {
+    int age = 0;
+    /// What is wrong with that age (rotationProblem), when anything is.
+    std::optional<std::string> problem;
+};
+RotationChoice chooseRotation(const GrowthPath &path, const Regime &regime,
+                              const Economics &economics, std::optional<int> rotation);
 
 } // namespace arbolex::rotation

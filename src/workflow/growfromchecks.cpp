@@ -1,6 +1,7 @@
 // The grow-from fields: the key filter, the lost-focus handlers that show the
 // site index, the form and range checks, and reading and writing the values.
 #include "rotation/rotation.hpp"
+#include "rotation/standchecks.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
@@ -16,8 +17,7 @@ using shell::isNumeric;
 using shell::val;
 
 namespace {
-/// Tallest top height the height field accepts, m.
-constexpr float kHeightFieldLimit = 49.0f;
+using rotation::kHeightFieldLimit;
 
 float valF(const QString &text) {
     return static_cast<float>(val(text));
@@ -134,15 +134,15 @@ bool MainWindowLogic::ChkGrowFromBnds() {
     const int maxTarget = maxTargetAge();
 
     const float age = valF(field(MainControl::txtFromA));
-    if (age < 10.0f || age > 60.0f) {
+    if (age < rotation::kMinAge || age > rotation::kMaxAge) {
         return refuse(title, text::rangeAge(), style, MainControl::txtFromA);
     }
     const float stocking = valF(field(MainControl::txtFromN));
-    if (stocking < 100.0f || stocking > 5000.0f) {
+    if (stocking < rotation::kMinStocking || stocking > rotation::kMaxStocking) {
         return refuse(title, text::rangeStocking(), style, MainControl::txtFromN);
     }
     const float height = valF(field(MainControl::txtFromH));
-    if (height < 5.0f || height > hMax) {
+    if (height < rotation::kMinHeight || height > hMax) {
         return refuse(title,
                       text::rangeHeightLead() + formatNumber(hMax, u"##0.00") + QLatin1Char(']'),
                       style, MainControl::txtFromH);
@@ -151,7 +151,7 @@ bool MainWindowLogic::ChkGrowFromBnds() {
         return refuse(title, text::incompatibleBasalAreaDbh(), style, MainControl::txtFromD);
     }
     const float basalArea = valF(field(MainControl::txtFromB));
-    if (basalArea < 10.0f || basalArea > 100.0f) {
+    if (basalArea < rotation::kMinBasalArea || basalArea > rotation::kMaxBasalArea) {
         return refuse(title, text::rangeBasalArea(), style, MainControl::txtFromB);
     }
     const float target = valF(field(MainControl::txtToA));

@@ -2,9 +2,16 @@
 
 // Every text the main window shows, in one place: a changed caption is one edit.
 
+#include "rotation/standchecks.hpp"
+
 #include <QString>
 
 namespace arbolex::workflow::text {
+
+/// A grow-from text the estate reader shares.
+inline QString stand(std::string_view text) {
+    return QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size()));
+}
 
 // Titles
 inline QString titleArbolex() {
@@ -23,17 +30,16 @@ inline QString captionModelInUse() {
 
 // Form check of the grow-from fields
 inline QString faultFromAge() {
-    return QStringLiteral("FAULT - Grow From AGE has not been specified correctly.");
+    return stand(rotation::standtext::kFaultFromAge);
 }
 inline QString faultFromStocking() {
-    return QStringLiteral("FAULT - Grow From STOCKING has not been specified correctly.");
+    return stand(rotation::standtext::kFaultFromStocking);
 }
 inline QString faultFromHeight() {
-    return QStringLiteral("FAULT - Grow From TOP HEIGHT has not been specified correctly.");
+    return stand(rotation::standtext::kFaultFromHeight);
 }
 inline QString faultFromBasalAreaOrDbh() {
-    return QStringLiteral(
-        "FAULT - Grow From BASAL AREA or Mean DBH has not been specified correctly.");
+    return stand(rotation::standtext::kFaultFromBasalAreaOrDbh);
 }
 inline QString faultToAge() {
     return QStringLiteral("FAULT - Grow To AGE has not been specified correctly.");
@@ -44,25 +50,25 @@ inline QString faultByStep() {
 
 // Range check
 inline QString rangeAge() {
-    return QStringLiteral("FAULT - Grow From AGE not in acceptable range [10, 60]");
+    return stand(rotation::standtext::kRangeAge);
 }
 inline QString rangeStocking() {
-    return QStringLiteral("FAULT - Grow From STOCKING not in acceptable range [100, 5000]");
+    return stand(rotation::standtext::kRangeStocking);
 }
 inline QString rangeHeightLead() {
-    return QStringLiteral("FAULT - Grow From TOP HEIGHT not in acceptable range [5,");
+    return stand(rotation::standtext::kRangeHeightLead);
 }
 inline QString incompatibleBasalAreaDbh() {
     return QStringLiteral("FAULT - Grow From BASAL AREA & DIAMETER fields are incompatible.");
 }
 inline QString rangeBasalArea() {
-    return QStringLiteral("FAULT - Grow From BASAL AREA not in acceptable range [10, 100]");
+    return stand(rotation::standtext::kRangeBasalArea);
 }
 inline QString rangeToAgeLead() {
     return QStringLiteral("FAULT - Grow To AGE not in acceptable range [10,");
 }
 inline QString maximumHeight() {
-    return QStringLiteral("Maximum height alowed is 49");
+    return stand(rotation::standtext::kMaximumHeight);
 }
 
 // Grow command

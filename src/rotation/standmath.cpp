@@ -1,8 +1,8 @@
-#include "workflow/standmath.hpp"
+#include "rotation/standmath.hpp"
 
 #include <cmath>
 
-namespace arbolex::workflow {
+namespace arbolex::rotation {
 
 float dbhFromBasalArea(float &basalArea, float &stocking) {
     if (stocking <= 0.0f) {
@@ -22,4 +22,4 @@ float truncateToTenth(float value) {
     return static_cast<float>(std::trunc(10.0 * double{value}) / 10.0);
 }
 
-} // namespace arbolex::workflow
+} // namespace arbolex::rotation

@@ -1,0 +1,116 @@
+#include "estate/resulttable.hpp"
+
+#include "valuation/discounting.hpp"
+
+#include <cstdio>
+
+namespace arbolex::estate {
+
+namespace {
+
+/// A single-precision figure as every table prints it ("%.9g").
+std::string quantity(double x) {
+    char text[32];
+    std::snprintf(text, sizeof text, "%.9g", x);
+    return text;
+}
+
+/// A volume or an amount to a given number of decimals.
+std::string fixed(double x, int decimals) {
+    char text[64];
+    std::snprintf(text, sizeof text, "%.*f", decimals, x);
+    return text;
+}
+
+std::string money(const std::optional<double> &euro) {
+    return euro ? fixed(valuation::roundToCents(*euro), 2) : std::string();
+}
+
+std::string moneyForArea(const std::optional<double> &euroPerHa, double areaHa) {
+    return euroPerHa ? fixed(valuation::roundToCents(*euroPerHa * areaHa), 2) : std::string();
+}
+
+} // namespace
+
+const std::vector<ResultColumn> &figureColumns() {
+    using enum ColumnType;
+    static const std::vector<ResultColumn> columns = {{"model_label", kText},
+                                                      {"site_index", kReal},
+                                                      {"yield_class", kInteger},
+                                                      {"thinnings", kInteger},
+                                                      {"thinning_volume_ha", kReal},
+                                                      {"thinning_volume", kReal},
+                                                      {"final_cut_age", kInteger},
+                                                      {"final_cut_year", kInteger},
+                                                      {"final_cut_volume_ha", kReal},
+                                                      {"final_cut_volume", kReal},
+                                                      {"max_mai", kReal},
+                                                      {"npv_ha", kReal},
+                                                      {"npv", kReal},
+                                                      {"lev_ha", kReal},
+                                                      {"lev", kReal},
+                                                      {"forest_value_ha", kReal},
+                                                      {"forest_value", kReal},
+                                                      {"status", kText}};
+    return columns;
+}
+
+void figureValues(const RowResult &row, std::vector<std::string> &values) {
+    values.push_back(row.modelLabel);
+    if (row.status != RowStatus::kOk) {
+        values.insert(values.end(), figureColumns().size() - 2, std::string());
+        values.emplace_back(statusWord(row.status));
+        return;
+    }
+    const double area = row.areaHa;
+    values.push_back(quantity(row.siteIndex));
+    values.push_back(std::to_string(row.yieldClass));
+    values.push_back(std::to_string(row.thinningCount));
+    values.push_back(fixed(row.thinningVolume, 3));
+    values.push_back(fixed(row.thinningVolume * area, 3));
+    values.push_back(std::to_string(row.finalCutAge));
+    values.push_back(std::to_string(row.finalCutYear));
+    values.push_back(quantity(row.finalCutVolume));
+    values.push_back(fixed(double{row.finalCutVolume} * area, 3));
+    values.push_back(quantity(row.maxMai));
+    values.push_back(money(row.npv));
+    values.push_back(moneyForArea(row.npv, area));
+    values.push_back(money(row.lev));
+    values.push_back(moneyForArea(row.lev, area));
+    values.push_back(money(row.forestValue));
+    values.push_back(moneyForArea(row.forestValue, area));
+    values.emplace_back(statusWord(row.status));
+}
+
+std::vector<ResultColumn> resultColumns(const Layout &layout) {
+    std::vector<ResultColumn> columns = {{"line", ColumnType::kInteger}, {"id", ColumnType::kText}};
+    for (const std::string &name : layout.carriedNames) {
+        columns.push_back({name, ColumnType::kText});
+    }
+    columns.insert(columns.end(), figureColumns().begin(), figureColumns().end());
+    return columns;
+}
+
+const std::string &rowId(const Layout &layout, const RowValues &input) {
+    static const std::string kNone;
+    const auto i = static_cast<std::size_t>(layout.at(Column::kId));
+    return i < input.size() ? input[i] : kNone;
+}
+
+void resultValues(const Layout &layout, long long line, const RowValues &input,
+                  const RowResult &row, std::vector<std::string> &values) {
+    values.clear();
+    values.push_back(std::to_string(line));
+    values.push_back(rowId(layout, input));
+    for (const int i : layout.carried) {
+        const auto at = static_cast<std::size_t>(i);
+        values.push_back(at < input.size() ? input[at] : std::string());
+    }
+    figureValues(row, values);
+}
+
+std::vector<std::string> errorColumns() {
+    return {"line", "id", "message"};
+}
+
+} // namespace arbolex::estate

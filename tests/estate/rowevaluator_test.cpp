@@ -1,0 +1,193 @@
+// One row of an estate: refused with the main window's message, or grown and
+// valued exactly as the rotation library values the same stand and regime.
+#include "estate/rowevaluator.hpp"
+
+#include "estatefixture.hpp"
+#include "rotation/standchecks.hpp"
+#include "rotation/standmath.hpp"
+
+#include <gtest/gtest.h>
+
+#include <cctype>
+#include <cmath>
+
+namespace arbolex::estate {
+namespace {
+
+using testing::sitkaRow;
+using testing::with;
+
+struct BadRow {
+    const char *what;
+    RowValues row;
+    RowStatus status;
+    std::string message;
+};
+
+void PrintTo(const BadRow &r, std::ostream *os) {
+    *os << r.what;
+}
+
+std::string text(std::string_view s) {
+    return std::string(s);
+}
+
+class EstateBadRowTest : public ::testing::TestWithParam<BadRow> {};
+
+TEST_P(EstateBadRowTest, IsRefusedWithItsMessage) {
+    const Layout layout = testing::testLayout();
+    const EstateDefaults defaults = testing::testDefaults();
+    RowEvaluator evaluator(layout, defaults);
+    const RowResult r = evaluator.evaluate(GetParam().row);
+    EXPECT_EQ(r.status, GetParam().status);
+    EXPECT_EQ(r.message.substr(0, GetParam().message.size()), GetParam().message);
+    EXPECT_TRUE(r.harvests.empty());
+    // A readable model is named even on a refused row.
+    EXPECT_EQ(r.modelLabel.empty(),
+              GetParam().row[2] == "SS" || GetParam().row[2] == "22" || GetParam().row[2] == "2.5");
+}
+
+using namespace rotation::standtext;
+constexpr RowStatus kRefused = RowStatus::kRefused;
+
+INSTANTIATE_TEST_SUITE_P(
+    Rows, EstateBadRowTest,
+    ::testing::Values(
+        BadRow{"model not a number", with(sitkaRow(), "model", "SS"), kRefused,
+               "the model \"SS\" is not a model from 0 to 21"},
+        BadRow{"model outside", with(sitkaRow(), "model", "22"), kRefused,
+               "the model \"22\" is not a model from 0 to 21"},
+        BadRow{"model not whole", with(sitkaRow(), "model", "2.5"), kRefused, "the model"},
+        BadRow{"age missing", with(sitkaRow(), "age", ""), kRefused, text(kFaultFromAge)},
+        BadRow{"stocking unparsable", with(sitkaRow(), "stocking", "25OO"), kRefused,
+               text(kFaultFromStocking)},
+        BadRow{"height missing", with(sitkaRow(), "top_height", " "), kRefused,
+               text(kFaultFromHeight)},
+        BadRow{"neither basal area nor dbh", with(sitkaRow(), "basal_area", "n/a"), kRefused,
+               text(kFaultFromBasalAreaOrDbh)},
+        BadRow{"age below range", with(sitkaRow(), "age", "9.9"), kRefused, text(kRangeAge)},
+        BadRow{"stocking above range", with(sitkaRow(), "stocking", "5001"), kRefused,
+               text(kRangeStocking)},
+        BadRow{"height over the field's limit", with(sitkaRow(), "top_height", "49.5"), kRefused,
+               text(kMaximumHeight)},
+        BadRow{"height below range", with(sitkaRow(), "top_height", "4.9"), kRefused,
+               text(kRangeHeightLead)},
+        BadRow{"basal area above range", with(sitkaRow(), "basal_area", "100.5"), kRefused,
+               text(kRangeBasalArea)},
+        BadRow{"area not positive", with(sitkaRow(), "area_ha", "0"), kRefused,
+               "the area_ha \"0\" is not an area above 0 ha"},
+        BadRow{"area missing", with(sitkaRow(), "area_ha", ""), kRefused,
+               "the area_ha has no value"},
+        BadRow{"interval not whole", with(sitkaRow(), "thin_every", "five"), kRefused,
+               "the thin_every \"five\" is not a whole number from 1 to 200"},
+        BadRow{"un-thinned model with a regime", with(sitkaRow(), "model", "1"), kRefused,
+               "model 1 (SS - (Un-thinned)) has no thinning response"},
+        BadRow{"thinning more than stands", with(sitkaRow(), "thin_volume", "900"), kRefused,
+               "the thinning at age 20 removes 900.00 m3/ha"},
+        BadRow{"first thinning before the present", with(sitkaRow(), "thin_from", "12"), kRefused,
+               "the first thinning (age 12) is before the present age 15"},
+        BadRow{"rotation past the age limit", with(sitkaRow(), "rotation", "61"), kRefused,
+               "the rotation (age 61) is past the model's age limit 60"},
+        BadRow{"rotation before the last thinning",
+               with(with(sitkaRow(), "thin_until", "40"), "rotation", "35"), kRefused,
+               "the regime thins at age 40, not before the final cut at age 35"}),
+    [](const ::testing::TestParamInfo<BadRow> &param) {
+        std::string name = param.param.what;
+        for (char &c : name) {
+            c = std::isalnum(static_cast<unsigned char>(c)) != 0 ? c : '_';
+        }
+        return name;
+    });
+
+class EstateRowTest : public ::testing::Test {
+protected:
+    Layout m_layout = testing::testLayout();
+    EstateDefaults m_defaults = testing::testDefaults();
+};
+
+TEST_F(EstateRowTest, GrowsAndValuesTheStandAsTheRotationLibraryDoes) {
+    RowEvaluator evaluator(m_layout, m_defaults);
+    const RowResult r = evaluator.evaluate(with(sitkaRow(), "rotation", "48"));
+    ASSERT_EQ(r.status, RowStatus::kOk) << r.message;
+
+    engine::Grow grow;
+    rotation::GrowthFailure failure;
+    const rotation::Stand stand{0, 15.0f, 2500.0f, 7.0f, 20.0f};
+    const auto path = rotation::growPath(grow, stand, m_defaults.regime, failure);
+    ASSERT_TRUE(path.has_value());
+    const rotation::RotationValue v = rotation::valueRotation(*path, 48, m_defaults.economics);
+    EXPECT_EQ(r.modelLabel, "SS - (Thinned)");
+    EXPECT_EQ(r.species, "SS");
+    EXPECT_EQ(r.siteIndex, path->siteIndex);
+    EXPECT_EQ(r.finalCutAge, 48);
+    EXPECT_EQ(r.finalCutYear, 2026 + 48 - path->presentAge);
+    EXPECT_EQ(r.finalCutVolume, v.finalCut.volume);
+    EXPECT_EQ(r.thinningCount, 6); // ages 20, 25, ..., 45
+    EXPECT_EQ(r.thinningCount, static_cast<int>(v.thinnings.size()));
+    EXPECT_EQ(r.yieldClass, v.yieldClass);
+    EXPECT_EQ(r.npv, v.npv);
+    EXPECT_EQ(r.lev, v.lev);
+    EXPECT_EQ(r.forestValue, v.forestValue);
+    // One harvest per thinning and the final cut, for the 2.5 ha.
+    ASSERT_EQ(r.harvests.size(), 7U);
+    EXPECT_EQ(r.harvests.back().finalCutLitres, std::llround(double{v.finalCut.volume} * 2500.0));
+}
+
+TEST_F(EstateRowTest, DiameterStandsInForAMissingBasalAreaAndEmptyValuesTakeTheDefaults) {
+    RowEvaluator evaluator(m_layout, m_defaults);
+    const float dbh = 12.3f;
+    const RowValues byDbh = with(with(sitkaRow(), "basal_area", ""), "dbh", "12.3");
+    const RowValues byBasalArea =
+        with(sitkaRow(), "basal_area", std::to_string(rotation::basalAreaFromDbh(2500.0f, dbh)));
+    // The basal area wins over a diameter given beside it.
+    const RowValues both = with(byBasalArea, "dbh", "99");
+    const RowResult a = evaluator.evaluate(byDbh);
+    const RowResult b = evaluator.evaluate(byBasalArea);
+    const RowResult c = evaluator.evaluate(both);
+    ASSERT_EQ(a.status, RowStatus::kOk) << a.message;
+    EXPECT_NEAR(a.finalCutVolume, b.finalCutVolume, 1e-3f);
+    EXPECT_EQ(b.npv, c.npv);
+
+    // The regime written out in the row is the command line's.
+    const RowResult own = evaluator.evaluate(with(
+        with(with(with(sitkaRow(), "thin_from", "20"), "thin_every", "5"), "thin_volume", "40"),
+        "rotation", "50"));
+    m_defaults.rotation = 50;
+    const RowResult defaulted = evaluator.evaluate(sitkaRow());
+    EXPECT_EQ(own.npv, defaulted.npv);
+    EXPECT_EQ(own.thinningCount, defaulted.thinningCount);
+    // A first thinning at 0 leaves the stand unthinned.
+    EXPECT_EQ(evaluator.evaluate(with(sitkaRow(), "thin_from", "0")).thinningCount, 0);
+}
+
+TEST_F(EstateRowTest, AThinningTheRegimeWouldMakeAfterTheFinalCutDoesNotStopTheRow) {
+    RowEvaluator evaluator(m_layout, m_defaults);
+    // A Scots pine stand too poor for a 40 m3 thinning at 40: felled at 38,
+    // it never meets that thinning.
+    const RowValues poor =
+        with(with(with(with(sitkaRow(), "model", "8"), "age", "18"), "top_height", "7"), "rotation",
+             "38");
+    const RowResult felled = evaluator.evaluate(poor);
+    EXPECT_EQ(felled.status, RowStatus::kOk) << felled.message;
+    EXPECT_EQ(felled.thinningCount, 4);
+    const RowResult later = evaluator.evaluate(with(poor, "rotation", "45"));
+    EXPECT_EQ(later.status, RowStatus::kRefused);
+    EXPECT_EQ(later.message.substr(0, 34), "the thinning at age 40 removes 40.");
+}
+
+TEST_F(EstateRowTest, WithoutARotationAnywhereFellsAtTheEconomicRotation) {
+    RowEvaluator evaluator(m_layout, m_defaults);
+    const RowResult r = evaluator.evaluate(sitkaRow());
+    ASSERT_EQ(r.status, RowStatus::kOk) << r.message;
+    engine::Grow grow;
+    rotation::GrowthFailure failure;
+    const auto path =
+        rotation::growPath(grow, {0, 15.0f, 2500.0f, 7.0f, 20.0f}, m_defaults.regime, failure);
+    ASSERT_TRUE(path.has_value());
+    EXPECT_EQ(r.finalCutAge,
+              rotation::exploreRotations(*path, m_defaults.regime, m_defaults.economics)
+                  .economicRotation);
+}
+
+} // namespace
+} // namespace arbolex::estate
