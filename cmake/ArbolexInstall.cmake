@@ -3,6 +3,7 @@
 #
 #   bin/arbolex, bin/arbolex-cli
 #   share/arbolex/data/                                  the default data folder
+#   share/doc/arbolex/examples/                          the example estate
 #   share/applications/org.arbolex.Arbolex.desktop
 #   share/icons/hicolor/scalable/apps/org.arbolex.Arbolex.svg
 #   share/metainfo/org.arbolex.Arbolex.metainfo.xml
@@ -15,7 +16,10 @@ set(ARBOLEX_DIST ${CMAKE_SOURCE_DIR}/dist)
 
 if(TARGET arbolex-cli)
     install(TARGETS arbolex-cli RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
-    install(DIRECTORY ${CMAKE_SOURCE_DIR}/data/ DESTINATION ${CMAKE_INSTALL_DATADIR}/arbolex/data)
+    # The examples are the user's to copy, not defaults the program fills in.
+    install(DIRECTORY ${CMAKE_SOURCE_DIR}/data/ DESTINATION ${CMAKE_INSTALL_DATADIR}/arbolex/data
+        PATTERN examples EXCLUDE)
+    install(DIRECTORY ${CMAKE_SOURCE_DIR}/data/examples/ DESTINATION ${CMAKE_INSTALL_DOCDIR}/examples)
 endif()
 
 if(TARGET arbolex)
