@@ -350,8 +350,7 @@ int main(int argc, char *argv[]) {
     // The sub-compartment as a document: the File menu, and the question
     // before the window closes on unsaved work.
     arbolex::ui::DocumentMenu documentMenu(window.fileMenu(), &window);
-    arbolex::document::DocumentController documents(logic, interactive, &settings,
-                                                    &documentMenu);
+    arbolex::document::DocumentController documents(logic, interactive, &settings, &documentMenu);
     documentMenu.attach(documents);
     window.setCloseCheck([&documents] { return documents.maySafelyDiscard(); });
     documents.start();
