@@ -191,12 +191,13 @@ bool demoAssort(MainWindowLogic &logic, ThinWindowLogic &thin,
 /// afterwards so the caption carries the unsaved mark:
 ///   open            the main window with that document;
 ///   identification  the same with the "Sub-compartment" dialog open;
-///   fault           a damaged file opened: its "FAULT - " message.
+///   fault           a damaged file opened: its "FAULT - " message;
+///   question        New pressed over the unsaved change: Save, Discard or Cancel.
 /// False for an unknown stage.
 bool demoDocument(MainWindowLogic &logic, ThinWindowLogic &thin,
                   arbolex::document::DocumentController &documents, const QString &stage) {
     if (stage != QLatin1String("open") && stage != QLatin1String("identification") &&
-        stage != QLatin1String("fault")) {
+        stage != QLatin1String("fault") && stage != QLatin1String("question")) {
         return false;
     }
     demoThin(logic, thin, QStringLiteral("loop"));
@@ -209,6 +210,8 @@ bool demoDocument(MainWindowLogic &logic, ThinWindowLogic &thin,
     documents.refreshCaption();
     if (stage == QLatin1String("identification")) {
         documents.editIdentification();
+    } else if (stage == QLatin1String("question")) {
+        documents.fileNew();
     } else if (stage == QLatin1String("fault")) {
         const QString damaged = temp.filePath(QStringLiteral("Kilbrack 12c.arbolex"));
         QFile file(damaged);
@@ -356,8 +359,7 @@ int main(int argc, char *argv[]) {
     // The sub-compartment as a document: the File menu, and the question
     // before the window closes on unsaved work.
     arbolex::ui::DocumentMenu documentMenu(window.fileMenu(), &window);
-    arbolex::document::DocumentController documents(logic, interactive, &settings,
-                                                    &documentMenu);
+    arbolex::document::DocumentController documents(logic, interactive, &settings, &documentMenu);
     documentMenu.attach(documents);
     window.setCloseCheck([&documents] { return documents.maySafelyDiscard(); });
     documents.start();

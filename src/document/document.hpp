@@ -67,7 +67,7 @@ inline constexpr const char *kLayoutWithoutMoney = "withoutMoney";
 
 /// Fields of a row record in the file, in the order of workflow::RowRecord.
 inline constexpr const char *kRecordFields[] = {
-    "age",    "topHeight", "basalArea",        "stocking",        "volume",
-    "dbh",    "removedBasalArea", "removedStocking", "removedVolume", "postDbh"};
+    "age", "topHeight",        "basalArea",       "stocking",      "volume",
+    "dbh", "removedBasalArea", "removedStocking", "removedVolume", "postDbh"};
 
 } // namespace arbolex::document

@@ -171,8 +171,9 @@ bool DocumentController::saveAs() {
         const SubCompartment &id = m_main.identification();
         QString stem = QStringList{id.forest, id.compartment, id.subCompartment}.join(u' ');
         stem = stem.simplified();
-        suggested = QDir(lastFolder()).filePath((stem.isEmpty() ? text::untitled() : stem) +
-                                          QStringLiteral(".") + QLatin1String(kFileSuffix));
+        suggested = QDir(lastFolder())
+                        .filePath((stem.isEmpty() ? text::untitled() : stem) + QStringLiteral(".") +
+                                  QLatin1String(kFileSuffix));
     }
     QString chosen = m_dialogs->chooseFileToSave(suggested);
     if (chosen.isEmpty()) {

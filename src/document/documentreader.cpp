@@ -1,7 +1,7 @@
 #include "document/documentreader.hpp"
 
-#include "engine/catalogue.hpp"
 #include "economics/prices.hpp"
+#include "engine/catalogue.hpp"
 
 #include <QFile>
 #include <QFileInfo>
@@ -53,11 +53,11 @@ QString name(const char *key) {
 /// Reads the fields of one JSON object, naming the place of a fault ("row 3").
 class ObjectReader {
 public:
-    ObjectReader(const QJsonObject &object, QString place)
-        : m_object(object), m_place(std::move(place)) {}
+    ObjectReader(QJsonObject object, QString place)
+        : m_object(std::move(object)), m_place(std::move(place)) {}
 
     QJsonValue value(const char *key) const {
-        const QJsonValue v = m_object.value(name(key));
+        QJsonValue v = m_object.value(name(key));
         if (v.isUndefined()) {
             refuse(m_place + QStringLiteral(" has no \"") + name(key) + QStringLiteral("\""));
         }
@@ -113,9 +113,9 @@ public:
             wrong(key, QStringLiteral("is not a number"));
         }
         if (!anyValue && !(x >= low && x <= high)) {
-            wrong(key, QStringLiteral("is ") + QString::number(x) +
-                           QStringLiteral(", outside [") + QString::number(low) +
-                           QStringLiteral(", ") + QString::number(high) + u']');
+            wrong(key, QStringLiteral("is ") + QString::number(x) + QStringLiteral(", outside [") +
+                           QString::number(low) + QStringLiteral(", ") + QString::number(high) +
+                           u']');
         }
         return x;
     }
@@ -150,14 +150,13 @@ public:
         if (!v.isArray()) {
             wrong(key, QStringLiteral("is not a list"));
         }
-        const QJsonArray a = v.toArray();
+        QJsonArray a = v.toArray();
         if (a.size() < minSize || a.size() > maxSize) {
             wrong(key, minSize == maxSize
                            ? QStringLiteral("does not hold ") + QString::number(minSize) +
                                  QStringLiteral(" entries")
                            : QStringLiteral("holds ") + QString::number(a.size()) +
-                                 QStringLiteral(" entries, more than ") +
-                                 QString::number(maxSize));
+                                 QStringLiteral(" entries, more than ") + QString::number(maxSize));
         }
         return a;
     }
@@ -234,8 +233,8 @@ TableRow readRow(const QJsonValue &value, int index) {
     TableRow t;
     t.kind = readKind(r);
     t.label = r.string(key::label, kMaxLabelLength);
-    for (const QJsonValue cell : r.array(key::cells, workflow::kColumnCount,
-                                         workflow::kColumnCount)) {
+    for (const QJsonValue cell :
+         r.array(key::cells, workflow::kColumnCount, workflow::kColumnCount)) {
         if (!cell.isString() || cell.toString().size() > kMaxCellLength) {
             r.wrong(key::cells, QStringLiteral("holds a cell that is not a short text"));
         }
@@ -249,8 +248,7 @@ TableRow readRow(const QJsonValue &value, int index) {
                                      -kMaxVolume, kMaxVolume, any);
     }
     t.removedValue = r.number(key::removedValue, -kMaxPrice * kMaxVolume, kMaxPrice * kMaxVolume);
-    t.timberRevenue =
-        r.number(key::timberRevenue, -kMaxPrice * kMaxVolume, kMaxPrice * kMaxVolume);
+    t.timberRevenue = r.number(key::timberRevenue, -kMaxPrice * kMaxVolume, kMaxPrice * kMaxVolume);
     t.finalCut = r.boolean(key::finalCut);
     return t;
 }
@@ -300,8 +298,8 @@ void readCashFlow(const ObjectReader &top, Document &d) {
     }
     constexpr double kMoney = kMaxPrice * kMaxVolume;
     for (qsizetype i = 0; i < years.size(); ++i) {
-        const QString place = QStringLiteral("year ") + QString::number(i + 1) +
-                              QStringLiteral(" of the cash flow");
+        const QString place =
+            QStringLiteral("year ") + QString::number(i + 1) + QStringLiteral(" of the cash flow");
         if (!years.at(i).isObject()) {
             refuse(place + QStringLiteral(" is not a group of fields"));
         }
@@ -395,8 +393,7 @@ std::optional<Document> readDocumentFile(const QString &path, QString &reason) {
     QFile file(path);
     if (!QFileInfo(path).isFile() || !file.open(QIODevice::ReadOnly)) {
         reason = QStringLiteral("it cannot be read (") +
-                 (QFileInfo::exists(path) ? file.errorString()
-                                          : QStringLiteral("no such file")) +
+                 (QFileInfo::exists(path) ? file.errorString() : QStringLiteral("no such file")) +
                  u')';
         return std::nullopt;
     }

@@ -38,8 +38,8 @@ QJsonObject identificationJson(const SubCompartment &id) {
 
 QJsonObject rowJson(const TableRow &row) {
     const workflow::RowRecord &r = row.record;
-    const float values[] = {r.age, r.topHeight,        r.basalArea,       r.stocking,
-                            r.volume, r.dbh,           r.removedBasalArea, r.removedStocking,
+    const float values[] = {r.age,           r.topHeight, r.basalArea,        r.stocking,
+                            r.volume,        r.dbh,       r.removedBasalArea, r.removedStocking,
                             r.removedVolume, r.postDbh};
     QJsonObject record;
     for (std::size_t i = 0; i < std::size(values); ++i) {
@@ -64,9 +64,9 @@ QJsonObject tableJson(const Document &d) {
     for (const TableRow &row : d.rows) {
         rows.append(rowJson(row));
     }
-    return {{name(key::layout), name(d.layout == workflow::HeaderLayout::WithMoney
-                                         ? kLayoutWithMoney
-                                         : kLayoutWithoutMoney)},
+    return {{name(key::layout),
+             name(d.layout == workflow::HeaderLayout::WithMoney ? kLayoutWithMoney
+                                                                : kLayoutWithoutMoney)},
             {name(key::currentRow), d.currentRow},
             {name(key::selectionEnd), d.selectionEnd},
             {name(key::standingVolume), number(d.standingVolume)},
@@ -102,16 +102,15 @@ QByteArray documentToJson(const Document &d) {
     for (double p : d.pricesInUse) {
         prices.append(number(p));
     }
-    const QJsonObject body{
-        {name(key::subCompartment), identificationJson(d.identification)},
-        {name(key::model), d.modelId},
-        {name(key::fields), fields},
-        {name(key::siteIndex), number(d.siteIndex)},
-        {name(key::siteIndexText), d.siteIndexText},
-        {name(key::table), tableJson(d)},
-        {name(key::cashFlow), cashFlowJson(d)},
-        {name(key::prices),
-         QJsonObject{{name(key::setInUse), d.priceSetInUse}, {name(key::inUse), prices}}}};
+    const QJsonObject body{{name(key::subCompartment), identificationJson(d.identification)},
+                           {name(key::model), d.modelId},
+                           {name(key::fields), fields},
+                           {name(key::siteIndex), number(d.siteIndex)},
+                           {name(key::siteIndexText), d.siteIndexText},
+                           {name(key::table), tableJson(d)},
+                           {name(key::cashFlow), cashFlowJson(d)},
+                           {name(key::prices), QJsonObject{{name(key::setInUse), d.priceSetInUse},
+                                                           {name(key::inUse), prices}}}};
     // A JSON object keeps its keys in alphabetical order; the format and its
     // version go first by hand, so a reader (or a person) meets them first.
     const QByteArray rest = QJsonDocument(body).toJson(QJsonDocument::Indented);

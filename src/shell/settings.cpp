@@ -110,7 +110,7 @@ void writeRecentFiles(QSettings &settings, const QStringList &files) {
 
 QString readLastFolder(QSettings &settings) {
     settings.beginGroup(QLatin1String(kSettingsSection));
-    const QString folder = settings.value(QStringLiteral("LastFolder")).toString();
+    QString folder = settings.value(QStringLiteral("LastFolder")).toString();
     settings.endGroup();
     return folder;
 }

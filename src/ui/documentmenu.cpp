@@ -24,7 +24,7 @@ DocumentMenu::DocumentMenu(QMenu *menu, QWidget *window)
     : QObject(window), m_menu(menu), m_window(window) {
     m_menu->setObjectName(QStringLiteral("mnuFile"));
     const auto add = [this](const QString &caption, const char *name, auto handler,
-                            QKeySequence shortcut = {}) {
+                            const QKeySequence &shortcut = {}) {
         QAction *action = m_menu->addAction(caption);
         action->setObjectName(QLatin1String(name));
         action->setShortcut(shortcut);
@@ -36,16 +36,20 @@ DocumentMenu::DocumentMenu(QMenu *menu, QWidget *window)
         return action;
     };
     using document::DocumentController;
-    add(document::text::menuNew(), "mnuNew", [](DocumentController &c) { c.fileNew(); },
+    add(
+        document::text::menuNew(), "mnuNew", [](DocumentController &c) { c.fileNew(); },
         QKeySequence::New);
-    add(document::text::menuOpen(), "mnuOpen", [](DocumentController &c) { c.fileOpen(); },
+    add(
+        document::text::menuOpen(), "mnuOpen", [](DocumentController &c) { c.fileOpen(); },
         QKeySequence::Open);
     m_recent = m_menu->addMenu(document::text::menuRecent());
     m_recent->setObjectName(QStringLiteral("mnuRecent"));
     m_menu->addSeparator();
-    add(document::text::menuSave(), "mnuSave", [](DocumentController &c) { c.save(); },
+    add(
+        document::text::menuSave(), "mnuSave", [](DocumentController &c) { c.save(); },
         QKeySequence::Save);
-    add(document::text::menuSaveAs(), "mnuSaveAs", [](DocumentController &c) { c.saveAs(); },
+    add(
+        document::text::menuSaveAs(), "mnuSaveAs", [](DocumentController &c) { c.saveAs(); },
         QKeySequence(Qt::CTRL | Qt::SHIFT | Qt::Key_S));
     m_menu->addSeparator();
     add(document::text::menuIdentification(), "mnuIdentification",

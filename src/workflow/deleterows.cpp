@@ -82,10 +82,12 @@ void MainWindowLogic::CopyTable(bool summary) {
         // The sub-compartment's identification heads the copy, a blank line below it.
         const QStringList heading = m_identification.heading();
         if (!heading.isEmpty()) {
-            grid.insert(grid.begin(), QStringList{QString()});
-            for (auto line = heading.rbegin(); line != heading.rend(); ++line) {
-                grid.insert(grid.begin(), QStringList{*line});
+            std::vector<QStringList> top;
+            for (const QString &line : heading) {
+                top.push_back({line});
             }
+            top.push_back({QString()});
+            grid.insert(grid.begin(), top.begin(), top.end());
         }
         copied = m_clipboard->setTable(shell::tabSeparated(grid), shell::htmlTable(grid));
     });

@@ -16,11 +16,10 @@ namespace arbolex::workflow {
 bool MainSnapshot::sameWork(const MainSnapshot &other) const {
     return identification == other.identification && modelId == other.modelId &&
            fields == other.fields && siteIndexText == other.siteIndexText &&
-           layout == other.layout && rows == other.rows &&
-           standingVolume == other.standingVolume && felled == other.felled &&
-           cashFlowFirstYear == other.cashFlowFirstYear && cashFlow == other.cashFlow &&
-           interestRate == other.interestRate && priceSetInUse == other.priceSetInUse &&
-           pricesInUse == other.pricesInUse;
+           layout == other.layout && rows == other.rows && standingVolume == other.standingVolume &&
+           felled == other.felled && cashFlowFirstYear == other.cashFlowFirstYear &&
+           cashFlow == other.cashFlow && interestRate == other.interestRate &&
+           priceSetInUse == other.priceSetInUse && pricesInUse == other.pricesInUse;
 }
 
 MainSnapshot MainWindowLogic::snapshot() const {

@@ -136,8 +136,8 @@ void MainWindowLogic::mnuModel_Click(int index) {
 }
 
 void MainWindowLogic::updateCaption() {
-    QString caption = text::titleArbolex() + text::captionModelInUse() +
-                      QString::fromStdString(m_grow.label());
+    QString caption =
+        text::titleArbolex() + text::captionModelInUse() + QString::fromStdString(m_grow.label());
     if (!m_documentName.isEmpty()) {
         caption += document::text::captionDocument() + m_documentName +
                    (m_modified ? document::text::unsavedMark() : QString());

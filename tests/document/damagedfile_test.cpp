@@ -73,8 +73,7 @@ TEST_P(DamagedFileTest, IsRefusedAndChangesNothing) {
 }
 
 const Damage kDamages[] = {
-    {"Truncated", [](const QByteArray &good) { return good.left(good.size() / 2); },
-     "cut short"},
+    {"Truncated", [](const QByteArray &good) { return good.left(good.size() / 2); }, "cut short"},
     {"SyntaxErrorHasItsPlace",
      [](const QByteArray &good) {
          QByteArray bad = good;
@@ -98,8 +97,7 @@ const Damage kDamages[] = {
                  row[QStringLiteral("record")] = record;
              }),
      "row 3, its record: \"stocking\" is -1200"},
-    {"NegativeStockingField",
-     edit([](QJsonObject &top) {
+    {"NegativeStockingField", edit([](QJsonObject &top) {
          QJsonObject fields = top[QStringLiteral("fields")].toObject();
          fields[QStringLiteral("txtFromN")] = QStringLiteral("-2500");
          top[QStringLiteral("fields")] = fields;
@@ -115,8 +113,7 @@ const Damage kDamages[] = {
      "row 3 is younger than the row before it"},
     {"MissingCells", editRow(0, [](QJsonObject &row) { row.remove(QStringLiteral("cells")); }),
      "row 1 has no \"cells\""},
-    {"FelledWithoutFinalCut",
-     edit([](QJsonObject &top) {
+    {"FelledWithoutFinalCut", edit([](QJsonObject &top) {
          QJsonObject table = top[QStringLiteral("table")].toObject();
          table[QStringLiteral("felled")] = true;
          top[QStringLiteral("table")] = table;

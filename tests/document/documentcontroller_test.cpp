@@ -1,6 +1,7 @@
 #include "workflow/mainwindowfixture.hpp"
 
 #include "document/documentcontroller.hpp"
+#include "shell/iclipboard.hpp"
 #include "shell/settings.hpp"
 
 #include <QDir>
@@ -112,6 +113,20 @@ TEST_F(DocumentControllerTest, RecentFilesKeepTheLastEightNewestFirst) {
     EXPECT_EQ(recent.count(file(QStringLiteral("5.arbolex"))), 1);
     EXPECT_FALSE(recent.contains(file(QStringLiteral("1.arbolex"))));
     EXPECT_EQ(shell::readLastFolder(settings), dir.path());
+}
+
+TEST_F(DocumentControllerTest, TheIdentificationHeadsTheCopiedTable) {
+    shell::HeadlessClipboard clipboard;
+    logic.attachClipboard(&clipboard);
+    grow();
+    documents.setIdentification({QStringLiteral("Kilbrack"), QStringLiteral("12"),
+                                 QStringLiteral("b"), QStringLiteral("Sitka spruce\nPeaty gley")});
+    EXPECT_TRUE(documents.isModified());
+    logic.CopyTable(false);
+    EXPECT_TRUE(clipboard.text().startsWith(
+        QStringLiteral("Forest: Kilbrack\nCompartment: 12\nSub-compartment: b\nSitka spruce\n"
+                       "Peaty gley\n\nRow\tAge")))
+        << clipboard.text().left(120).toStdString();
 }
 
 } // namespace

@@ -25,8 +25,7 @@ public:
     /// Answers the unsaved-work question from `unsavedAnswers` (Cancel when empty).
     shell::UnsavedChoice askSaveDiscardCancel(const QString &title, const QString &text) override {
         questions.append({title, text, 0});
-        return unsavedAnswers.isEmpty() ? shell::UnsavedChoice::Cancel
-                                        : unsavedAnswers.takeFirst();
+        return unsavedAnswers.isEmpty() ? shell::UnsavedChoice::Cancel : unsavedAnswers.takeFirst();
     }
     QList<Message> messages, questions;
     QList<bool> answers;
