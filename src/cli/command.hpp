@@ -50,5 +50,7 @@ Command assortCommand();
 Command rotationCommand();
 Command optimiseCommand();
 Command uncertaintyCommand();
+/// Built only with the windows' libraries (ARBOLEX_WITH_REPORT): it draws charts.
+Command reportCommand();
 
 } // namespace arbolex::cli

@@ -268,4 +268,24 @@ inline QString introSequencePicture(int n) {
     return QStringLiteral("SpruceImages/Spruce_0") + QString::number(n) + QStringLiteral(".jpg");
 }
 
+// The File menu
+inline QString menuFile() {
+    return QStringLiteral("&File");
+}
+inline QString menuExportReport() {
+    return QStringLiteral("Export &Report…");
+}
+inline QString menuPrint() {
+    return QStringLiteral("&Print…");
+}
+inline QString menuExit() {
+    return QStringLiteral("E&xit");
+}
+inline QString filterPdf() {
+    return QStringLiteral("PDF document (*.pdf)");
+}
+inline QString menuView() {
+    return QStringLiteral("&View");
+}
+
 } // namespace arbolex::ui::text
