@@ -21,6 +21,14 @@ ReportTable fromGrid(std::vector<QStringList> grid, QStringList groups) {
         return table;
     }
     table.captions = grid.front();
+    // The group row stands above the captions: "Thinning N/ha" prints as "N/ha".
+    for (qsizetype c = 0; c < table.captions.size(); ++c) {
+        const QString group = groups.value(c).trimmed();
+        QString &caption = table.captions[c];
+        if (!group.isEmpty() && caption.startsWith(group + u' ')) {
+            caption = caption.mid(group.size() + 1);
+        }
+    }
     table.groups = std::move(groups);
     table.rows.assign(std::make_move_iterator(grid.begin() + 1),
                       std::make_move_iterator(grid.end()));
@@ -50,6 +58,13 @@ ReportTable cashFlowTable(const ComputedCashFlow &computed) {
     }
     table.captions = economics::text::npvHeaders();
     for (int i = 0; i < computed.years; ++i) {
+        // Years without an operation, a cost or a revenue are left out.
+        const bool quiet = computed.flow.operation(i).trimmed().isEmpty() &&
+                           computed.flow.matrix(economics::kCfCost, i) == 0.0 &&
+                           computed.flow.matrix(economics::kCfTotalRevenues, i) == 0.0;
+        if (quiet) {
+            continue;
+        }
         QStringList row;
         row << QString::number(static_cast<int>(computed.flow.matrix(economics::kCfYear, i)))
             << computed.flow.operation(i);

@@ -79,6 +79,9 @@ inline QString noCashFlow() {
     return QStringLiteral("No cash flow: the rotation has not been closed by a final cut with "
                           "its net present value.");
 }
+inline QString quietYearsLeftOut() {
+    return QStringLiteral("Years without an operation, a cost or a revenue are left out.");
+}
 inline QString emptyTable() {
     return QStringLiteral("The projection table is empty.");
 }

@@ -72,9 +72,14 @@ QString tableHtml(const charts::ReportTable &table) {
     for (const QStringList &row : table.rows) {
         html += QStringLiteral("<tr>");
         for (qsizetype c = 0; c < table.captions.size(); ++c) {
-            // The first column names the row; numbers line up on the right.
-            html += c == 0 ? QStringLiteral("<td class=\"label\">%1</td>").arg(esc(row.value(c)))
-                           : QStringLiteral("<td>%1</td>").arg(esc(row.value(c)));
+            // Names (of rows, of operations) on the left; numbers line up on the right.
+            const QString cell = row.value(c).trimmed();
+            bool number = cell.isEmpty();
+            if (!number) {
+                cell.toDouble(&number);
+            }
+            html += c > 0 && number ? QStringLiteral("<td>%1</td>").arg(esc(cell))
+                                    : QStringLiteral("<td class=\"label\">%1</td>").arg(esc(cell));
         }
         html += QStringLiteral("</tr>");
     }
@@ -117,6 +122,7 @@ QString reportHtml(const charts::ReportContent &content, const QString &printed)
         html += factsHtml({{text::netPresentValue(), content.netPresentValue},
                            {text::interestRate(), content.interestRate}});
         html += tableHtml(content.cashFlow);
+        html += QStringLiteral("<p class=\"note\">%1</p>").arg(esc(text::quietYearsLeftOut()));
     }
     return html + QStringLiteral("</body></html>");
 }

@@ -31,8 +31,10 @@ constexpr qreal kMarginMm = 12.0;
 void paintFooter(QPainter &painter, const QRectF &page, const QString &left, int number,
                  int count) {
     painter.save();
+    // Pixels of the layout: a point size would be taken at the device's
+    // resolution and then scaled once more.
     QFont font;
-    font.setPointSizeF(7.5);
+    font.setPixelSize(10);
     painter.setFont(font);
     painter.setPen(QColor(0x55, 0x55, 0x55));
     const QRectF band(page.left(), page.bottom() - kFooterHeight + 6.0, page.width(),

@@ -54,7 +54,10 @@ TEST_F(ReportTest, ContentCarriesTheRotationAndLeavesTheWindowAsItWas) {
     EXPECT_EQ(content.projection.captions.size(), content.projection.groups.size());
     EXPECT_FALSE(content.summary.empty());
     EXPECT_FALSE(logic.showingSummary()) << "the report fills the summary behind the scenes";
-    EXPECT_EQ(content.cashFlow.rows.size(), static_cast<std::size_t>(logic.cashFlow().years()));
+    // The group row names the group: captions do not repeat it.
+    EXPECT_EQ(content.projection.captions.count(QStringLiteral("N/ha")), 3);
+    ASSERT_EQ(content.cashFlow.rows.size(), 1U) << "only the year of the final cut earns";
+    EXPECT_EQ(content.cashFlow.rows[0].first(), QStringLiteral("60"));
     EXPECT_FALSE(content.netPresentValue.isEmpty());
     EXPECT_EQ(content.interestRate, QStringLiteral("5.00"));
     EXPECT_EQ(content.yieldClass, view.text(MainControl::lblYC));
