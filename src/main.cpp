@@ -86,6 +86,21 @@ bool demoThin(MainWindowLogic &logic, ThinWindowLogic &thin, const QString &stag
     return false;
 }
 
+/// Grows the stand of the rotation demonstrations (Sitka spruce, age 15, 2500
+/// stems/ha, 9 m, 22 m²/ha, 10 ha) to `to` by 5 years.
+void growRotationStand(MainWindowLogic &logic, const QString &to) {
+    logic.mnuModel_Click(0);
+    logic.typeText(MainControl::txtFromA, QStringLiteral("15"));
+    logic.typeText(MainControl::txtFromN, QStringLiteral("2500"));
+    logic.typeText(MainControl::txtFromH, QStringLiteral("9"));
+    logic.typeText(MainControl::txtFromB, QStringLiteral("22"));
+    logic.typeText(MainControl::txtFromD, QString());
+    logic.typeText(MainControl::txtNetArea, QStringLiteral("10"));
+    logic.typeText(MainControl::txtToA, to);
+    logic.typeText(MainControl::txtByA, QStringLiteral("5"));
+    logic.cmdGrow_Click();
+}
+
 /// The rotation demonstrations, from a Sitka spruce stand (age 15, 2500
 /// stems/ha, 9 m, 22 m²/ha, 10 ha) thinned by 50 m³/ha at 30 and grown to 60:
 ///   finalcut  the main window after the final cut;
@@ -99,16 +114,7 @@ bool demoRotation(MainWindowLogic &logic, ThinWindowLogic &thin,
         stage != QLatin1String("npv")) {
         return false;
     }
-    logic.mnuModel_Click(0);
-    logic.typeText(MainControl::txtFromA, QStringLiteral("15"));
-    logic.typeText(MainControl::txtFromN, QStringLiteral("2500"));
-    logic.typeText(MainControl::txtFromH, QStringLiteral("9"));
-    logic.typeText(MainControl::txtFromB, QStringLiteral("22"));
-    logic.typeText(MainControl::txtFromD, QString());
-    logic.typeText(MainControl::txtNetArea, QStringLiteral("10"));
-    logic.typeText(MainControl::txtToA, QStringLiteral("30"));
-    logic.typeText(MainControl::txtByA, QStringLiteral("5"));
-    logic.cmdGrow_Click();
+    growRotationStand(logic, QStringLiteral("30"));
     logic.cmdThin_Click();
     thin.typeText(ThinControl::txtRemV, QStringLiteral("50"));
     thin.press(ThinControl::cmdThin);
@@ -143,16 +149,7 @@ bool demoCharts(MainWindowLogic &logic, ThinWindowLogic &thin,
     if (!tabs.contains(chart)) {
         return false;
     }
-    logic.mnuModel_Click(0);
-    logic.typeText(MainControl::txtFromA, QStringLiteral("15"));
-    logic.typeText(MainControl::txtFromN, QStringLiteral("2500"));
-    logic.typeText(MainControl::txtFromH, QStringLiteral("9"));
-    logic.typeText(MainControl::txtFromB, QStringLiteral("22"));
-    logic.typeText(MainControl::txtFromD, QString());
-    logic.typeText(MainControl::txtNetArea, QStringLiteral("10"));
-    logic.typeText(MainControl::txtToA, QStringLiteral("25"));
-    logic.typeText(MainControl::txtByA, QStringLiteral("5"));
-    logic.cmdGrow_Click();
+    growRotationStand(logic, QStringLiteral("25"));
     logic.cmdThin_Click();
     thin.typeText(ThinControl::txtRemV, QStringLiteral("40"));
     thin.press(ThinControl::cmdThin);
