@@ -3,11 +3,13 @@
 // the user choose the model in the model choice window.
 #include "assortments/assortuserlogic.hpp"
 #include "assortments/assortwindowlogic.hpp"
+#include "document/documentcontroller.hpp"
 #include "economics/npvwindowlogic.hpp"
 #include "economics/prices.hpp"
 #include "economics/timberpriceswindowlogic.hpp"
 #include "engine/grow.hpp"
 #include "shell/datafolder.hpp"
+#include "shell/datahistory.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/version.hpp"
@@ -16,6 +18,7 @@
 #include "ui/assortwindow.hpp"
 #include "ui/chartpane.hpp"
 #include "ui/chartpanel.hpp"
+#include "ui/documentmenu.hpp"
 #include "ui/mainwindow.hpp"
 #include "ui/modelchoicedialog.hpp"
 #include "ui/npvwindow.hpp"
@@ -29,6 +32,8 @@
 #include <QAction>
 #include <QApplication>
 #include <QCommandLineParser>
+#include <QDir>
+#include <QFile>
 #include <QScreen>
 #include <QSettings>
 #include <QTimer>
@@ -230,6 +235,42 @@ bool demoAssort(MainWindowLogic &logic, ThinWindowLogic &thin,
     return false;
 }
 
+/// The document demonstrations, from the thinning loop's stand saved as
+/// "Kilbrack 12b.arbolex" in the temporary folder, with the net area typed
+/// afterwards so the caption carries the unsaved mark:
+///   open            the main window with that document;
+///   identification  the same with the "Sub-compartment" dialog open;
+///   fault           a damaged file opened: its "FAULT - " message.
+/// False for an unknown stage.
+bool demoDocument(MainWindowLogic &logic, ThinWindowLogic &thin,
+                  arbolex::document::DocumentController &documents, const QString &stage) {
+    if (stage != QLatin1String("open") && stage != QLatin1String("identification") &&
+        stage != QLatin1String("fault")) {
+        return false;
+    }
+    demoThin(logic, thin, QStringLiteral("loop"));
+    documents.setIdentification({QStringLiteral("Kilbrack"), QStringLiteral("12"),
+                                 QStringLiteral("b"),
+                                 QStringLiteral("Sitka spruce, planted 1998 on peaty gley")});
+    const QDir temp = QDir::temp();
+    documents.saveAs(temp.filePath(QStringLiteral("Kilbrack 12b.arbolex")));
+    logic.typeText(MainControl::txtNetArea, QStringLiteral("12.5"));
+    documents.refreshCaption();
+    if (stage == QLatin1String("identification")) {
+        documents.editIdentification();
+    } else if (stage == QLatin1String("fault")) {
+        const QString damaged = temp.filePath(QStringLiteral("Kilbrack 12c.arbolex"));
+        QFile file(damaged);
+        if (file.open(QIODevice::WriteOnly | QIODevice::Truncate)) {
+            file.write("{\n    \"format\": \"ARBOLEX sub-compartment\",\n    \"version\": 1,\n"
+                       "    \"model\": 0,\n    \"table\": {\"rows\": [\n");
+        }
+        file.close();
+        documents.open(damaged);
+    }
+    return true;
+}
+
 /// The options of the command line.
 struct Options {
     explicit Options(QCommandLineParser &parser) {
@@ -252,6 +293,11 @@ struct Options {
         parser.addOption(demoCharts);
         demoChartTab.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(demoChartTab);
+        demoDocument.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(demoDocument);
+        parser.addPositionalArgument(QStringLiteral("file"),
+                                     QStringLiteral("A sub-compartment (.arbolex) to open."),
+                                     QStringLiteral("[FILE]"));
         quitWhenShown.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(quitWhenShown);
     }
@@ -277,6 +323,8 @@ struct Options {
     /// The chart in view with --demo-charts: stand (the default), increments, cashflow.
     QCommandLineOption demoChartTab{QStringLiteral("demo-chart-tab"), QString(),
                                     QStringLiteral("CHART"), QStringLiteral("stand")};
+    QCommandLineOption demoDocument{QStringLiteral("demo-document"), QString(),
+                                    QStringLiteral("STAGE")};
     /// Ends the program once the main window is on screen: start-up is timed with it.
     QCommandLineOption quitWhenShown{QStringLiteral("quit-when-shown")};
 };
@@ -325,6 +373,11 @@ int main(int argc, char *argv[]) {
     interactive.setParentWidget(&window);
     MainWindowLogic logic(grow, prices, log, folder, window, interactive);
     window.attach(logic, settings);
+    // Copies of the data files the exit writes over, in the user's data location.
+    const arbolex::shell::DataHistory history(arbolex::shell::DataHistory::folderIn(
+        arbolex::shell::programDataPlaces(app.applicationDirPath()).userFolder));
+    logic.attachDataHistory(&history);
+    window.attachDataHistory(history, folder);
     // The thinning window opens over the main window; the main window's thin
     // command reaches it through its logic.
     arbolex::ui::ThinWindow thinWindow(&window);
@@ -360,6 +413,18 @@ int main(int argc, char *argv[]) {
     QObject::connect(window.assortUserAction(), &QAction::triggered, &window,
                      [&assortUserLogic] { assortUserLogic.mnuAssortUser_Click(); });
     logic.Form_Load(settings, QGuiApplication::primaryScreen()->availableGeometry());
+    // The sub-compartment as a document: the File menu, and the question
+    // before the window closes on unsaved work.
+    arbolex::ui::DocumentMenu documentMenu(window.fileMenu(), &window);
+    window.reportMenu()->addTo(*window.fileMenu());
+    arbolex::document::DocumentController documents(logic, interactive, &settings, &documentMenu);
+    documentMenu.attach(documents);
+    window.setCloseCheck([&documents] { return documents.maySafelyDiscard(); });
+    documents.start();
+    if (const QStringList files = parser.positionalArguments(); !files.isEmpty()) {
+        const QString file = files.first();
+        QTimer::singleShot(0, &window, [&documents, file] { documents.open(file); });
+    }
 
     if (parser.isSet(options.demoRotation)) {
         const QString stage = parser.value(options.demoRotation);
@@ -391,6 +456,13 @@ int main(int argc, char *argv[]) {
         QTimer::singleShot(0, &window, [&logic, &thinLogic, stage] {
             if (!demoThin(logic, thinLogic, stage)) {
                 qWarning("unknown thinning demonstration: %s", qPrintable(stage));
+            }
+        });
+    } else if (parser.isSet(options.demoDocument)) {
+        const QString stage = parser.value(options.demoDocument);
+        QTimer::singleShot(0, &window, [&, stage] {
+            if (!demoDocument(logic, thinLogic, documents, stage)) {
+                qWarning("unknown document demonstration: %s", qPrintable(stage));
             }
         });
     } else if (parser.isSet(options.demoPrices)) {

@@ -2,6 +2,7 @@
 
 #include "charts/reportmessages.hpp"
 #include "charts/standcharts.hpp"
+#include "document/subcompartment.hpp"
 #include "economics/mdlnpv.hpp"
 #include "economics/npvmessages.hpp"
 #include "shell/vbformat.hpp"
@@ -103,6 +104,11 @@ RotationCharts rotationCharts(workflow::MainWindowLogic &logic) {
 
 ReportContent reportContent(workflow::MainWindowLogic &logic) {
     ReportContent content;
+    const document::SubCompartment &id = logic.identification();
+    content.forest = id.forest;
+    content.compartment = id.compartment;
+    content.subCompartment = id.subCompartment;
+    content.description = id.notes;
     content.modelLabel = QString::fromStdString(logic.grow().label());
     content.inputs = inputs(logic);
     content.siteIndex = logic.view().text(MainControl::lblSI);

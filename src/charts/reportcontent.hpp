@@ -29,7 +29,8 @@ struct ReportTable {
 };
 
 struct ReportContent {
-    /// Identification of the sub-compartment; empty fields are left out.
+    /// Identification of the sub-compartment (the document's); empty fields
+    /// are left out.
     QString forest;
     QString compartment;
     QString subCompartment;

@@ -1,6 +1,7 @@
 #include "cli/scriptrunner.hpp"
 
 #include "cli/assortscript.hpp"
+#include "cli/documentscript.hpp"
 #include "shell/tableexport.hpp"
 
 #include <QFile>
@@ -13,7 +14,8 @@ namespace arbolex::cli {
 using workflow::MainControl;
 
 ScriptRunner::ScriptRunner(HeadlessSession &session, QTextStream &out)
-    : m_session(session), m_out(out) {
+    : m_session(session), m_out(out), m_documents(session.main(), session.interactive(), nullptr) {
+    m_documents.start();
     workflow::MainWindowLogic &main = session.main();
     m_commands = {
         {QStringLiteral("cmdGrow"),
@@ -117,6 +119,9 @@ QString ScriptRunner::runLine(const QString &rawLine) {
         }
         m_session.main().mnuModel_Click(id);
         return {};
+    }
+    if (const auto document = runDocumentCommand(m_documents, m_session, command, rest, m_out)) {
+        return *document;
     }
     if (command == QLatin1String("set")) {
         return set(control, text);

@@ -10,12 +10,14 @@
 //                            flxSummary, frmNPV.NPV_Grid and clipboard print tab-separated
 //   set frmNPV.NPV_Grid(ROW,COL) TEXT  types TEXT into a cell of the cash flow
 // A switched-off button cannot be pressed. `set CONTROL` alone empties the field.
+//   save FILE | open FILE | new | print caption   the File menu (cli/documentscript.hpp)
 // '#' starts a comment. Controls of other windows are named "window.name".
 // `set CONTROL` with no text empties the field; an element of a control array
 // carries its index ("frmTimberPrices.txtTimbVal(13)"); an option button
 // prints 1 when chosen, else 0.
 
 #include "cli/headlesssession.hpp"
+#include "document/documentcontroller.hpp"
 
 #include <QSettings>
 #include <QStringList>
@@ -51,6 +53,8 @@ private:
     HeadlessSession &m_session;
     QTextStream &m_out;
     std::map<QString, std::function<void()>> m_commands;
+    /// The File menu; the document starts as the session stands when the runner starts.
+    document::DocumentController m_documents;
 };
 
 /// The main window's load, then the lines of `script` (UTF-8, split at line

@@ -43,6 +43,8 @@ struct CashFlowRecord {
     double totalRevenues = 0.0;
     double cashFlow = 0.0;
     double discountedCashFlow = 0.0;
+
+    bool operator==(const CashFlowRecord &) const = default;
 };
 
 class CashFlow {

@@ -56,6 +56,9 @@ inline constexpr const char *kPrivatePricesFile = "OVRA_PRIC.qdm";
 inline constexpr const char *kUserPricesFile = "USRPRIC.qdm";
 inline constexpr const char *kAveragePricesFile = "AvPRIC_npv.qdm";
 inline constexpr const char *kUserAssortmentsFile = "UD_Assort.qdm";
+/// The files the exit writes back, which the data history keeps.
+inline constexpr const char *kFilesWrittenAtExit[] = {kCurrentPricesFile, kUserPricesFile,
+                                                      kAveragePricesFile, kUserAssortmentsFile};
 
 /// Selector of WritePricesInFiles.
 enum PriceFileSelector : std::int16_t {

@@ -29,6 +29,12 @@ public:
     /// Copies the chosen list into the prices in use, each price as its
     /// absolute value, and makes it the set in use. Other values do nothing.
     void selectPriceSet(std::int16_t set);
+    /// Puts back a price set in use and the prices it had copied, as a saved
+    /// sub-compartment valued its rows with them.
+    void restoreInUse(std::int16_t set, const PriceList &prices) {
+        m_priceSetInUse = set;
+        m_pricesInUse = prices;
+    }
 
     /// Prices read by the final-cut and thinning rows, euro per m³, never negative.
     const PriceList &pricesInUse() const { return m_pricesInUse; }

@@ -93,4 +93,32 @@ void writeInterestRate(QSettings &settings, double percent) {
     settings.endGroup();
 }
 
+QStringList readRecentFiles(QSettings &settings) {
+    settings.beginGroup(QLatin1String(kSettingsSection));
+    QStringList files = settings.value(QStringLiteral("RecentFiles")).toStringList();
+    settings.endGroup();
+    files.removeAll(QString());
+    files.removeDuplicates();
+    return files.mid(0, kRecentFileCount);
+}
+
+void writeRecentFiles(QSettings &settings, const QStringList &files) {
+    settings.beginGroup(QLatin1String(kSettingsSection));
+    settings.setValue(QStringLiteral("RecentFiles"), files.mid(0, kRecentFileCount));
+    settings.endGroup();
+}
+
+QString readLastFolder(QSettings &settings) {
+    settings.beginGroup(QLatin1String(kSettingsSection));
+    const QString folder = settings.value(QStringLiteral("LastFolder")).toString();
+    settings.endGroup();
+    return folder;
+}
+
+void writeLastFolder(QSettings &settings, const QString &folder) {
+    settings.beginGroup(QLatin1String(kSettingsSection));
+    settings.setValue(QStringLiteral("LastFolder"), folder);
+    settings.endGroup();
+}
+
 } // namespace arbolex::shell

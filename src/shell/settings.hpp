@@ -1,6 +1,8 @@
 #pragma once
 
 #include <QRect>
+#include <QString>
+#include <QStringList>
 
 class QSettings;
 
@@ -31,5 +33,17 @@ void writeMainPlacement(QSettings &settings, const QRect &placement);
 double readInterestRate(QSettings &settings);
 
 void writeInterestRate(QSettings &settings, double percent);
+
+/// Most recent documents listed in Open Recent.
+inline constexpr int kRecentFileCount = 8;
+
+/// The recent documents, newest first, at most kRecentFileCount ("RecentFiles").
+QStringList readRecentFiles(QSettings &settings);
+void writeRecentFiles(QSettings &settings, const QStringList &files);
+
+/// The folder a document was last opened from or saved in ("LastFolder"),
+/// empty when none.
+QString readLastFolder(QSettings &settings);
+void writeLastFolder(QSettings &settings, const QString &folder);
 
 } // namespace arbolex::shell

@@ -2,11 +2,13 @@
 #include "ui/fieldinput.hpp"
 
 #include "assortments/assortmessages.hpp"
+#include "document/documentmessages.hpp"
 #include "engine/catalogue.hpp"
 #include "ui/chartpane.hpp"
 #include "ui/groupheaderview.hpp"
 #include "ui/projectionmodel.hpp"
 #include "ui/reportmenu.hpp"
+#include "ui/restoredatadialog.hpp"
 #include "ui/stringgridmodel.hpp"
 #include "ui/windowtexts.hpp"
 #include "workflow/mainmessages.hpp"
@@ -120,13 +122,16 @@ void MainWindow::SetModelFromfrmModelChoice(int modelId) {
 // ---- Building the window ------------------------------------------------------------
 
 void MainWindow::buildMenus() {
-    m_reportMenu = new ReportMenu(*this, *menuBar()->addMenu(text::menuFile()));
+    m_fileMenu = menuBar()->addMenu(document::text::menuFile());
+    m_reportMenu = new ReportMenu(*this);
     QMenu *models = menuBar()->addMenu(text::menuModel());
     models->setObjectName(QStringLiteral("mnuModel"));
+    models->setToolTipsVisible(true);
     m_modelActions = new QActionGroup(this);
     m_modelActions->setExclusive(true);
     for (int id = 0; id < engine::kModelCount; ++id) {
-        QAction *entry = models->addAction(text::modelEntry(id));
+        QAction *entry = models->addAction(text::modelMenuEntry(id));
+        entry->setToolTip(text::modelDetails(id));
         entry->setCheckable(true);
         entry->setData(id);
         m_modelActions->addAction(entry);
@@ -173,6 +178,13 @@ void MainWindow::buildMenus() {
         }
     });
     help->addSeparator();
+    QAction *restore = help->addAction(text::menuRestoreData());
+    restore->setObjectName(QStringLiteral("mnuRestoreData"));
+    connect(restore, &QAction::triggered, this, [this] {
+        if (m_logic != nullptr && m_dataHistory != nullptr) {
+            RestoreDataDialog(*m_dataHistory, m_dataFolder, *m_logic, this).exec();
+        }
+    });
     connect(help->addAction(text::menuAbout()), &QAction::triggered, this, &MainWindow::about);
 }
 
@@ -576,6 +588,10 @@ void MainWindow::setPlacement(const QRect &placement) {
 // ---- Events --------------------------------------------------------------------------------
 
 void MainWindow::closeEvent(QCloseEvent *event) {
+    if (m_closeCheck && !m_closeCheck()) {
+        event->ignore();
+        return;
+    }
     if (m_logic != nullptr && m_settings != nullptr) {
         m_logic->Form_Unload(*m_settings);
     }

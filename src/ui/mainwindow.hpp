@@ -5,16 +5,21 @@
 #include <QMainWindow>
 
 #include <array>
+#include <functional>
 
 class QAction;
 class QActionGroup;
 class QLabel;
 class QLineEdit;
+class QMenu;
 class QPushButton;
 class QSettings;
 class QStackedWidget;
 class QTableView;
 
+namespace arbolex::shell {
+class DataHistory;
+}
 namespace arbolex::workflow {
 class MainWindowLogic;
 }
@@ -40,6 +45,12 @@ public:
     /// the window closes. Both must outlive the window.
     void attach(workflow::MainWindowLogic &logic, QSettings &settings);
 
+    /// The history Help → Restore data files… lists, of the data folder `dataFolder`.
+    void attachDataHistory(const shell::DataHistory &history, const QString &dataFolder) {
+        m_dataHistory = &history;
+        m_dataFolder = dataFolder;
+    }
+
     /// Takes the model chosen in the model choice window.
     void SetModelFromfrmModelChoice(int modelId);
 
@@ -49,6 +60,10 @@ public:
     QTableView *summaryGrid() const { return m_summaryGrid; }
     ProjectionModel *gridModel() const { return m_model; }
     QActionGroup *modelMenu() const { return m_modelActions; }
+    /// The File menu, empty until the document menu fills it.
+    QMenu *fileMenu() const { return m_fileMenu; }
+    /// Asked before the window closes (unsaved work); false keeps it open.
+    void setCloseCheck(std::function<bool()> check) { m_closeCheck = std::move(check); }
     /// The entry `mnuAssortUser` that opens the user categories window.
     QAction *assortUserAction() const { return m_assortUserAction; }
     /// The charts beside the table, and the report entries of the File menu.
@@ -97,12 +112,16 @@ private:
     void about();
 
     workflow::MainWindowLogic *m_logic = nullptr;
+    const shell::DataHistory *m_dataHistory = nullptr;
+    QString m_dataFolder;
     QSettings *m_settings = nullptr;
 
     std::array<QWidget *, workflow::kMainControlCount> m_controls{};
     /// Texts of the commands the window does not offer (yet).
     std::array<QString, workflow::kMainControlCount> m_absentText;
 
+    QMenu *m_fileMenu = nullptr;
+    std::function<bool()> m_closeCheck;
     QActionGroup *m_modelActions = nullptr;
     QAction *m_assortUserAction = nullptr;
     ChartPane *m_chartPane = nullptr;

@@ -66,11 +66,22 @@ ModelChoiceDialog::ModelChoiceDialog(MainWindow &main, QString dataFolder, int i
     for (int id = 0; id < engine::kModelCount; ++id) {
         auto *entry = new QListWidgetItem(text::modelEntry(id), m_models);
         entry->setData(Qt::UserRole, id);
+        entry->setToolTip(text::modelDetails(id));
     }
     m_models->setCurrentRow(initialModel >= 0 && initialModel < engine::kModelCount ? initialModel
                                                                                     : 0);
     m_models->setMinimumWidth(
         m_models->fontMetrics().horizontalAdvance(QStringLiteral("00   LPC - (Un-Thinned)")) + 48);
+
+    // What tells the entries sharing a label apart, for the selected entry.
+    m_description = new QLabel(this);
+    m_description->setObjectName(QStringLiteral("lblModelDescription"));
+    m_description->setWordWrap(true);
+    m_description->setFrameShape(QFrame::StyledPanel);
+    m_description->setMargin(6);
+    m_description->setMinimumHeight(m_description->fontMetrics().lineSpacing() * 4 + 12);
+    m_description->setAlignment(Qt::AlignLeft | Qt::AlignTop);
+    describeSelection();
 
     m_accept = new QPushButton(text::buttonAcceptChoice(), this);
     m_accept->setObjectName(QStringLiteral("cmdGoToMain"));
@@ -82,6 +93,7 @@ ModelChoiceDialog::ModelChoiceDialog(MainWindow &main, QString dataFolder, int i
     choice->addWidget(heading);
     choice->addWidget(intro);
     choice->addWidget(m_models, 1);
+    choice->addWidget(m_description);
     auto *buttons = new QHBoxLayout;
     buttons->addStretch(1);
     buttons->addWidget(m_accept);
@@ -96,6 +108,7 @@ ModelChoiceDialog::ModelChoiceDialog(MainWindow &main, QString dataFolder, int i
 
     connect(m_accept, &QPushButton::clicked, this, &ModelChoiceDialog::cmdGoToMain_Click);
     connect(m_models, &QListWidget::itemActivated, this, &ModelChoiceDialog::cmdGoToMain_Click);
+    connect(m_models, &QListWidget::currentRowChanged, this, &ModelChoiceDialog::describeSelection);
 
     startIntroduction();
 }
@@ -154,6 +167,14 @@ void ModelChoiceDialog::nextPicture() {
         m_sequenceNumber = 1;
     }
     m_sequence->setPicture(media(text::introSequencePicture(m_sequenceNumber)));
+}
+
+void ModelChoiceDialog::describeSelection() {
+    const int model = selectedModel();
+    m_description->setText(model < 0 ? QString()
+                                     : QStringLiteral("<b>%1</b><br>%2")
+                                           .arg(text::modelEntry(model).toHtmlEscaped(),
+                                                text::modelDetails(model).toHtmlEscaped()));
 }
 
 int ModelChoiceDialog::selectedModel() const {

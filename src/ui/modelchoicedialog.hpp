@@ -2,6 +2,7 @@
 
 #include <QDialog>
 
+class QLabel;
 class QListWidget;
 class QMediaPlayer;
 class QPushButton;
@@ -44,6 +45,8 @@ private:
     void videoFinished();
     /// Steps the picture sequence to its next picture, back to the first after the last.
     void nextPicture();
+    /// Shows what the selected entry is in the description below the list.
+    void describeSelection();
 
     MainWindow &m_main;
     QString m_dataFolder;
@@ -54,6 +57,7 @@ private:
     PictureView *m_picture = nullptr;
     PictureView *m_sequence = nullptr;
     QListWidget *m_models = nullptr;
+    QLabel *m_description = nullptr;
     QPushButton *m_accept = nullptr;
 
     QMediaPlayer *m_player = nullptr;

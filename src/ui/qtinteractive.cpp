@@ -66,4 +66,20 @@ bool QtInteractive::askYesNo(const QString &title, const QString &text) {
     return box.exec() == QMessageBox::Yes;
 }
 
+shell::UnsavedChoice QtInteractive::askSaveDiscardCancel(const QString &title,
+                                                         const QString &text) {
+    QMessageBox box(QMessageBox::Warning, title, lineBreaks(text),
+                    QMessageBox::Save | QMessageBox::Discard | QMessageBox::Cancel, m_parent);
+    box.setTextFormat(Qt::PlainText);
+    box.setDefaultButton(QMessageBox::Save);
+    switch (box.exec()) {
+    case QMessageBox::Save:
+        return shell::UnsavedChoice::Save;
+    case QMessageBox::Discard:
+        return shell::UnsavedChoice::Discard;
+    default:
+        return shell::UnsavedChoice::Cancel;
+    }
+}
+
 } // namespace arbolex::ui

@@ -23,6 +23,8 @@ public:
 
     void message(const QString &title, const QString &text, int style) override;
     bool askYesNo(const QString &title, const QString &text) override;
+    shell::UnsavedChoice askSaveDiscardCancel(const QString &title,
+                                              const QString &text) override;
 
     /// The box of a message in `style` (icon and buttons), not yet shown.
     static std::unique_ptr<QMessageBox> messageBox(QWidget *parent, const QString &title,

@@ -19,19 +19,27 @@
 
 namespace arbolex::ui {
 
-ReportMenu::ReportMenu(QMainWindow &window, QMenu &file) : QObject(&window), m_window(window) {
-    m_export = file.addAction(text::menuExportReport());
+ReportMenu::ReportMenu(QMainWindow &window) : QObject(&window), m_window(window) {
+    m_export = new QAction(text::menuExportReport(), this);
     m_export->setObjectName(QStringLiteral("mnuExportReport"));
-    m_print = file.addAction(text::menuPrint());
+    m_print = new QAction(text::menuPrint(), this);
     m_print->setObjectName(QStringLiteral("mnuPrint"));
     m_print->setShortcut(QKeySequence::Print);
-    file.addSeparator();
-    QAction *exit = file.addAction(text::menuExit());
-    exit->setObjectName(QStringLiteral("mnuExit"));
-    exit->setShortcut(QKeySequence::Quit);
     connect(m_export, &QAction::triggered, this, &ReportMenu::chooseAndExport);
     connect(m_print, &QAction::triggered, this, &ReportMenu::print);
-    connect(exit, &QAction::triggered, &m_window, &QMainWindow::close);
+}
+
+void ReportMenu::addTo(QMenu &file) {
+    QAction *before = nullptr;
+    for (QAction *entry : file.actions()) {
+        if (entry->objectName() == QLatin1String("mnuClose")) {
+            before = entry;
+            break;
+        }
+    }
+    file.insertAction(before, m_export);
+    file.insertAction(before, m_print);
+    file.insertSeparator(before);
 }
 
 bool ReportMenu::exportReport(const QString &path) {

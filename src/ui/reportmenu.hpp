@@ -17,8 +17,12 @@ namespace arbolex::ui {
 class ReportMenu : public QObject {
     Q_OBJECT
 public:
-    /// Adds the entries to `file`, followed by Exit, which closes `window`.
-    ReportMenu(QMainWindow &window, QMenu &file);
+    /// The entries, not yet in a menu; dialogs open over `window`.
+    explicit ReportMenu(QMainWindow &window);
+
+    /// Puts the entries into the File menu, before its Close entry when it
+    /// has one (Close and Exit stay last), else at its end.
+    void addTo(QMenu &file);
 
     void attach(workflow::MainWindowLogic &logic) { m_logic = &logic; }
 

@@ -5,9 +5,12 @@
 // one edit.
 
 #include "engine/catalogue.hpp"
+#include "engine/modeldescription.hpp"
+#include "shell/datahistory.hpp"
 #include "shell/version.hpp"
 
 #include <QString>
+#include <QStringList>
 
 namespace arbolex::ui::text {
 
@@ -34,6 +37,22 @@ inline QString modelEntry(int modelId) {
            QString::fromLatin1(engine::catalogue().at(static_cast<std::size_t>(modelId)).label);
 }
 
+/// Entry of the model menu: the list entry, then the species, the regime and
+/// what an alternative calibration changes from the base entry it shares its
+/// label with.
+inline QString modelMenuEntry(int modelId) {
+    return modelEntry(modelId) + QStringLiteral("    \u2014  ") +
+           QString::fromStdString(engine::modelMenuNote(modelId));
+}
+/// One line on the model: species, regime, what an alternative changes.
+inline QString modelSummary(int modelId) {
+    return QString::fromStdString(engine::modelSummary(modelId));
+}
+/// A few sentences on the model, for tooltips and the model window's description.
+inline QString modelDetails(int modelId) {
+    return QString::fromStdString(engine::modelDetails(modelId));
+}
+
 // ---- Main window ------------------------------------------------------------------
 
 inline QString menuModel() {
@@ -48,6 +67,46 @@ inline QString menuThreshold() {
 inline QString menuNotes() {
     return QStringLiteral("&Notes on this model\u2026");
 }
+inline QString menuRestoreData() {
+    return QStringLiteral("Restore data files\u2026");
+}
+
+// ---- Restore data files --------------------------------------------------------------
+
+inline QString restoreDataTitle() {
+    return QStringLiteral("Restore data files");
+}
+inline QString restoreDataIntro(const QString &folder) {
+    return QStringLiteral("Before the price lists and the assortment categories are written at "
+                          "exit, the files they replace are kept here, the last %1 of each. "
+                          "Restore puts a kept copy back in the data folder (the file it "
+                          "replaces is kept in turn) and reads the lists again.\n\nKept in: %2")
+        .arg(QString::number(shell::DataHistory::kCopiesKept), folder);
+}
+inline QStringList restoreDataColumns() {
+    return {QStringLiteral("File"), QStringLiteral("Kept on"), QStringLiteral("Size")};
+}
+inline QString restoreDataButton() {
+    return QStringLiteral("&Restore");
+}
+inline QString restoreDataNone() {
+    return QStringLiteral("No copies kept yet.");
+}
+inline QString restoreDataConfirm(const QString &file, const QString &when) {
+    return QStringLiteral("PLEASE CONFIRM - Replace %1 in the data folder with the copy kept on "
+                          "%2? The present file is kept in the history first.")
+        .arg(file, when);
+}
+inline QString restoreDataFault(const QString &file, const QString &why) {
+    return QStringLiteral("FAULT - %1 could not be restored: %2. Nothing was changed.")
+        .arg(file, why);
+}
+inline QString restoreDataDone(const QString &file, const QString &when) {
+    return QStringLiteral("%1 as kept on %2 is back in the data folder, and the price lists and "
+                          "categories have been read again.")
+        .arg(file, when);
+}
+
 inline QString menuEdit() {
     return QStringLiteral("&Edit");
 }
@@ -268,18 +327,12 @@ inline QString introSequencePicture(int n) {
     return QStringLiteral("SpruceImages/Spruce_0") + QString::number(n) + QStringLiteral(".jpg");
 }
 
-// The File menu
-inline QString menuFile() {
-    return QStringLiteral("&File");
-}
+// The report entries of the File menu, and the View menu
 inline QString menuExportReport() {
     return QStringLiteral("Export &Report…");
 }
 inline QString menuPrint() {
     return QStringLiteral("&Print…");
-}
-inline QString menuExit() {
-    return QStringLiteral("E&xit");
 }
 inline QString filterPdf() {
     return QStringLiteral("PDF document (*.pdf)");

@@ -78,7 +78,15 @@ void MainWindowLogic::CopyTable(bool summary) {
         if (m_clipboard == nullptr) {
             return;
         }
-        const std::vector<QStringList> grid = summary ? summaryGrid() : m_table.exportGrid();
+        std::vector<QStringList> grid = summary ? summaryGrid() : m_table.exportGrid();
+        // The sub-compartment's identification heads the copy, a blank line below it.
+        const QStringList heading = m_identification.heading();
+        if (!heading.isEmpty()) {
+            grid.insert(grid.begin(), QStringList{QString()});
+            for (auto line = heading.rbegin(); line != heading.rend(); ++line) {
+                grid.insert(grid.begin(), QStringList{*line});
+            }
+        }
         copied = m_clipboard->setTable(shell::tabSeparated(grid), shell::htmlTable(grid));
     });
     if (!copied) {

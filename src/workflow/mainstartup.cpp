@@ -1,7 +1,9 @@
 // The main window's load and unload, the model menu and its information boxes.
+#include "document/documentmessages.hpp"
 #include "economics/pricedata.hpp"
 #include "economics/prices.hpp"
 #include "shell/apperror.hpp"
+#include "shell/datahistory.hpp"
 #include "shell/interactive.hpp"
 #include "shell/settings.hpp"
 #include "shell/startupfile.hpp"
@@ -10,6 +12,7 @@
 #include "workflow/mainmessages.hpp"
 #include "workflow/mainwindowlogic.hpp"
 
+#include <QDir>
 #include <QSettings>
 
 namespace arbolex::workflow {
@@ -79,8 +82,26 @@ void MainWindowLogic::Form_Unload(QSettings &settings) {
         values.netArea = shell::val(field(MainControl::txtNetArea));
         shell::writeStartupFile(m_dataFolder, values, m_log);
     });
+    if (m_dataHistory != nullptr) {
+        for (const char *name : economics::kFilesWrittenAtExit) {
+            shell::guard(m_log, label, [&] {
+                if (!m_dataHistory->keep(QDir(m_dataFolder).filePath(QLatin1String(name)))) {
+                    shell::raiseAppFault(shell::RuntimeError::pathFileAccessError());
+                }
+            });
+        }
+    }
     economics::WritePricesInFiles(3, m_dataFolder, m_prices.data(), m_log);
     economics::WriteUserDefinedAssortmentsInFile(m_dataFolder, m_prices.data(), m_log);
+}
+
+void MainWindowLogic::reloadDataFiles() {
+    shell::guard(m_log, QStringLiteral(" in frmMain.reloadDataFiles()"), [&] {
+        const std::int16_t inUse = m_prices.priceSetInUse();
+        m_prices.data() = economics::PriceData{};
+        economics::GetPricesFromFiles(m_dataFolder, m_prices.data(), m_log);
+        m_prices.selectPriceSet(inUse);
+    });
 }
 
 void MainWindowLogic::cmdChangePrices_Click() {
@@ -115,8 +136,13 @@ void MainWindowLogic::mnuModel_Click(int index) {
 }
 
 void MainWindowLogic::updateCaption() {
-    m_view.setCaption(text::titleArbolex() + text::captionModelInUse() +
-                      QString::fromStdString(m_grow.label()));
+    QString caption = text::titleArbolex() + text::captionModelInUse() +
+                      QString::fromStdString(m_grow.label());
+    if (!m_documentName.isEmpty()) {
+        caption += document::text::captionDocument() + m_documentName +
+                   (m_modified ? document::text::unsavedMark() : QString());
+    }
+    m_view.setCaption(caption);
 }
 
 float MainWindowLogic::thresholdBasalArea() {

@@ -10,6 +10,7 @@
 #include "economics/timberrevenue.hpp"
 #include "engine/grow.hpp"
 #include "workflow/imainview.hpp"
+#include "workflow/mainsnapshot.hpp"
 #include "workflow/projectiontable.hpp"
 
 #include <QString>
@@ -20,6 +21,7 @@
 class QSettings;
 
 namespace arbolex::shell {
+class DataHistory;
 class ErrorLog;
 class IClipboard;
 class IInteractive;
@@ -177,6 +179,11 @@ public:
     void attachTimberPrices(economics::TimberPricesWindowLogic *prices) { m_timberPrices = prices; }
     /// The assortment report window's logic that the assort command opens.
     void attachAssortments(assortments::AssortWindowLogic *assort) { m_assort = assort; }
+    /// The history that keeps the data files the exit writes over.
+    void attachDataHistory(const shell::DataHistory *history) { m_dataHistory = history; }
+    /// Reads the price lists and the categories from the data folder again
+    /// (after a file was restored), keeping the price set in use.
+    void reloadDataFiles();
 
     /// The table as the thinning rows change it.
     ProjectionTable &tableForThinning() { return m_table; }
@@ -190,6 +197,21 @@ public:
     economics::CashFlow &cashFlow() { return m_cashFlow; }
     /// The net area of the sub-compartment, ha (0 when empty).
     double netArea() const;
+
+    // ---- The sub-compartment as a document ------------------------------------------
+
+    /// The work of the sub-compartment as it stands.
+    MainSnapshot snapshot() const;
+    /// Puts back the work of `snapshot` exactly as it was taken (no recomputation):
+    /// growing, thinning and the cash flow go on from there.
+    void restore(const MainSnapshot &snapshot);
+    /// The document's name and whether it has unsaved changes, for the caption.
+    void setDocumentTitle(const QString &name, bool modified);
+    const QString &documentName() const { return m_documentName; }
+    bool documentModified() const { return m_modified; }
+    /// The identification that heads every report of the sub-compartment.
+    const document::SubCompartment &identification() const { return m_identification; }
+    void setIdentification(const document::SubCompartment &id) { m_identification = id; }
 
     engine::Grow &grow() { return m_grow; }
     economics::Prices &prices() { return m_prices; }
@@ -218,6 +240,7 @@ private:
     void AjustArraysAfterDelete(int firstDeleted);
     /// Switches the table view between the projections and the summary.
     void showSummary(bool summary);
+    void restoreCashFlow(const MainSnapshot &snapshot);
 
     engine::Grow &m_grow;
     economics::Prices &m_prices;
@@ -237,6 +260,7 @@ private:
     shell::IClipboard *m_clipboard = nullptr;
     economics::TimberPricesWindowLogic *m_timberPrices = nullptr;
     assortments::AssortWindowLogic *m_assort = nullptr;
+    const shell::DataHistory *m_dataHistory = nullptr;
     economics::TimberRevenue m_timberRevenue;
     economics::CashFlow m_cashFlow;
     /// Set by the final cut; no growing or thinning until rows are cleared or deleted.
@@ -245,6 +269,10 @@ private:
     /// Index in m_summary of the first row of the rotation's totals.
     int m_summaryTotalsFrom = 0;
     bool m_showingSummary = false;
+    document::SubCompartment m_identification;
+    /// Name of the open document ("" before any) and its unsaved changes.
+    QString m_documentName;
+    bool m_modified = false;
 };
 
 } // namespace arbolex::workflow

@@ -44,6 +44,7 @@ int ProjectionTable::append(TableRow row) {
 
 void ProjectionTable::clear(HeaderLayout layout) {
     m_rows.clear();
+    m_removalsKnown = 0;
     m_layout = layout;
     m_row = 0;
     m_rowSel = 0;
@@ -52,6 +53,7 @@ void ProjectionTable::clear(HeaderLayout layout) {
 void ProjectionTable::removeFrom(int firstRemoved) {
     const auto kept = static_cast<std::size_t>(std::clamp(firstRemoved - 1, 0, lastRow()));
     m_rows.erase(m_rows.begin() + static_cast<std::ptrdiff_t>(kept), m_rows.end());
+    m_removalsKnown = std::min(m_removalsKnown, static_cast<int>(kept));
     m_row = lastRow();
     m_rowSel = lastRow();
 }
@@ -174,15 +176,21 @@ void ProjectionTable::select(int row, int endRow) {
 }
 
 ProjectionTable::Removals ProjectionTable::removalsUpTo(int upTo) const {
-    Removals sum;
     const int last = std::min(upTo, lastRow());
-    for (int r = 1; r <= last; ++r) {
+    if (last < 1) {
+        return {};
+    }
+    m_removals.resize(m_rows.size());
+    for (int r = m_removalsKnown + 1; r <= last; ++r) {
+        Removals sum = r > 1 ? m_removals[static_cast<std::size_t>(r - 2)] : Removals{};
         const RowRecord &rec = row(r).record;
         sum.basalArea += rec.removedBasalArea;
         sum.stocking += rec.removedStocking;
         sum.volume += rec.removedVolume;
+        m_removals[static_cast<std::size_t>(r - 1)] = sum;
     }
-    return sum;
+    m_removalsKnown = std::max(m_removalsKnown, last);
+    return m_removals[static_cast<std::size_t>(last - 1)];
 }
 
 } // namespace arbolex::workflow

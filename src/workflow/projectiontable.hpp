@@ -5,6 +5,8 @@
 #include <QString>
 #include <QStringList>
 
+#include <algorithm>
+
 #include <vector>
 
 namespace arbolex::workflow {
@@ -74,6 +76,7 @@ struct TableRow {
     bool isGrowth() const { return kind == RowKind::Growth; }
     bool isThinning() const { return kind == RowKind::Thinning; }
     bool isText() const { return kind == RowKind::Text; }
+    bool operator==(const TableRow &) const = default;
 };
 
 /// The projection table `flxMain`: the header row, the data rows with their
@@ -91,7 +94,12 @@ public:
 
     /// Data row `r` (1-based, as the grid counts).
     const TableRow &row(int r) const { return m_rows.at(static_cast<std::size_t>(r - 1)); }
-    TableRow &row(int r) { return m_rows.at(static_cast<std::size_t>(r - 1)); }
+    /// A row to change: the running sums of the removals are read again from it on.
+    TableRow &row(int r) {
+        TableRow &changed = m_rows.at(static_cast<std::size_t>(r - 1));
+        m_removalsKnown = std::min(m_removalsKnown, r - 1);
+        return changed;
+    }
 
     /// Appends a data row and returns its index.
     int append(TableRow row);
@@ -137,6 +145,9 @@ public:
         double stocking = 0.0;
         double volume = 0.0;
     };
+    /// Summed once per row and kept, so that growing row after row stays
+    /// linear in the number of rows; a row changed, removed or cleared is
+    /// summed again, in the same order, to the same values.
     Removals removalsUpTo(int upTo) const;
 
 private:
@@ -144,6 +155,10 @@ private:
     std::vector<int> exportColumns(const std::vector<int> &wanted) const;
 
     std::vector<TableRow> m_rows;
+    /// Running sums of the removals: element r − 1 holds rows 1..r; the first
+    /// m_removalsKnown are up to date.
+    mutable std::vector<Removals> m_removals;
+    mutable int m_removalsKnown = 0;
     HeaderLayout m_layout = HeaderLayout::WithMoney;
     int m_row = 0;
     int m_rowSel = 0;

@@ -31,6 +31,7 @@ struct RowRecord {
     float postDbh = 0.0f;
 
     bool isThinned() const { return removedBasalArea > 0.0f; }
+    bool operator==(const RowRecord &) const = default;
 };
 
 /// Indices of the per-row numbers that summaries, increments and cash flows read.

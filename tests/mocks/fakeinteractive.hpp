@@ -22,8 +22,15 @@ public:
         questions.append({title, text, 0});
         return answers.isEmpty() || answers.takeFirst();
     }
+    /// Answers the unsaved-work question from `unsavedAnswers` (Cancel when empty).
+    shell::UnsavedChoice askSaveDiscardCancel(const QString &title, const QString &text) override {
+        questions.append({title, text, 0});
+        return unsavedAnswers.isEmpty() ? shell::UnsavedChoice::Cancel
+                                        : unsavedAnswers.takeFirst();
+    }
     QList<Message> messages, questions;
     QList<bool> answers;
+    QList<shell::UnsavedChoice> unsavedAnswers;
 };
 
 } // namespace arbolex::testing

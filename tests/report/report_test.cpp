@@ -4,6 +4,7 @@
 #include "workflow/mainwindowfixture.hpp"
 
 #include "charts/reportcontent.hpp"
+#include "document/documentwriter.hpp"
 #include "economics/pricedata.hpp"
 #include "report/chartexport.hpp"
 #include "report/reportwriter.hpp"
@@ -145,7 +146,25 @@ TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
     EXPECT_GE(pdfPages(pdf), 4);
     EXPECT_EQ(out, pdf + QStringLiteral("\t%1 pages\n").arg(pdfPages(pdf)));
 
+    // A sub-compartment saved by the windows, with its identification.
+    type(MainControl::txtNetArea, QStringLiteral("10"));
+    typeStand(QStringLiteral("40"));
+    logic.cmdGrow_Click();
+    logic.setIdentification(
+        {QStringLiteral("Kilbrack"), QStringLiteral("12"), QStringLiteral("b"), QString()});
+    const QString saved = path(QStringLiteral("kilbrack.arbolex"));
+    QString reason;
+    ASSERT_TRUE(document::writeDocumentFile(saved, logic.snapshot(), reason))
+        << reason.toStdString();
+    EXPECT_EQ(charts::reportContent(logic).forest, QStringLiteral("Kilbrack"));
+    EXPECT_EQ(run({saved, QStringLiteral("--out"), pdf}).first, 0);
+    EXPECT_EQ(pdfPages(pdf), 3) << "text, stand and increments: no cash flow yet";
+
     EXPECT_EQ(run({QStringLiteral("--script"), script}).first, 2) << "no --out";
+    EXPECT_EQ(run({saved, QStringLiteral("--script"), script, QStringLiteral("--out"), pdf}).first,
+              2)
+        << "a document or a script, not both";
+    EXPECT_EQ(run({path(QStringLiteral("none.arbolex")), QStringLiteral("--out"), pdf}).first, 2);
     EXPECT_EQ(run({QStringLiteral("--script"), path(QStringLiteral("none.txt")),
                    QStringLiteral("--out"), pdf})
                   .first,

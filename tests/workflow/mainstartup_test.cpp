@@ -1,7 +1,9 @@
 // The main window's load and unload: what a run leaves for the next one.
 #include "mainwindowfixture.hpp"
 
+#include "shell/datahistory.hpp"
 #include "shell/startupfile.hpp"
+#include "shell/testfiles.hpp"
 #include "shell/vbtext.hpp"
 #include "workflow/mainmessages.hpp"
 
@@ -94,6 +96,31 @@ TEST_F(MainStartupTest, MissingFilesStillStartWithDefaults) {
     typeStand();
     logic.cmdGrow_Click();
     EXPECT_EQ(logic.table().rowCount(), 9) << "the program works without its files";
+}
+
+// A missing first price file stops the reading, and the exit then writes the
+// empty lists over the good ones; the history brings them back.
+TEST_F(MainStartupTest, ListsLostThroughAMissingFileComeBackFromTheHistory) {
+    QTemporaryDir userDir;
+    const shell::DataHistory history(shell::DataHistory::folderIn(userDir.path()));
+    logic.attachDataHistory(&history);
+    const QString userPrices = dir.filePath(QStringLiteral("USRPRIC.qdm"));
+    const QByteArray goodList = readBytes(userPrices);
+    QFile::remove(dir.filePath(QStringLiteral("CURPRIC.qdm")));
+    logic.Form_Load(settings, kScreen);
+    logic.Form_Unload(settings);
+    ASSERT_NE(readBytes(userPrices), goodList) << "the exit wrote the empty list";
+
+    QString error;
+    for (const shell::KeptCopy &copy : history.copies()) {
+        if (copy.fileName == QStringLiteral("USRPRIC.qdm")) {
+            ASSERT_TRUE(history.restore(copy, dir.path(), error));
+            break;
+        }
+    }
+    EXPECT_EQ(readBytes(userPrices), goodList);
+    logic.reloadDataFiles();
+    EXPECT_GT(prices.data().userDefined[12], 0.0) << "the restored list is the one in memory";
 }
 
 TEST_F(MainStartupTest, ModelMenuKeepsRowsAndOffersThinningByModel) {

@@ -1,0 +1,48 @@
+#include "document/opendocument.hpp"
+
+#include "document/documentmessages.hpp"
+#include "document/documentreader.hpp"
+#include "shell/vbformat.hpp"
+#include "workflow/mainwindowlogic.hpp"
+
+#include <QFileInfo>
+
+namespace arbolex::document {
+
+bool openDocumentInto(const QString &path, workflow::MainWindowLogic &main, QString &fault) {
+    QString reason;
+    const std::optional<Document> document = readDocumentFile(path, reason);
+    if (!document) {
+        fault = text::openFault(QFileInfo(path).fileName(), reason);
+        return false;
+    }
+    main.restore(*document);
+    return true;
+}
+
+Document documentForStand(const workflow::MainWindowLogic &main, const rotation::Stand &stand,
+                          const SubCompartment &id, int targetAge, int step, double netArea) {
+    Document d = main.snapshot();
+    d.identification = id;
+    d.modelId = stand.model;
+    d.rows.clear();
+    d.currentRow = 0;
+    d.selectionEnd = 0;
+    d.standingVolume = 0.0;
+    d.felled = false;
+    d.cashFlow.clear();
+    d.siteIndex = 0.0f;
+    d.siteIndexText.clear();
+    // The fields as SetGrowFrom writes them.
+    d.fields = {shell::formatNumber(stand.age, u"##0"),
+                shell::formatNumber(stand.stocking, u"#####0"),
+                shell::formatNumber(stand.height, u"##0.0"),
+                shell::formatNumber(stand.basalArea, u"##0.00"),
+                QString(),
+                shell::formatNumber(targetAge, u"##0"),
+                shell::formatNumber(step, u"##0"),
+                netArea > 0.0 ? shell::generalNumber(netArea) : QString()};
+    return d;
+}
+
+} // namespace arbolex::document

@@ -1,0 +1,36 @@
+#pragma once
+
+// The documents for other parts of the program: the report command, the
+// estate's "open sub-compartment as a new document" and anything else that
+// reads or builds a sub-compartment without the File menu.
+
+#include "document/document.hpp"
+#include "rotation/rotation.hpp"
+
+#include <QString>
+
+namespace arbolex::workflow {
+class MainWindowLogic;
+}
+
+namespace arbolex::document {
+
+/// Reads the sub-compartment saved in `path` (a .arbolex file) and puts it
+/// into `main` exactly as it was saved: the table, the records, the cash flow,
+/// the prices in use and the identification; growing goes on from the last
+/// row as if the program had never closed. Works on a headless session as on
+/// the window. A file that cannot be taken changes nothing in `main` and
+/// leaves in `fault` the "FAULT - " message that names the file and what is
+/// wrong. Asks nothing: the caller decides about unsaved work first.
+bool openDocumentInto(const QString &path, workflow::MainWindowLogic &main, QString &fault);
+
+/// A new document for `stand` under `id`: the model and the grow-from fields
+/// of the stand as the window formats them, target age, step and net area,
+/// an empty table, and the prices and interest rate that `main` uses now.
+/// Restore it into a window (MainWindowLogic::restore), replay a regime
+/// through the window's handlers, then take MainWindowLogic::snapshot() to
+/// have the grown document.
+Document documentForStand(const workflow::MainWindowLogic &main, const rotation::Stand &stand,
+                          const SubCompartment &id, int targetAge, int step, double netArea);
+
+} // namespace arbolex::document

@@ -1,0 +1,29 @@
+#pragma once
+
+#include <QString>
+#include <QStringList>
+
+namespace arbolex::document {
+
+/// Which piece of ground a document describes: the forest, the compartment
+/// and the sub-compartment as the estate's maps name them, and a free note.
+/// It heads every report of the document.
+struct SubCompartment {
+    QString forest;
+    QString compartment;
+    QString subCompartment;
+    /// Free text: owner, species mix, anything the forester wants kept.
+    QString notes;
+
+    bool isEmpty() const {
+        return forest.isEmpty() && compartment.isEmpty() && subCompartment.isEmpty() &&
+               notes.isEmpty();
+    }
+    bool operator==(const SubCompartment &) const = default;
+
+    /// The lines that head a report: "Forest: Kilbrack", "Compartment: 12",
+    /// "Sub-compartment: b", then the note; a part left empty is left out.
+    QStringList heading() const;
+};
+
+} // namespace arbolex::document
