@@ -24,6 +24,7 @@
 #include "ui/npvwindow.hpp"
 #include "ui/qtclipboard.hpp"
 #include "ui/qtinteractive.hpp"
+#include "ui/reportmenu.hpp"
 #include "ui/thinwindow.hpp"
 #include "ui/timberpriceswindow.hpp"
 #include "ui/windowtexts.hpp"
