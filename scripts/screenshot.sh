@@ -107,3 +107,11 @@ shoot assort-user --no-intro --demo-assort user
 export WINDOW_TITLE=
 export SHOT="$out/main-assort-rows.png"
 shoot main-assort-rows --no-intro --demo-assort rows
+
+# Charts: a rotation thinned by 40 m³/ha at 25 and every 5 years until 45,
+# felled at 60, its cash flow computed with planting and cleaning costs; the
+# main window with each chart beside the table.
+for chart in stand increments cashflow; do
+    export SHOT="$out/charts-$chart.png"
+    shoot "charts-$chart" --no-intro --demo-charts --demo-chart-tab "$chart"
+done

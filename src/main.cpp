@@ -16,12 +16,15 @@
 #include "thinning/thinwindowlogic.hpp"
 #include "ui/assortuserwindow.hpp"
 #include "ui/assortwindow.hpp"
+#include "ui/chartpane.hpp"
+#include "ui/chartpanel.hpp"
 #include "ui/documentmenu.hpp"
 #include "ui/mainwindow.hpp"
 #include "ui/modelchoicedialog.hpp"
 #include "ui/npvwindow.hpp"
 #include "ui/qtclipboard.hpp"
 #include "ui/qtinteractive.hpp"
+#include "ui/reportmenu.hpp"
 #include "ui/thinwindow.hpp"
 #include "ui/timberpriceswindow.hpp"
 #include "ui/windowtexts.hpp"
@@ -89,6 +92,21 @@ bool demoThin(MainWindowLogic &logic, ThinWindowLogic &thin, const QString &stag
     return false;
 }
 
+/// Grows the stand of the rotation demonstrations (Sitka spruce, age 15, 2500
+/// stems/ha, 9 m, 22 m²/ha, 10 ha) to `to` by 5 years.
+void growRotationStand(MainWindowLogic &logic, const QString &to) {
+    logic.mnuModel_Click(0);
+    logic.typeText(MainControl::txtFromA, QStringLiteral("15"));
+    logic.typeText(MainControl::txtFromN, QStringLiteral("2500"));
+    logic.typeText(MainControl::txtFromH, QStringLiteral("9"));
+    logic.typeText(MainControl::txtFromB, QStringLiteral("22"));
+    logic.typeText(MainControl::txtFromD, QString());
+    logic.typeText(MainControl::txtNetArea, QStringLiteral("10"));
+    logic.typeText(MainControl::txtToA, to);
+    logic.typeText(MainControl::txtByA, QStringLiteral("5"));
+    logic.cmdGrow_Click();
+}
+
 /// The rotation demonstrations, from a Sitka spruce stand (age 15, 2500
 /// stems/ha, 9 m, 22 m²/ha, 10 ha) thinned by 50 m³/ha at 30 and grown to 60:
 ///   finalcut  the main window after the final cut;
@@ -102,16 +120,7 @@ bool demoRotation(MainWindowLogic &logic, ThinWindowLogic &thin,
         stage != QLatin1String("npv")) {
         return false;
     }
-    logic.mnuModel_Click(0);
-    logic.typeText(MainControl::txtFromA, QStringLiteral("15"));
-    logic.typeText(MainControl::txtFromN, QStringLiteral("2500"));
-    logic.typeText(MainControl::txtFromH, QStringLiteral("9"));
-    logic.typeText(MainControl::txtFromB, QStringLiteral("22"));
-    logic.typeText(MainControl::txtFromD, QString());
-    logic.typeText(MainControl::txtNetArea, QStringLiteral("10"));
-    logic.typeText(MainControl::txtToA, QStringLiteral("30"));
-    logic.typeText(MainControl::txtByA, QStringLiteral("5"));
-    logic.cmdGrow_Click();
+    growRotationStand(logic, QStringLiteral("30"));
     logic.cmdThin_Click();
     thin.typeText(ThinControl::txtRemV, QStringLiteral("50"));
     thin.press(ThinControl::cmdThin);
@@ -129,6 +138,47 @@ bool demoRotation(MainWindowLogic &logic, ThinWindowLogic &thin,
         npv.typeInCell(6, arbolex::economics::kCfCost, QStringLiteral("300"));
         npv.cmdNPV_Click();
     }
+    return true;
+}
+
+/// The chart demonstration: a Sitka spruce stand (age 15, 2500 stems/ha, 9 m,
+/// 22 m²/ha, 10 ha) thinned by 40 m³/ha at 25 and every 5 years until 45,
+/// grown to 60 and felled; its cash flow at 5 % with planting, cleaning and
+/// road costs, computed, and the NPV window closed. `chart` (stand,
+/// increments, cashflow) is the tab shown. False for an unknown chart.
+bool demoCharts(MainWindowLogic &logic, ThinWindowLogic &thin,
+                arbolex::economics::NpvWindowLogic &npv, arbolex::ui::MainWindow &window,
+                const QString &chart) {
+    using arbolex::ui::ChartPanel;
+    const QStringList tabs{QStringLiteral("stand"), QStringLiteral("increments"),
+                           QStringLiteral("cashflow")};
+    if (!tabs.contains(chart)) {
+        return false;
+    }
+    growRotationStand(logic, QStringLiteral("25"));
+    logic.cmdThin_Click();
+    thin.typeText(ThinControl::txtRemV, QStringLiteral("40"));
+    thin.press(ThinControl::cmdThin);
+    thin.press(ThinControl::chkActivLoop);
+    thin.typeText(ThinControl::txtThinFreq, QStringLiteral("5"));
+    thin.typeText(ThinControl::txtThinUntil, QStringLiteral("45"));
+    thin.press(ThinControl::cmdLoop);
+    thin.press(ThinControl::cmdCancel);
+    logic.typeText(MainControl::txtToA, QStringLiteral("60"));
+    logic.cmdGrow_Click();
+    logic.cmdFinalCut_Click();
+    logic.cmdNPV_Click();
+    using arbolex::economics::kCfCost;
+    using arbolex::economics::kCfOperation;
+    npv.typeInCell(1, kCfOperation, QStringLiteral("Planting"));
+    npv.typeInCell(1, kCfCost, QStringLiteral("2500"));
+    npv.typeInCell(3, kCfOperation, QStringLiteral("Cleaning"));
+    npv.typeInCell(3, kCfCost, QStringLiteral("400"));
+    npv.typeInCell(9, kCfOperation, QStringLiteral("Roads"));
+    npv.typeInCell(9, kCfCost, QStringLiteral("600"));
+    npv.cmdNPV_Click();
+    npv.cmdClose_Click();
+    window.chartPane()->panel()->setCurrent(static_cast<ChartPanel::Chart>(tabs.indexOf(chart)));
     return true;
 }
 
@@ -243,6 +293,10 @@ struct Options {
         parser.addOption(demoPrices);
         demoAssort.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(demoAssort);
+        demoCharts.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(demoCharts);
+        demoChartTab.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(demoChartTab);
         demoDocument.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(demoDocument);
         parser.addPositionalArgument(QStringLiteral("file"),
@@ -268,6 +322,11 @@ struct Options {
     QCommandLineOption demoPrices{QStringLiteral("demo-prices")};
     QCommandLineOption demoAssort{QStringLiteral("demo-assort"), QString(),
                                   QStringLiteral("STAGE")};
+    /// A rotation with thinnings, a final cut and a cash flow, for its charts.
+    QCommandLineOption demoCharts{QStringLiteral("demo-charts")};
+    /// The chart in view with --demo-charts: stand (the default), increments, cashflow.
+    QCommandLineOption demoChartTab{QStringLiteral("demo-chart-tab"), QString(),
+                                    QStringLiteral("CHART"), QStringLiteral("stand")};
     QCommandLineOption demoDocument{QStringLiteral("demo-document"), QString(),
                                     QStringLiteral("STAGE")};
     /// Ends the program once the main window is on screen: start-up is timed with it.
@@ -336,6 +395,8 @@ int main(int argc, char *argv[]) {
                                                 npvWindow, interactive, clipboard);
     npvWindow.attach(npvLogic);
     logic.attachNpv(&npvLogic);
+    QObject::connect(&npvWindow, &arbolex::ui::NpvWindow::cashFlowChanged, &window,
+                     &arbolex::ui::MainWindow::refreshCharts);
     logic.attachClipboard(&clipboard);
     // The timber prices window too opens over the main window.
     arbolex::ui::TimberPricesWindow pricesWindow(&window);
@@ -359,6 +420,7 @@ int main(int argc, char *argv[]) {
     // The sub-compartment as a document: the File menu, and the question
     // before the window closes on unsaved work.
     arbolex::ui::DocumentMenu documentMenu(window.fileMenu(), &window);
+    window.reportMenu()->addTo(*window.fileMenu());
     arbolex::document::DocumentController documents(logic, interactive, &settings, &documentMenu);
     documentMenu.attach(documents);
     window.setCloseCheck([&documents] { return documents.maySafelyDiscard(); });
@@ -376,6 +438,14 @@ int main(int argc, char *argv[]) {
         QTimer::singleShot(0, &window, [&logic, &thinLogic, &npvLogic, stage] {
             if (!demoRotation(logic, thinLogic, npvLogic, stage)) {
                 qWarning("unknown rotation demonstration: %s", qPrintable(stage));
+            }
+        });
+    } else if (parser.isSet(options.demoCharts)) {
+        const QString chart = parser.value(options.demoChartTab);
+        interactive.queueAnswer(true); // view the net present value
+        QTimer::singleShot(0, &window, [&, chart] {
+            if (!demoCharts(logic, thinLogic, npvLogic, window, chart)) {
+                qWarning("unknown chart demonstration: %s", qPrintable(chart));
             }
         });
     } else if (parser.isSet(options.demoAssort)) {

@@ -51,5 +51,7 @@ Command rotationCommand();
 Command optimiseCommand();
 Command uncertaintyCommand();
 Command estateCommand();
+/// Built only with the windows' libraries (ARBOLEX_WITH_REPORT): it draws charts.
+Command reportCommand();
 
 } // namespace arbolex::cli

@@ -5,8 +5,12 @@
 #include "shell/version.hpp"
 
 #include <QCoreApplication>
+#ifdef ARBOLEX_WITH_REPORT
+#include <QApplication>
+#endif
 
 #include <algorithm>
+#include <memory>
 #include <vector>
 
 namespace {
@@ -22,6 +26,9 @@ const std::vector<Command> &commands() {
         arbolex::cli::rotationCommand(),    arbolex::cli::optimiseCommand(),
         arbolex::cli::uncertaintyCommand(), arbolex::cli::estateCommand(),
         arbolex::cli::runCommand(),
+#ifdef ARBOLEX_WITH_REPORT
+        arbolex::cli::reportCommand(),
+#endif
     };
     return table;
 }
@@ -49,10 +56,26 @@ bool isHelp(const QString &word) {
     return word == QLatin1String("--help") || word == QLatin1String("-h");
 }
 
+/// The report draws its charts with Qt Charts, whose items are graphics
+/// widgets: that command alone runs a widget application, on the offscreen
+/// platform unless another is asked for, so it needs no screen. Every other
+/// command is a core application.
+std::unique_ptr<QCoreApplication> makeApplication(int &argc, char *argv[]) {
+#ifdef ARBOLEX_WITH_REPORT
+    if (argc > 1 && qstrcmp(argv[1], "report") == 0) {
+        if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM")) {
+            qputenv("QT_QPA_PLATFORM", "offscreen");
+        }
+        return std::make_unique<QApplication>(argc, argv);
+    }
+#endif
+    return std::make_unique<QCoreApplication>(argc, argv);
+}
+
 } // namespace
 
 int main(int argc, char *argv[]) {
-    QCoreApplication application(argc, argv);
+    const std::unique_ptr<QCoreApplication> application = makeApplication(argc, argv);
     QTextStream out(stdout);
     QTextStream err(stderr);
     arbolex::shell::nameProgram();

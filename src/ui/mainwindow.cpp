@@ -4,8 +4,10 @@
 #include "assortments/assortmessages.hpp"
 #include "document/documentmessages.hpp"
 #include "engine/catalogue.hpp"
+#include "ui/chartpane.hpp"
 #include "ui/groupheaderview.hpp"
 #include "ui/projectionmodel.hpp"
+#include "ui/reportmenu.hpp"
 #include "ui/restoredatadialog.hpp"
 #include "ui/stringgridmodel.hpp"
 #include "ui/windowtexts.hpp"
@@ -26,6 +28,7 @@
 #include <QMenuBar>
 #include <QMessageBox>
 #include <QPushButton>
+#include <QSplitter>
 #include <QStackedWidget>
 #include <QTableView>
 #include <QVBoxLayout>
@@ -50,6 +53,7 @@ constexpr int kSeparatorWidth = 10;
 
 MainWindow::MainWindow(QWidget *parent) : QMainWindow(parent) {
     setObjectName(QStringLiteral("frmMain"));
+    m_chartPane = new ChartPane(this);
     buildMenus();
 
     auto *central = new QWidget(this);
@@ -69,7 +73,14 @@ MainWindow::MainWindow(QWidget *parent) : QMainWindow(parent) {
     m_tables = new QStackedWidget(this);
     m_tables->addWidget(m_grid);
     m_tables->addWidget(m_summaryGrid);
-    layout->addWidget(m_tables, 1);
+    // The charts beside the table; the splitter sets their share of the width.
+    auto *beside = new QSplitter(Qt::Horizontal, this);
+    beside->setChildrenCollapsible(false);
+    beside->addWidget(m_tables);
+    beside->addWidget(m_chartPane);
+    beside->setStretchFactor(0, 3);
+    beside->setStretchFactor(1, 2);
+    layout->addWidget(beside, 1);
     layout->setSpacing(6);
     setCentralWidget(central);
 }
@@ -94,6 +105,12 @@ void MainWindow::attach(workflow::MainWindowLogic &logic, QSettings &settings) {
     m_summaryModel->setGroups([&logic] { return logic.summaryGroups(); });
     // Totals follow the rows of the start, the thinnings and the final cut.
     m_summaryGrid->setModel(m_summaryModel);
+    m_chartPane->attach(logic);
+    m_reportMenu->attach(logic);
+}
+
+void MainWindow::refreshCharts() {
+    m_chartPane->refreshSoon();
 }
 
 void MainWindow::SetModelFromfrmModelChoice(int modelId) {
@@ -106,6 +123,7 @@ void MainWindow::SetModelFromfrmModelChoice(int modelId) {
 
 void MainWindow::buildMenus() {
     m_fileMenu = menuBar()->addMenu(document::text::menuFile());
+    m_reportMenu = new ReportMenu(*this);
     QMenu *models = menuBar()->addMenu(text::menuModel());
     models->setObjectName(QStringLiteral("mnuModel"));
     models->setToolTipsVisible(true);
@@ -142,6 +160,8 @@ void MainWindow::buildMenus() {
             m_logic->cmdDeleteRows_Click();
         }
     });
+    QMenu *view = menuBar()->addMenu(text::menuView());
+    view->addAction(m_chartPane->toggleViewAction());
     QMenu *assortMenu = menuBar()->addMenu(assortments::text::menuAssortments());
     m_assortUserAction = assortMenu->addAction(assortments::text::userMenu());
     m_assortUserAction->setObjectName(QStringLiteral("mnuAssortUser"));
@@ -482,6 +502,7 @@ void MainWindow::tableChanged(int firstRow) {
         return;
     }
     m_model->refresh(firstRow);
+    m_chartPane->refreshSoon();
     // Rewritten rows (a final cut) may hold wider numbers than before.
     fitColumns();
     selectionFromLogic();

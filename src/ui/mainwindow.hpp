@@ -26,7 +26,9 @@ class MainWindowLogic;
 
 namespace arbolex::ui {
 
+class ChartPane;
 class ProjectionModel;
+class ReportMenu;
 class StringGridModel;
 
 /// The main window `frmMain`: the grow-from panel, the commands, the
@@ -64,6 +66,11 @@ public:
     void setCloseCheck(std::function<bool()> check) { m_closeCheck = std::move(check); }
     /// The entry `mnuAssortUser` that opens the user categories window.
     QAction *assortUserAction() const { return m_assortUserAction; }
+    /// The charts beside the table, and the report entries of the File menu.
+    ChartPane *chartPane() const { return m_chartPane; }
+    ReportMenu *reportMenu() const { return m_reportMenu; }
+    /// Draws the charts again (the cash flow changed in its own window).
+    void refreshCharts();
 
     // IMainView
     QString text(workflow::MainControl control) const override;
@@ -117,6 +124,8 @@ private:
     std::function<bool()> m_closeCheck;
     QActionGroup *m_modelActions = nullptr;
     QAction *m_assortUserAction = nullptr;
+    ChartPane *m_chartPane = nullptr;
+    ReportMenu *m_reportMenu = nullptr;
     QTableView *m_grid = nullptr;
     ProjectionModel *m_model = nullptr;
     QTableView *m_summaryGrid = nullptr;

@@ -155,6 +155,7 @@ void NpvWindow::gridChanged() {
     if (m_model == nullptr) {
         return;
     }
+    emit cashFlowChanged();
     const bool reset = m_model->rowCount() != static_cast<int>(m_logic->grid().size()) - 1;
     m_model->refresh();
     if (reset) {

@@ -44,6 +44,10 @@ public:
     void close() override;
     bool isShown() const override;
 
+signals:
+    /// The cash flow's texts changed: a computation, typing, another rotation.
+    void cashFlowChanged();
+
 protected:
     bool eventFilter(QObject *watched, QEvent *event) override;
 

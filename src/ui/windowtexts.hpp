@@ -327,4 +327,18 @@ inline QString introSequencePicture(int n) {
     return QStringLiteral("SpruceImages/Spruce_0") + QString::number(n) + QStringLiteral(".jpg");
 }
 
+// The report entries of the File menu, and the View menu
+inline QString menuExportReport() {
+    return QStringLiteral("Export &Report…");
+}
+inline QString menuPrint() {
+    return QStringLiteral("&Print…");
+}
+inline QString filterPdf() {
+    return QStringLiteral("PDF document (*.pdf)");
+}
+inline QString menuView() {
+    return QStringLiteral("&View");
+}
+
 } // namespace arbolex::ui::text

@@ -3,6 +3,7 @@
 #include "shell/apperror.hpp"
 #include "shell/vbformat.hpp"
 #include "shell/vbtext.hpp"
+#include "workflow/incrementrows.hpp"
 #include "workflow/mainmessages.hpp"
 #include "workflow/mainwindowlogic.hpp"
 #include "workflow/standmath.hpp"
@@ -161,17 +162,8 @@ void MainWindowLogic::AppendGrid(RowKind kind, const QString &label) {
 
 int MainWindowLogic::yieldClass() const {
     std::vector<double> mai;
-    double lastAge = -1.0;
-    for (int r = 1; r <= m_table.lastRow(); ++r) {
-        const TableRow &row = m_table.row(r);
-        // Only rows that carry an increment of their own take part, one per
-        // age: a thinning row, or a final cut after a thinning, repeats the
-        // MAI of the growth row at its age.
-        if ((row.kind == RowKind::Growth || row.kind == RowKind::Failed) &&
-            row.numbers[kNumAge] != lastAge) {
-            mai.push_back(row.numbers[kNumMai]);
-            lastAge = row.numbers[kNumAge];
-        }
+    for (const int r : incrementRows(m_table)) {
+        mai.push_back(m_table.row(r).numbers[kNumMai]);
     }
     return workflow::yieldClass(mai);
 }

@@ -1,0 +1,71 @@
+#pragma once
+
+// Everything a printed report of one sub-compartment shows, gathered from the
+// main window's logic as plain texts and chart data, so that the PDF, the
+// printer and the command-line program print the same thing.
+
+#include "charts/chartdata.hpp"
+
+#include <QString>
+#include <QStringList>
+
+#include <utility>
+#include <vector>
+
+namespace arbolex::workflow {
+class MainWindowLogic;
+}
+
+namespace arbolex::charts {
+
+/// A table as printed: its captions, the group above each caption (may be
+/// empty) and its rows.
+struct ReportTable {
+    QStringList captions;
+    QStringList groups;
+    std::vector<QStringList> rows;
+
+    bool empty() const { return rows.empty(); }
+};
+
+struct ReportContent {
+    /// Identification of the sub-compartment (the document's); empty fields
+    /// are left out.
+    QString forest;
+    QString compartment;
+    QString subCompartment;
+    QString description;
+
+    /// The growth model in use ("SS Thinned …").
+    QString modelLabel;
+    /// The grow-from values and the net area as typed: caption, value.
+    std::vector<std::pair<QString, QString>> inputs;
+    QString siteIndex;
+    QString yieldClass;
+
+    ReportTable projection;
+    ReportTable summary;
+    /// The cash flow year by year; empty when the rotation has none.
+    ReportTable cashFlow;
+    QString netPresentValue; ///< euro per ha, as the NPV window shows it
+    QString interestRate;    ///< percent
+
+    ChartData standChart;
+    ChartData incrementChart;
+    ChartData cashFlowChart;
+};
+
+/// The report of what the main window holds now. The summary is filled
+/// afresh (the window goes on showing what it showed) and the cash flow is
+/// computed on a copy with the costs and revenues typed so far.
+ReportContent reportContent(workflow::MainWindowLogic &logic);
+
+/// The three charts of the main window now (the panel beside the table).
+struct RotationCharts {
+    ChartData stand;
+    ChartData increments;
+    ChartData cashFlow;
+};
+RotationCharts rotationCharts(workflow::MainWindowLogic &logic);
+
+} // namespace arbolex::charts

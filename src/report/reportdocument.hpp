@@ -1,0 +1,21 @@
+#pragma once
+
+// The text part of the report as HTML for a QTextDocument: the title block,
+// the stand at the start, the projection table, the summary and the cash
+// flow. Tables carry their captions in a header that every page repeats.
+
+#include "charts/reportcontent.hpp"
+
+#include <QString>
+
+namespace arbolex::report {
+
+/// The report's text as HTML; `printed` is the date and time shown in the
+/// title block.
+QString reportHtml(const charts::ReportContent &content, const QString &printed);
+
+/// One table as HTML: the groups (when any) over the captions in the header,
+/// then the rows.
+QString tableHtml(const charts::ReportTable &table);
+
+} // namespace arbolex::report

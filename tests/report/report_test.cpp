@@ -1,0 +1,176 @@
+// The printed report and the exported charts, made without a screen: what
+// the report carries, the pages of the PDF, the files of a chart, and the
+// command-line report.
+#include "workflow/mainwindowfixture.hpp"
+
+#include "charts/reportcontent.hpp"
+#include "document/documentwriter.hpp"
+#include "economics/pricedata.hpp"
+#include "report/chartexport.hpp"
+#include "report/reportwriter.hpp"
+
+#include <QDir>
+#include <QImage>
+#include <QProcess>
+#include <QRegularExpression>
+
+namespace arbolex::testing {
+namespace {
+
+/// Pages of a PDF file: its page objects.
+int pdfPages(const QString &path) {
+    QFile file(path);
+    if (!file.open(QIODevice::ReadOnly)) {
+        return -1;
+    }
+    const QString pdf = QString::fromLatin1(file.readAll());
+    if (!pdf.startsWith(QLatin1String("%PDF"))) {
+        return -1;
+    }
+    return static_cast<int>(pdf.count(QRegularExpression(QStringLiteral("/Type\\s*/Page\\b"))));
+}
+
+/// A Sitka spruce stand grown from 15 to 60 on 10 ha and felled, its net
+/// present value accepted.
+class ReportTest : public MainWindowTest {
+protected:
+    ReportTest() {
+        economics::GetPricesFromFiles(QStringLiteral(ARBOLEX_DATA_SOURCE), prices.data(), log);
+    }
+
+    void closeRotation() {
+        typeStand(QStringLiteral("60"));
+        type(MainControl::txtNetArea, QStringLiteral("10"));
+        logic.cmdGrow_Click();
+        logic.cmdFinalCut_Click(); // the fake answers Yes to the NPV question
+    }
+
+    QString path(const QString &name) const { return QDir(dir.path()).filePath(name); }
+};
+
+TEST_F(ReportTest, ContentCarriesTheRotationAndLeavesTheWindowAsItWas) {
+    closeRotation();
+    const charts::ReportContent content = charts::reportContent(logic);
+    EXPECT_EQ(content.projection.rows.size(), static_cast<std::size_t>(logic.table().lastRow()));
+    EXPECT_EQ(content.projection.captions.size(), content.projection.groups.size());
+    EXPECT_FALSE(content.summary.empty());
+    EXPECT_FALSE(logic.showingSummary()) << "the report fills the summary behind the scenes";
+    // The group row names the group: captions do not repeat it.
+    EXPECT_EQ(content.projection.captions.count(QStringLiteral("N/ha")), 3);
+    ASSERT_EQ(content.cashFlow.rows.size(), 1U) << "only the year of the final cut earns";
+    EXPECT_EQ(content.cashFlow.rows[0].first(), QStringLiteral("60"));
+    EXPECT_FALSE(content.netPresentValue.isEmpty());
+    EXPECT_EQ(content.interestRate, QStringLiteral("5.00"));
+    EXPECT_EQ(content.yieldClass, view.text(MainControl::lblYC));
+    // The stand the projection started from, whatever the fields show now.
+    EXPECT_EQ(content.inputs.front().second, QStringLiteral("15"));
+    EXPECT_FALSE(content.standChart.empty());
+    // A culmination is marked exactly when the window shows a yield class.
+    EXPECT_EQ(content.incrementChart.marks.empty(), content.yieldClass == QStringLiteral("0"));
+    EXPECT_FALSE(content.cashFlowChart.empty());
+}
+
+TEST_F(ReportTest, PdfHoldsTheTextPagesThenOnePagePerChart) {
+    closeRotation();
+    const QString pdf = path(QStringLiteral("report.pdf"));
+    const int pages =
+        report::writeReportPdf(charts::reportContent(logic), pdf, QStringLiteral("today"));
+    EXPECT_GE(pages, 4); // at least one page of text and the three charts
+    EXPECT_EQ(pdfPages(pdf), pages);
+
+    // Before the final cut there is no cash flow and no chart of it.
+    logic.cmdClear_Click();
+    typeStand(QStringLiteral("30"));
+    logic.cmdGrow_Click();
+    const charts::ReportContent young = charts::reportContent(logic);
+    EXPECT_TRUE(young.cashFlow.empty());
+    EXPECT_TRUE(young.cashFlowChart.empty());
+    EXPECT_EQ(pdfPages(pdf), pages) << "unchanged until written again";
+    const int youngPages = report::writeReportPdf(young, pdf, QStringLiteral("today"));
+    EXPECT_EQ(pdfPages(pdf), youngPages);
+    EXPECT_EQ(youngPages, 3) << "one page of text, stand and increments";
+}
+
+TEST_F(ReportTest, UnwritableFilesAreRefused) {
+    closeRotation();
+    const charts::ReportContent content = charts::reportContent(logic);
+    const QString nowhere = path(QStringLiteral("no-such-folder/file"));
+    EXPECT_EQ(report::writeReportPdf(content, nowhere + QStringLiteral(".pdf"), QString()), 0);
+    EXPECT_FALSE(report::saveChartPng(content.standChart, nowhere + QStringLiteral(".png"),
+                                      QSize(400, 300)));
+    EXPECT_FALSE(report::saveChartSvg(content.standChart, nowhere + QStringLiteral(".svg"),
+                                      QSize(400, 300)));
+}
+
+TEST_F(ReportTest, ChartsExportAsPngAndSvg) {
+    closeRotation();
+    const charts::ReportContent content = charts::reportContent(logic);
+    const QString png = path(QStringLiteral("stand.png"));
+    ASSERT_TRUE(report::saveChartPng(content.standChart, png, QSize(640, 420)));
+    const QImage image(png);
+    EXPECT_EQ(image.size(), QSize(1280, 840)) << "twice the size, sharp in print";
+    const QString svg = path(QStringLiteral("cash.svg"));
+    ASSERT_TRUE(report::saveChartSvg(content.cashFlowChart, svg, QSize(640, 420)));
+    QFile file(svg);
+    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
+    const QString drawing = QString::fromUtf8(file.readAll());
+    EXPECT_TRUE(drawing.contains(QLatin1String("<svg")));
+    EXPECT_TRUE(drawing.contains(QLatin1String("<path"))) << "lines stay vectors";
+}
+
+#ifdef ARBOLEX_CLI_PATH
+TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
+    ASSERT_TRUE(copyShippedData(dir.path()));
+    const QString script = path(QStringLiteral("rotation.txt"));
+    QFile file(script);
+    ASSERT_TRUE(file.open(QIODevice::WriteOnly));
+    file.write("model 0\nset txtFromA 15\nset txtFromN 2500\nset txtFromH 7\n"
+               "set txtFromB 20\nset txtNetArea 10\nset txtToA 60\nset txtByA 5\n"
+               "press cmdGrow\nanswer yes\npress cmdFinalCut\n");
+    file.close();
+    const QString pdf = path(QStringLiteral("cli.pdf"));
+    const auto run = [&](const QStringList &arguments) {
+        QProcess process;
+        QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+        environment.remove(QStringLiteral("QT_QPA_PLATFORM")); // it must not need a screen
+        process.setProcessEnvironment(environment);
+        process.start(QStringLiteral(ARBOLEX_CLI_PATH),
+                      QStringList{QStringLiteral("report")} + arguments +
+                          QStringList{QStringLiteral("--data-dir"), dir.path()});
+        EXPECT_TRUE(process.waitForFinished(60000));
+        return std::pair{process.exitCode(), QString::fromUtf8(process.readAllStandardOutput())};
+    };
+    const auto [status, out] =
+        run({QStringLiteral("--script"), script, QStringLiteral("--out"), pdf});
+    ASSERT_EQ(status, 0) << out.toStdString();
+    EXPECT_GE(pdfPages(pdf), 4);
+    EXPECT_EQ(out, pdf + QStringLiteral("\t%1 pages\n").arg(pdfPages(pdf)));
+
+    // A sub-compartment saved by the windows, with its identification.
+    type(MainControl::txtNetArea, QStringLiteral("10"));
+    typeStand(QStringLiteral("40"));
+    logic.cmdGrow_Click();
+    logic.setIdentification(
+        {QStringLiteral("Kilbrack"), QStringLiteral("12"), QStringLiteral("b"), QString()});
+    const QString saved = path(QStringLiteral("kilbrack.arbolex"));
+    QString reason;
+    ASSERT_TRUE(document::writeDocumentFile(saved, logic.snapshot(), reason))
+        << reason.toStdString();
+    EXPECT_EQ(charts::reportContent(logic).forest, QStringLiteral("Kilbrack"));
+    EXPECT_EQ(run({saved, QStringLiteral("--out"), pdf}).first, 0);
+    EXPECT_EQ(pdfPages(pdf), 3) << "text, stand and increments: no cash flow yet";
+
+    EXPECT_EQ(run({QStringLiteral("--script"), script}).first, 2) << "no --out";
+    EXPECT_EQ(run({saved, QStringLiteral("--script"), script, QStringLiteral("--out"), pdf}).first,
+              2)
+        << "a document or a script, not both";
+    EXPECT_EQ(run({path(QStringLiteral("none.arbolex")), QStringLiteral("--out"), pdf}).first, 2);
+    EXPECT_EQ(run({QStringLiteral("--script"), path(QStringLiteral("none.txt")),
+                   QStringLiteral("--out"), pdf})
+                  .first,
+              2);
+}
+#endif
+
+} // namespace
+} // namespace arbolex::testing
