@@ -10,6 +10,7 @@
 #include "thinning/thinwindowlogic.hpp"
 #include "workflow/mainwindowlogic.hpp"
 
+#include <algorithm>
 #include <cmath>
 
 namespace arbolex::economics {
@@ -20,7 +21,7 @@ using C = EconomicsControl;
 namespace {
 
 /// Grow step of the replay when the main window's field holds none, years.
-constexpr int kDefaultStep = 5;
+constexpr double kDefaultStep = 5.0;
 
 /// Drives the thinning window as the thinning loop does: the window is loaded
 /// and filled without being shown, and no loop is offered.
@@ -42,8 +43,10 @@ private:
 std::optional<QString> replay(workflow::MainWindowLogic &main, thinning::ThinWindowLogic &thin,
                               const rotation::Stand &stand, const rotation::Regime &regime,
                               int rotation) {
-    const QString typedStep = main.view().text(MainControl::txtByA);
-    const QString step = shell::val(typedStep) >= 1.0 ? typedStep : QString::number(kDefaultStep);
+    const double typedStep = shell::val(main.view().text(MainControl::txtByA));
+    const double step = typedStep >= 1.0 ? typedStep : kDefaultStep;
+    // Whole years: the grow command moves the start to the nearest one.
+    int grownTo = static_cast<int>(std::nearbyint(stand.age));
     main.cmdClear_Click();
     main.typeText(MainControl::txtFromA, shell::singleText(stand.age));
     main.typeText(MainControl::txtFromN, shell::singleText(stand.stocking));
@@ -52,7 +55,9 @@ std::optional<QString> replay(workflow::MainWindowLogic &main, thinning::ThinWin
     main.typeText(MainControl::txtFromD, QString());
     const auto growTo = [&](int age) -> std::optional<QString> {
         main.typeText(MainControl::txtToA, QString::number(age));
-        main.typeText(MainControl::txtByA, step);
+        // A step fits in the span it divides, as the grow command asks.
+        main.typeText(MainControl::txtByA,
+                      shell::generalNumber(std::min(step, static_cast<double>(age - grownTo))));
         main.cmdGrow_Click();
         const workflow::ProjectionTable &table = main.table();
         if (table.empty() || !table.row(table.lastRow()).isGrowth() ||
@@ -60,6 +65,7 @@ std::optional<QString> replay(workflow::MainWindowLogic &main, thinning::ThinWin
             return QStringLiteral("the stand could not be grown to ") + QString::number(age) +
                    QStringLiteral(" years.");
         }
+        grownTo = age;
         return std::nullopt;
     };
     if (regime.thins()) {

@@ -20,13 +20,18 @@ protected:
     /// then grows to `finalCut` and fells there (0: no final cut).
     void typeRotation(const std::vector<int> &ages, const std::vector<QString> &volumes,
                       int finalCut) {
+        // A step of 5 years, or the whole span when it is shorter.
+        const auto growTo = [&](int from, int to) {
+            type(MainControl::txtToA, QString::number(to));
+            type(MainControl::txtByA, QString::number(std::min(5, to - from)));
+            logic.cmdGrow_Click();
+        };
         logic.cmdClear_Click();
-        typeStand(QString::number(ages.front()));
-        logic.cmdGrow_Click();
+        typeStand();
+        growTo(15, ages.front());
         for (std::size_t i = 0; i < ages.size(); ++i) {
             if (i > 0) {
-                type(MainControl::txtToA, QString::number(ages[i]));
-                logic.cmdGrow_Click();
+                growTo(ages[i - 1], ages[i]);
                 interactive.answers.append(false); // no thinning loop
             }
             logic.cmdThin_Click();
@@ -35,8 +40,7 @@ protected:
             thin.cmdAccept_Click();
         }
         if (finalCut > 0) {
-            type(MainControl::txtToA, QString::number(finalCut));
-            logic.cmdGrow_Click();
+            growTo(ages.back(), finalCut);
             logic.cmdFinalCut_Click();
         }
     }
