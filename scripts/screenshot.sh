@@ -107,3 +107,13 @@ shoot assort-user --no-intro --demo-assort user
 export WINDOW_TITLE=
 export SHOT="$out/main-assort-rows.png"
 shoot main-assort-rows --no-intro --demo-assort rows
+# Economics: the economics window on the rotation above at 3 % with costs of
+# establishment and upkeep: the value of the regime and NPV, LEV and MAI by
+# rotation age, the optimiser's five best regimes, the best of them applied to
+# the table, the tornado and the Monte Carlo histogram.
+export WINDOW_TITLE="Economics of the rotation"
+for stage in rotation optimiser applied sensitivity montecarlo; do
+    export SHOT="$out/economics-$stage.png"
+    rm -f "${SHOT%.png}-window.png"
+    shoot "economics-$stage" --no-intro --demo-economics "$stage"
+done

@@ -3,6 +3,7 @@
 // the user choose the model in the model choice window.
 #include "assortments/assortuserlogic.hpp"
 #include "assortments/assortwindowlogic.hpp"
+#include "economics/economicswindowlogic.hpp"
 #include "economics/npvwindowlogic.hpp"
 #include "economics/prices.hpp"
 #include "economics/timberpriceswindowlogic.hpp"
@@ -14,6 +15,7 @@
 #include "thinning/thinwindowlogic.hpp"
 #include "ui/assortuserwindow.hpp"
 #include "ui/assortwindow.hpp"
+#include "ui/economicswindow.hpp"
 #include "ui/mainwindow.hpp"
 #include "ui/modelchoicedialog.hpp"
 #include "ui/npvwindow.hpp"
@@ -27,8 +29,10 @@
 #include <QAction>
 #include <QApplication>
 #include <QCommandLineParser>
+#include <QPushButton>
 #include <QScreen>
 #include <QSettings>
+#include <QTabWidget>
 #include <QTimer>
 
 namespace {
@@ -181,6 +185,42 @@ bool demoAssort(MainWindowLogic &logic, ThinWindowLogic &thin,
     return false;
 }
 
+/// The economics demonstrations, on the rotation of demoRotation's final cut
+/// valued at 3 % with 1,800 €/ha to establish and 15 €/ha a year:
+///   rotation     the value of the regime and NPV, LEV and MAI by rotation age;
+///   optimiser    the optimiser's five best regimes;
+///   applied      the best of them applied to the projection table;
+///   sensitivity  the tornado of NPV and LEV;
+///   montecarlo   the Monte Carlo draws of NPV.
+/// False for an unknown stage.
+bool demoEconomics(MainWindowLogic &logic, ThinWindowLogic &thin,
+                   arbolex::economics::NpvWindowLogic &npv,
+                   arbolex::economics::EconomicsWindowLogic &economics,
+                   arbolex::ui::EconomicsWindow &window, const QString &stage) {
+    using arbolex::economics::EconomicsControl;
+    const QStringList stages = {QStringLiteral("rotation"), QStringLiteral("optimiser"),
+                                QStringLiteral("sensitivity"), QStringLiteral("montecarlo"),
+                                QStringLiteral("applied")};
+    if (!stages.contains(stage)) {
+        return false;
+    }
+    demoRotation(logic, thin, npv, QStringLiteral("finalcut"));
+    // The window keeps the costs typed; the rate is the cash flow's.
+    economics.typeText(EconomicsControl::txtEstablishmentCost, QStringLiteral("1800"));
+    economics.typeText(EconomicsControl::txtAnnualCost, QStringLiteral("15"));
+    logic.cashFlow().setInterestRate(3.0);
+    economics.cmdEconomics_Click();
+    const int tab = stage == QLatin1String("applied") ? 1 : static_cast<int>(stages.indexOf(stage));
+    window.tabs()->setCurrentIndex(std::min(tab, 3));
+    if (stage == QLatin1String("optimiser") || stage == QLatin1String("applied")) {
+        economics.cmdOptimise_Click();
+    }
+    if (stage == QLatin1String("applied")) {
+        QTimer::singleShot(2500, &window, [&economics] { economics.cmdApply_Click(1); });
+    }
+    return true;
+}
+
 /// The options of the command line.
 struct Options {
     explicit Options(QCommandLineParser &parser) {
@@ -199,6 +239,8 @@ struct Options {
         parser.addOption(demoPrices);
         demoAssort.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(demoAssort);
+        demoEconomics.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(demoEconomics);
         quitWhenShown.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(quitWhenShown);
     }
@@ -219,6 +261,8 @@ struct Options {
     QCommandLineOption demoPrices{QStringLiteral("demo-prices")};
     QCommandLineOption demoAssort{QStringLiteral("demo-assort"), QString(),
                                   QStringLiteral("STAGE")};
+    QCommandLineOption demoEconomics{QStringLiteral("demo-economics"), QString(),
+                                     QStringLiteral("STAGE")};
     /// Ends the program once the main window is on screen: start-up is timed with it.
     QCommandLineOption quitWhenShown{QStringLiteral("quit-when-shown")};
 };
@@ -299,6 +343,13 @@ int main(int argc, char *argv[]) {
     assortUserWindow.attach(assortUserLogic);
     QObject::connect(window.assortUserAction(), &QAction::triggered, &window,
                      [&assortUserLogic] { assortUserLogic.mnuAssortUser_Click(); });
+    // The economics window opens from the main window's "Economics…" beside NPV.
+    arbolex::ui::EconomicsWindow economicsWindow(&window);
+    arbolex::economics::EconomicsWindowLogic economicsLogic(logic, thinLogic, economicsWindow,
+                                                            interactive);
+    economicsWindow.attach(economicsLogic);
+    QObject::connect(window.economicsButton(), &QPushButton::clicked, &window,
+                     [&economicsLogic] { economicsLogic.cmdEconomics_Click(); });
     logic.Form_Load(settings, QGuiApplication::primaryScreen()->availableGeometry());
 
     if (parser.isSet(options.demoRotation)) {
@@ -309,6 +360,16 @@ int main(int argc, char *argv[]) {
         QTimer::singleShot(0, &window, [&logic, &thinLogic, &npvLogic, stage] {
             if (!demoRotation(logic, thinLogic, npvLogic, stage)) {
                 qWarning("unknown rotation demonstration: %s", qPrintable(stage));
+            }
+        });
+    } else if (parser.isSet(options.demoEconomics)) {
+        const QString stage = parser.value(options.demoEconomics);
+        interactive.queueAnswer(true); // the final cut's offer of the net present value
+        interactive.queueAnswer(true); // and again after Apply
+        QTimer::singleShot(0, &window, [&, stage] {
+            if (!demoEconomics(logic, thinLogic, npvLogic, economicsLogic, economicsWindow,
+                               stage)) {
+                qWarning("unknown economics demonstration: %s", qPrintable(stage));
             }
         });
     } else if (parser.isSet(options.demoAssort)) {

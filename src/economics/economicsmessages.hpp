@@ -112,7 +112,17 @@ inline QString figureEconomic() {
     return QStringLiteral("Economic rotation");
 }
 inline QString figureMai() {
-    return QStringLiteral("Mean annual increment at the final cut");
+    return QStringLiteral("MAI at the final cut");
+}
+/// What the figures mean, in a forester's words, under them.
+inline QString figureNotes() {
+    return QStringLiteral(
+        "NPV: the stand's cash flows from today to the final cut, discounted to today. "
+        "LEV: bare land planted now and managed this way for ever. Annuity: the LEV as a "
+        "yearly rent. Forest value: the NPV and, after the final cut, the land's LEV. "
+        "IRR: the rate at which planting just pays. Break-even: the share of today's timber "
+        "prices at which the LEV is 0. Timber at long-term average standing prices; money "
+        "per hectare.");
 }
 inline QString figureYieldClass() {
     return QStringLiteral("Yield class");

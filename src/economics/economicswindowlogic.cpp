@@ -39,7 +39,7 @@ bool sameMoney(const rotation::Economics &a, const rotation::Economics &b) {
 QString irrText(const valuation::InternalRate &irr) {
     switch (irr.outcome) {
     case valuation::IrrOutcome::kRoot:
-        return percentText(irr.ratePercent) + QStringLiteral(" % a year");
+        return quantityText(irr.ratePercent, 2) + QStringLiteral(" % a year");
     case valuation::IrrOutcome::kNoSignChange:
         return text::irrNoSignChange();
     case valuation::IrrOutcome::kNoRoot:

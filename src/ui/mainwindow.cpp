@@ -2,6 +2,7 @@
 #include "ui/fieldinput.hpp"
 
 #include "assortments/assortmessages.hpp"
+#include "economics/economicsmessages.hpp"
 #include "engine/catalogue.hpp"
 #include "ui/groupheaderview.hpp"
 #include "ui/projectionmodel.hpp"
@@ -276,6 +277,12 @@ QWidget *MainWindow::buildPanel() {
     QPushButton *prices =
         addButton(MainControl::cmdShowTimberPrice, workflow::text::showTimberPrices());
     commands->addWidget(prices, 4, 1);
+    // Beside NPV: the value of the rotation, its best age, the optimiser and
+    // the uncertainty, in a window of its own.
+    m_economicsButton = new QPushButton(economics::text::buttonEconomics(), this);
+    m_economicsButton->setObjectName(QStringLiteral("cmdEconomics"));
+    m_economicsButton->setToolTip(economics::text::hintEconomics());
+    commands->addWidget(m_economicsButton, 5, 1);
     connect(prices, &QPushButton::clicked, this, [this] {
         if (m_logic != nullptr) {
             m_logic->cmdShowTimberPrice_Click();

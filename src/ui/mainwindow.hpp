@@ -49,6 +49,8 @@ public:
     QActionGroup *modelMenu() const { return m_modelActions; }
     /// The entry `mnuAssortUser` that opens the user categories window.
     QAction *assortUserAction() const { return m_assortUserAction; }
+    /// The button "Economics…" that opens the economics window.
+    QPushButton *economicsButton() const { return m_economicsButton; }
 
     // IMainView
     QString text(workflow::MainControl control) const override;
@@ -98,6 +100,7 @@ private:
 
     QActionGroup *m_modelActions = nullptr;
     QAction *m_assortUserAction = nullptr;
+    QPushButton *m_economicsButton = nullptr;
     QTableView *m_grid = nullptr;
     ProjectionModel *m_model = nullptr;
     QTableView *m_summaryGrid = nullptr;
