@@ -403,5 +403,6 @@ int main(int argc, char *argv[]) {
         }
     }
     app.exec();
+    economicsWindow.waitForWork();
     return 0;
 }

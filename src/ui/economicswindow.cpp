@@ -119,6 +119,12 @@ EconomicsWindow::EconomicsWindow(QWidget *main) : QDialog(main) {
 
 EconomicsWindow::~EconomicsWindow() {
     if (m_worker != nullptr) {
+        m_worker->wait();
+    }
+}
+
+void EconomicsWindow::waitForWork() {
+    if (m_worker != nullptr) {
         if (m_logic != nullptr) {
             m_logic->cmdCancel_Click();
         }

@@ -38,6 +38,9 @@ public:
 
     QWidget *control(economics::EconomicsControl control) const;
     QTabWidget *tabs() const { return m_tabs; }
+    /// Cancels the optimiser if it runs and waits for its thread: called
+    /// before the logic goes, since the search reads the logic's Cancel.
+    void waitForWork();
 
     // IEconomicsView
     using QDialog::setEnabled;
