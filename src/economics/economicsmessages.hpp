@@ -207,15 +207,28 @@ inline QString seriesHigh() {
 /// Headers of the optimiser's table, in order.
 inline QStringList regimeHeaders() {
     return {QStringLiteral("Rank"),
-            QStringLiteral("First thinning (age)"),
-            QStringLiteral("Every (years)"),
-            QStringLiteral("Volume (m³/ha)"),
-            QStringLiteral("Last thinning (age)"),
-            QStringLiteral("Rotation (years)"),
-            QStringLiteral("LEV (€/ha)"),
-            QStringLiteral("NPV (€/ha)"),
-            QStringLiteral("Production (m³/ha)"),
-            QStringLiteral("Gain in LEV (€/ha)")};
+            QStringLiteral("First thinning\n(age)"),
+            QStringLiteral("Every\n(years)"),
+            QStringLiteral("Volume\n(m³/ha)"),
+            QStringLiteral("Last thinning\n(age)"),
+            QStringLiteral("Rotation\n(years)"),
+            QStringLiteral("LEV\n(€/ha)"),
+            QStringLiteral("NPV\n(€/ha)"),
+            QStringLiteral("Production\n(m³/ha)"),
+            QStringLiteral("Gain in LEV\n(€/ha)")};
+}
+/// How the optimiser searched, under its table: a thinning removes at most
+/// `removalPercent` of the standing volume and leaves `minStocking` stems/ha.
+inline QString optimiserNotes(const QString &removalPercent, const QString &minStocking) {
+    return QStringLiteral(
+               "The search grows every regime of a coarse grid (first thinning every third "
+               "year, every 3, 5, 7 or 10 years, 20 to 80 m³/ha a thinning, or no thinning) "
+               "and every final cut, then refines around the best in whole years and 5 m³/ha. "
+               "A thinning removes at most ") +
+           removalPercent + QStringLiteral(" % of the standing volume and leaves at least ") +
+           minStocking +
+           QStringLiteral(" stems/ha. Production is the standing volume at the final cut and "
+                          "all thinnings; the gain is the regime's LEV less yours.");
 }
 inline QString regimeYours() {
     return QStringLiteral("Yours");

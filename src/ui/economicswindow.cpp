@@ -1,5 +1,6 @@
 #include "ui/economicswindow.hpp"
 
+#include "economics/economicsformat.hpp"
 #include "economics/economicsmessages.hpp"
 #include "economics/economicswindowlogic.hpp"
 #include "ui/economicscharts.hpp"
@@ -208,8 +209,20 @@ QWidget *EconomicsWindow::buildOptimiserTab() {
         Qt::Alignment::fromInt(Qt::AlignCenter | Qt::TextWordWrap));
     m_regimes->horizontalHeader()->setSectionResizeMode(QHeaderView::Stretch);
     m_regimes->horizontalHeader()->setMinimumSectionSize(60);
-    m_regimes->horizontalHeader()->setFixedHeight(m_regimes->fontMetrics().height() * 2 + 14);
-    column->addWidget(m_regimes, 1);
+    const int headerHeight = m_regimes->fontMetrics().height() * 2 + 14;
+    m_regimes->horizontalHeader()->setFixedHeight(headerHeight);
+    // Five regimes and the user's: the table is as tall as its rows.
+    const int rowHeight = m_regimes->verticalHeader()->defaultSectionSize();
+    m_regimes->setFixedHeight(headerHeight + 6 * rowHeight + 2 * m_regimes->frameWidth() + 2);
+    column->addWidget(m_regimes);
+    const rotation::OptimiserSettings search;
+    auto *notes =
+        new QLabel(et::optimiserNotes(economics::quantityText(search.maxRemovalShare * 100.0, 0),
+                                      economics::quantityText(search.minStocking, 0)));
+    notes->setWordWrap(true);
+    notes->setStyleSheet(QStringLiteral("color: #4a4a4a;"));
+    column->addWidget(notes);
+    column->addStretch(1);
     auto *apply = new QHBoxLayout;
     QWidget *applyButton = button(C::cmdApply, et::buttonApply());
     applyButton->setToolTip(et::hintApply());
