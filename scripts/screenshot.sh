@@ -117,3 +117,6 @@ for stage in rotation optimiser applied sensitivity montecarlo; do
     rm -f "${SHOT%.png}-window.png"
     shoot "economics-$stage" --no-intro --demo-economics "$stage"
 done
+export WINDOW_TITLE=
+export SHOT="$out/economics-table.png"
+shoot economics-table --no-intro --demo-economics table

@@ -190,6 +190,7 @@ bool demoAssort(MainWindowLogic &logic, ThinWindowLogic &thin,
 ///   rotation     the value of the regime and NPV, LEV and MAI by rotation age;
 ///   optimiser    the optimiser's five best regimes;
 ///   applied      the best of them applied to the projection table;
+///   table        the same, the window closed on the table it wrote;
 ///   sensitivity  the tornado of NPV and LEV;
 ///   montecarlo   the Monte Carlo draws of NPV.
 /// False for an unknown stage.
@@ -198,9 +199,9 @@ bool demoEconomics(MainWindowLogic &logic, ThinWindowLogic &thin,
                    arbolex::economics::EconomicsWindowLogic &economics,
                    arbolex::ui::EconomicsWindow &window, const QString &stage) {
     using arbolex::economics::EconomicsControl;
-    const QStringList stages = {QStringLiteral("rotation"), QStringLiteral("optimiser"),
+    const QStringList stages = {QStringLiteral("rotation"),    QStringLiteral("optimiser"),
                                 QStringLiteral("sensitivity"), QStringLiteral("montecarlo"),
-                                QStringLiteral("applied")};
+                                QStringLiteral("applied"),     QStringLiteral("table")};
     if (!stages.contains(stage)) {
         return false;
     }
@@ -210,13 +211,18 @@ bool demoEconomics(MainWindowLogic &logic, ThinWindowLogic &thin,
     economics.typeText(EconomicsControl::txtAnnualCost, QStringLiteral("15"));
     logic.cashFlow().setInterestRate(3.0);
     economics.cmdEconomics_Click();
-    const int tab = stage == QLatin1String("applied") ? 1 : static_cast<int>(stages.indexOf(stage));
-    window.tabs()->setCurrentIndex(std::min(tab, 3));
-    if (stage == QLatin1String("optimiser") || stage == QLatin1String("applied")) {
+    const bool applied = stage == QLatin1String("applied") || stage == QLatin1String("table");
+    window.tabs()->setCurrentIndex(applied ? 1 : static_cast<int>(stages.indexOf(stage)));
+    if (stage == QLatin1String("optimiser") || applied) {
         economics.cmdOptimise_Click();
     }
-    if (stage == QLatin1String("applied")) {
-        QTimer::singleShot(2500, &window, [&economics] { economics.cmdApply_Click(1); });
+    if (applied) {
+        QTimer::singleShot(2500, &window, [&economics, stage] {
+            economics.cmdApply_Click(1);
+            if (stage == QLatin1String("table")) {
+                economics.cmdClose_Click();
+            }
+        });
     }
     return true;
 }
