@@ -259,10 +259,14 @@ void EconomicsWindowLogic::showFigures() {
             largestLev = row.lev;
         }
     }
-    m_view.setText(C::lblBiological, QString::number(m_explorer.biologicalRotation) +
-                                         QStringLiteral(" years (largest MAI, ") +
-                                         quantityText(largestMai, 1) +
-                                         QStringLiteral(" m³/ha/yr)"));
+    // The MAI of a young or slow stand may still rise at the models' age limit.
+    const bool stillRising =
+        !m_explorer.rows.empty() && m_explorer.biologicalRotation == m_explorer.rows.back().age;
+    m_view.setText(C::lblBiological,
+                   QString::number(m_explorer.biologicalRotation) +
+                       (stillRising ? QStringLiteral(" years (the age limit: the MAI still rises, ")
+                                    : QStringLiteral(" years (largest MAI, ")) +
+                       quantityText(largestMai, 1) + QStringLiteral(" m³/ha/yr)"));
     m_view.setText(C::lblEconomic, m_explorer.economicRotation > 0
                                        ? QString::number(m_explorer.economicRotation) +
                                              QStringLiteral(" years (largest LEV, ") +
