@@ -356,6 +356,8 @@ int main(int argc, char *argv[]) {
     economicsWindow.attach(economicsLogic);
     QObject::connect(window.economicsButton(), &QPushButton::clicked, &window,
                      [&economicsLogic] { economicsLogic.cmdEconomics_Click(); });
+    QObject::connect(npvWindow.economicsButton(), &QPushButton::clicked, &window,
+                     [&economicsLogic] { economicsLogic.cmdEconomics_Click(); });
     logic.Form_Load(settings, QGuiApplication::primaryScreen()->availableGeometry());
 
     if (parser.isSet(options.demoRotation)) {

@@ -24,7 +24,7 @@ QString euroText(double euro) {
 }
 
 QString euroPerHaText(const std::optional<double> &euro) {
-    return euro ? euroText(*euro) + QStringLiteral(" €/ha") : text::noFigure();
+    return euro ? euroText(*euro) + QStringLiteral(" €/ha") : economicstext::noFigure();
 }
 
 QString percentText(double percent) {

@@ -5,7 +5,7 @@
 #include <QString>
 #include <QStringList>
 
-namespace arbolex::economics::text {
+namespace arbolex::economics::economicstext {
 
 inline QString economicsCaption() {
     return QStringLiteral("Economics of the rotation");
@@ -272,4 +272,4 @@ inline QString optimiserFailed() {
     return QStringLiteral("ERROR - the optimiser could not grow the stand: ");
 }
 
-} // namespace arbolex::economics::text
+} // namespace arbolex::economics::economicstext

@@ -41,18 +41,18 @@ QString irrText(const valuation::InternalRate &irr) {
     case valuation::IrrOutcome::kRoot:
         return quantityText(irr.ratePercent, 2) + QStringLiteral(" % a year");
     case valuation::IrrOutcome::kNoSignChange:
-        return text::irrNoSignChange();
+        return economicstext::irrNoSignChange();
     case valuation::IrrOutcome::kNoRoot:
-        return text::irrNoRoot();
+        return economicstext::irrNoRoot();
     case valuation::IrrOutcome::kMoreThanOneRoot:
-        return text::irrMoreThanOneRoot();
+        return economicstext::irrMoreThanOneRoot();
     }
     return {};
 }
 
 QString breakEvenText(const std::optional<double> &factor) {
     if (!factor) {
-        return text::breakEvenNone();
+        return economicstext::breakEvenNone();
     }
     const double k = *factor;
     const QString times = quantityText(k, 2) + QStringLiteral(" × today's prices");
@@ -79,7 +79,7 @@ EconomicsWindowLogic::EconomicsWindowLogic(workflow::MainWindowLogic &main,
     : m_main(main), m_thin(thin), m_view(view), m_interactive(interactive) {}
 
 void EconomicsWindowLogic::message(const QString &text, EconomicsControl focus) {
-    m_interactive.message(text::titleEconomics(), text, shell::kExclamation);
+    m_interactive.message(economicstext::titleEconomics(), text, shell::kExclamation);
     m_view.focus(focus);
 }
 
@@ -114,7 +114,7 @@ void EconomicsWindowLogic::Form_Load() {
 bool EconomicsWindowLogic::readEconomics() {
     const QString rate = m_view.text(C::txtInterestRate).trimmed();
     if (!shell::isNumeric(rate) || !(shell::val(rate) > 0.0)) {
-        message(text::faultRate(), C::txtInterestRate);
+        message(economicstext::faultRate(), C::txtInterestRate);
         return false;
     }
     rotation::Economics e;
@@ -122,7 +122,7 @@ bool EconomicsWindowLogic::readEconomics() {
     for (const C c : {C::txtEstablishmentCost, C::txtAnnualCost}) {
         const QString typed = m_view.text(c).trimmed();
         if (!typed.isEmpty() && (!shell::isNumeric(typed) || shell::val(typed) < 0.0)) {
-            message(text::faultCost(), c);
+            message(economicstext::faultCost(), c);
             return false;
         }
         (c == C::txtEstablishmentCost ? e.establishmentCost : e.annualCost) = shell::val(typed);
@@ -240,8 +240,8 @@ void EconomicsWindowLogic::showFigures() {
                                    euroText(m_economics.annualCost) + QStringLiteral(" €/ha/yr"));
     m_view.setText(C::lblNPV, euroPerHaText(v.npv));
     m_view.setText(C::lblLEV, euroPerHaText(v.lev));
-    m_view.setText(C::lblEAA,
-                   v.eaa ? euroText(*v.eaa) + QStringLiteral(" €/ha/yr") : text::noFigure());
+    m_view.setText(C::lblEAA, v.eaa ? euroText(*v.eaa) + QStringLiteral(" €/ha/yr")
+                                    : economicstext::noFigure());
     m_view.setText(C::lblForestValue, euroPerHaText(v.forestValue));
     m_view.setText(C::lblIRR, irrText(v.irr));
     m_view.setText(C::lblBreakEven, breakEvenText(v.breakEvenPriceFactor));
@@ -271,7 +271,7 @@ void EconomicsWindowLogic::showFigures() {
                                        ? QString::number(m_explorer.economicRotation) +
                                              QStringLiteral(" years (largest LEV, ") +
                                              euroPerHaText(largestLev) + QLatin1Char(')')
-                                       : text::noFigure());
+                                       : economicstext::noFigure());
     m_view.setText(C::lblMAI, quantityText(v.mai, 1) + QStringLiteral(" m³/ha/yr"));
     m_view.setText(C::lblYieldClass, v.yieldClass > 0
                                          ? QString::number(v.yieldClass)
@@ -282,19 +282,19 @@ void EconomicsWindowLogic::showFigures() {
 void EconomicsWindowLogic::cmdMonteCarlo_Click() {
     shell::guard(m_main.errorLog(), QStringLiteral(" in frmEconomics.cmdMonteCarlo_Click()"), [&] {
         if (!m_path || !m_value) {
-            message(text::noStand(), C::txtInterestRate);
+            message(economicstext::noStand(), C::txtInterestRate);
             return;
         }
         rotation::MonteCarloSettings s;
         const auto draws = wholeNumber(m_view.text(C::txtDraws));
         if (!draws || *draws < kFewestDraws || *draws > kMostDraws) {
-            message(text::faultDraws(), C::txtDraws);
+            message(economicstext::faultDraws(), C::txtDraws);
             return;
         }
         s.draws = static_cast<int>(*draws);
         const auto seed = wholeNumber(m_view.text(C::txtSeed));
         if (!seed || *seed < 0) {
-            message(text::faultSeed(), C::txtSeed);
+            message(economicstext::faultSeed(), C::txtSeed);
             return;
         }
         s.seed = static_cast<std::uint64_t>(*seed);
@@ -302,7 +302,7 @@ void EconomicsWindowLogic::cmdMonteCarlo_Click() {
             const QString typed = m_view.text(c).trimmed();
             const double percent = shell::val(typed);
             if (!shell::isNumeric(typed) || percent < 0.0 || percent > 100.0) {
-                message(text::faultSpread(), c);
+                message(economicstext::faultSpread(), c);
                 return;
             }
             (c == C::txtPriceSpread ? s.priceSpread : s.costSpread) = percent / 100.0;
@@ -311,7 +311,7 @@ void EconomicsWindowLogic::cmdMonteCarlo_Click() {
         const QString high = m_view.text(C::txtRateHigh).trimmed();
         if (!shell::isNumeric(low) || !shell::isNumeric(high) || !(shell::val(low) > 0.0) ||
             !(shell::val(low) < shell::val(high))) {
-            message(text::faultRateRange(), C::txtRateLow);
+            message(economicstext::faultRateRange(), C::txtRateLow);
             return;
         }
         s.rateLow = shell::val(low);
@@ -337,7 +337,7 @@ void EconomicsWindowLogic::cmdOptimise_Click() {
             return;
         }
         if (!m_path || !m_value) {
-            message(text::noStand(), C::txtInterestRate);
+            message(economicstext::noStand(), C::txtInterestRate);
             return;
         }
         struct Job {
@@ -382,7 +382,8 @@ void EconomicsWindowLogic::cmdOptimise_Click() {
                 m_view.setEnabled(C::cmdCancel, false);
                 if (!job->result) {
                     m_view.setText(C::lblOptimiser, QString());
-                    message(text::optimiserFailed() + QString::fromStdString(job->failure.text),
+                    message(economicstext::optimiserFailed() +
+                                QString::fromStdString(job->failure.text),
                             C::cmdOptimise);
                     return;
                 }
@@ -402,7 +403,7 @@ void EconomicsWindowLogic::cmdOptimise_Click() {
 }
 
 std::vector<QStringList> EconomicsWindowLogic::regimeGrid() const {
-    std::vector<QStringList> grid{text::regimeHeaders()};
+    std::vector<QStringList> grid{economicstext::regimeHeaders()};
     const auto row = [&](const QString &rank, const rotation::Candidate &c) {
         const rotation::Regime &g = c.regime;
         QStringList cells{rank};
@@ -413,18 +414,18 @@ std::vector<QStringList> EconomicsWindowLogic::regimeGrid() const {
                   << quantityText(g.thinVolume, g.thinVolume == std::round(g.thinVolume) ? 0 : 1)
                   << QString::number(g.thinUntil.value_or(g.thinFrom));
         } else {
-            cells << text::noThinning() << QString() << QString() << QString();
+            cells << economicstext::noThinning() << QString() << QString() << QString();
         }
         cells << QString::number(c.rotation) << euroText(c.lev) << euroText(c.npv)
               << quantityText(c.volume, 0)
-              << (m_yours ? euroText(c.lev - m_yours->lev) : text::noFigure());
+              << (m_yours ? euroText(c.lev - m_yours->lev) : economicstext::noFigure());
         return cells;
     };
     for (std::size_t i = 0; i < m_best.size(); ++i) {
         grid.push_back(row(QString::number(i + 1), m_best[i]));
     }
     if (m_yours) {
-        grid.push_back(row(text::regimeYours(), *m_yours));
+        grid.push_back(row(economicstext::regimeYours(), *m_yours));
     }
     return grid;
 }

@@ -101,13 +101,13 @@ void EconomicsWindowLogic::cmdApply_Click(int rank) {
             return;
         }
         if (rank < 1 || rank > static_cast<int>(m_best.size())) {
-            message(text::nothingToApply(), C::cmdOptimise);
+            message(economicstext::nothingToApply(), C::cmdOptimise);
             return;
         }
         const rotation::Candidate chosen = m_best[static_cast<std::size_t>(rank - 1)];
         if (const auto failed = replay(m_main, m_thin, m_stand, chosen.regime, chosen.rotation)) {
-            m_interactive.message(text::titleEconomics(), text::applyStopped() + *failed,
-                                  shell::kExclamation);
+            m_interactive.message(economicstext::titleEconomics(),
+                                  economicstext::applyStopped() + *failed, shell::kExclamation);
         }
         // The figures of the table as it now stands.
         cmdCompute_Click();

@@ -19,7 +19,7 @@
 
 namespace arbolex::ui {
 
-namespace et = economics::text;
+namespace et = economics::economicstext;
 
 namespace {
 

@@ -28,7 +28,7 @@ namespace arbolex::ui {
 
 using economics::EconomicsControl;
 using C = economics::EconomicsControl;
-namespace et = economics::text;
+namespace et = economics::economicstext;
 
 namespace {
 

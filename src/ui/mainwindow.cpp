@@ -279,9 +279,9 @@ QWidget *MainWindow::buildPanel() {
     commands->addWidget(prices, 4, 1);
     // Beside NPV: the value of the rotation, its best age, the optimiser and
     // the uncertainty, in a window of its own.
-    m_economicsButton = new QPushButton(economics::text::buttonEconomics(), this);
+    m_economicsButton = new QPushButton(economics::economicstext::buttonEconomics(), this);
     m_economicsButton->setObjectName(QStringLiteral("cmdEconomics"));
-    m_economicsButton->setToolTip(economics::text::hintEconomics());
+    m_economicsButton->setToolTip(economics::economicstext::hintEconomics());
     commands->addWidget(m_economicsButton, 5, 1);
     connect(prices, &QPushButton::clicked, this, [this] {
         if (m_logic != nullptr) {

@@ -134,13 +134,13 @@ TEST_F(EconomicsWindowTest, BadInputIsRefusedAndKeepsWhatIsShown) {
         QString message;
     } cases[] = {
         {EconomicsControl::txtInterestRate, QStringLiteral("0"), EconomicsControl::cmdCompute,
-         economics::text::faultRate()},
+         economics::economicstext::faultRate()},
         {EconomicsControl::txtAnnualCost, QStringLiteral("-5"), EconomicsControl::cmdCompute,
-         economics::text::faultCost()},
+         economics::economicstext::faultCost()},
         {EconomicsControl::txtDraws, QStringLiteral("5"), EconomicsControl::cmdMonteCarlo,
-         economics::text::faultDraws()},
+         economics::economicstext::faultDraws()},
         {EconomicsControl::txtRateHigh, QStringLiteral("1"), EconomicsControl::cmdMonteCarlo,
-         economics::text::faultRateRange()},
+         economics::economicstext::faultRateRange()},
     };
     for (const auto &c : cases) {
         const QString before = view.text(c.field);
