@@ -115,3 +115,16 @@ for chart in stand increments cashflow; do
     export SHOT="$out/charts-$chart.png"
     shoot "charts-$chart" --no-intro --demo-charts --demo-chart-tab "$chart"
 done
+# Economics: the economics window on the rotation above at 3 % with costs of
+# establishment and upkeep: the value of the regime and NPV, LEV and MAI by
+# rotation age, the optimiser's five best regimes, the best of them applied to
+# the table, the tornado and the Monte Carlo histogram.
+export WINDOW_TITLE="Economics of the rotation"
+for stage in rotation optimiser applied sensitivity montecarlo; do
+    export SHOT="$out/economics-$stage.png"
+    rm -f "${SHOT%.png}-window.png"
+    shoot "economics-$stage" --no-intro --demo-economics "$stage"
+done
+export WINDOW_TITLE=
+export SHOT="$out/economics-table.png"
+shoot economics-table --no-intro --demo-economics table

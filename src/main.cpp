@@ -4,6 +4,7 @@
 #include "assortments/assortuserlogic.hpp"
 #include "assortments/assortwindowlogic.hpp"
 #include "document/documentcontroller.hpp"
+#include "economics/economicswindowlogic.hpp"
 #include "economics/npvwindowlogic.hpp"
 #include "economics/prices.hpp"
 #include "economics/timberpriceswindowlogic.hpp"
@@ -19,6 +20,7 @@
 #include "ui/chartpane.hpp"
 #include "ui/chartpanel.hpp"
 #include "ui/documentmenu.hpp"
+#include "ui/economicswindow.hpp"
 #include "ui/mainwindow.hpp"
 #include "ui/modelchoicedialog.hpp"
 #include "ui/npvwindow.hpp"
@@ -35,8 +37,10 @@
 #include <QCommandLineParser>
 #include <QDir>
 #include <QFile>
+#include <QPushButton>
 #include <QScreen>
 #include <QSettings>
+#include <QTabWidget>
 #include <QTimer>
 
 namespace {
@@ -275,6 +279,48 @@ bool demoDocument(MainWindowLogic &logic, ThinWindowLogic &thin,
     return true;
 }
 
+/// The economics demonstrations, on the rotation of demoRotation's final cut
+/// valued at 3 % with 1,800 €/ha to establish and 15 €/ha a year:
+///   rotation     the value of the regime and NPV, LEV and MAI by rotation age;
+///   optimiser    the optimiser's five best regimes;
+///   applied      the best of them applied to the projection table;
+///   table        the same, the window closed on the table it wrote;
+///   sensitivity  the tornado of NPV and LEV;
+///   montecarlo   the Monte Carlo draws of NPV.
+/// False for an unknown stage.
+bool demoEconomics(MainWindowLogic &logic, ThinWindowLogic &thin,
+                   arbolex::economics::NpvWindowLogic &npv,
+                   arbolex::economics::EconomicsWindowLogic &economics,
+                   arbolex::ui::EconomicsWindow &window, const QString &stage) {
+    using arbolex::economics::EconomicsControl;
+    const QStringList stages = {QStringLiteral("rotation"),    QStringLiteral("optimiser"),
+                                QStringLiteral("sensitivity"), QStringLiteral("montecarlo"),
+                                QStringLiteral("applied"),     QStringLiteral("table")};
+    if (!stages.contains(stage)) {
+        return false;
+    }
+    demoRotation(logic, thin, npv, QStringLiteral("finalcut"));
+    // The window keeps the costs typed; the rate is the cash flow's.
+    economics.typeText(EconomicsControl::txtEstablishmentCost, QStringLiteral("1800"));
+    economics.typeText(EconomicsControl::txtAnnualCost, QStringLiteral("15"));
+    logic.cashFlow().setInterestRate(3.0);
+    economics.cmdEconomics_Click();
+    const bool applied = stage == QLatin1String("applied") || stage == QLatin1String("table");
+    window.tabs()->setCurrentIndex(applied ? 1 : static_cast<int>(stages.indexOf(stage)));
+    if (stage == QLatin1String("optimiser") || applied) {
+        economics.cmdOptimise_Click();
+    }
+    if (applied) {
+        QTimer::singleShot(2500, &window, [&economics, stage] {
+            economics.cmdApply_Click(1);
+            if (stage == QLatin1String("table")) {
+                economics.cmdClose_Click();
+            }
+        });
+    }
+    return true;
+}
+
 /// The options of the command line.
 struct Options {
     explicit Options(QCommandLineParser &parser) {
@@ -302,6 +348,8 @@ struct Options {
         parser.addPositionalArgument(QStringLiteral("file"),
                                      QStringLiteral("A sub-compartment (.arbolex) to open."),
                                      QStringLiteral("[FILE]"));
+        demoEconomics.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(demoEconomics);
         quitWhenShown.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(quitWhenShown);
     }
@@ -329,6 +377,8 @@ struct Options {
                                     QStringLiteral("CHART"), QStringLiteral("stand")};
     QCommandLineOption demoDocument{QStringLiteral("demo-document"), QString(),
                                     QStringLiteral("STAGE")};
+    QCommandLineOption demoEconomics{QStringLiteral("demo-economics"), QString(),
+                                     QStringLiteral("STAGE")};
     /// Ends the program once the main window is on screen: start-up is timed with it.
     QCommandLineOption quitWhenShown{QStringLiteral("quit-when-shown")};
 };
@@ -416,6 +466,15 @@ int main(int argc, char *argv[]) {
     assortUserWindow.attach(assortUserLogic);
     QObject::connect(window.assortUserAction(), &QAction::triggered, &window,
                      [&assortUserLogic] { assortUserLogic.mnuAssortUser_Click(); });
+    // The economics window opens from the main window's "Economics…" beside NPV.
+    arbolex::ui::EconomicsWindow economicsWindow(&window);
+    arbolex::economics::EconomicsWindowLogic economicsLogic(logic, thinLogic, economicsWindow,
+                                                            interactive);
+    economicsWindow.attach(economicsLogic);
+    QObject::connect(window.economicsButton(), &QPushButton::clicked, &window,
+                     [&economicsLogic] { economicsLogic.cmdEconomics_Click(); });
+    QObject::connect(npvWindow.economicsButton(), &QPushButton::clicked, &window,
+                     [&economicsLogic] { economicsLogic.cmdEconomics_Click(); });
     logic.Form_Load(settings, QGuiApplication::primaryScreen()->availableGeometry());
     // The sub-compartment as a document: the File menu, and the question
     // before the window closes on unsaved work.
@@ -446,6 +505,16 @@ int main(int argc, char *argv[]) {
         QTimer::singleShot(0, &window, [&, chart] {
             if (!demoCharts(logic, thinLogic, npvLogic, window, chart)) {
                 qWarning("unknown chart demonstration: %s", qPrintable(chart));
+            }
+        });
+    } else if (parser.isSet(options.demoEconomics)) {
+        const QString stage = parser.value(options.demoEconomics);
+        interactive.queueAnswer(true); // the final cut's offer of the net present value
+        interactive.queueAnswer(true); // and again after Apply
+        QTimer::singleShot(0, &window, [&, stage] {
+            if (!demoEconomics(logic, thinLogic, npvLogic, economicsLogic, economicsWindow,
+                               stage)) {
+                qWarning("unknown economics demonstration: %s", qPrintable(stage));
             }
         });
     } else if (parser.isSet(options.demoAssort)) {
@@ -486,5 +555,6 @@ int main(int argc, char *argv[]) {
         }
     }
     app.exec();
+    economicsWindow.waitForWork();
     return 0;
 }

@@ -7,6 +7,7 @@
 #include "assortments/assortuserlogic.hpp"
 #include "assortments/assortwindowlogic.hpp"
 #include "assortments/headlessassortview.hpp"
+#include "economics/economicswindowlogic.hpp"
 #include "economics/headlesstimberpricesview.hpp"
 #include "economics/inpvview.hpp"
 #include "economics/npvwindowlogic.hpp"
@@ -73,6 +74,8 @@ public:
     shell::HeadlessClipboard &clipboard() { return m_clipboard; }
     economics::TimberPricesWindowLogic &timberPrices() { return m_timberPrices; }
     economics::HeadlessTimberPricesView &timberPricesView() { return m_timberPricesView; }
+    economics::EconomicsWindowLogic &economics() { return m_economics; }
+    economics::HeadlessEconomicsView &economicsView() { return m_economicsView; }
 
 private:
     shell::ErrorLog m_log;
@@ -93,6 +96,8 @@ private:
     assortments::AssortWindowLogic m_assort;
     assortments::HeadlessAssortUserView m_assortUserView;
     assortments::AssortUserLogic m_assortUser;
+    economics::HeadlessEconomicsView m_economicsView;
+    economics::EconomicsWindowLogic m_economics{m_main, m_thin, m_economicsView, m_interactive};
 };
 
 } // namespace arbolex::cli

@@ -2,6 +2,7 @@
 
 #include "cli/assortscript.hpp"
 #include "cli/documentscript.hpp"
+#include "cli/economicsscript.hpp"
 #include "shell/tableexport.hpp"
 
 #include <QFile>
@@ -230,6 +231,9 @@ QString ScriptRunner::set(const QString &control, const QString &text) {
     if (const auto assort = setAssortControl(m_session, control, text)) {
         return *assort;
     }
+    if (const auto economics = setEconomicsControl(m_session, control, text)) {
+        return *economics;
+    }
     if (const auto thin = thinControl(control)) {
         if (!thinning::isThinField(*thin)) {
             return QStringLiteral("no field named '") + control + QLatin1Char('\'');
@@ -254,6 +258,9 @@ QString ScriptRunner::press(const QString &control) {
     }
     if (const auto assort = pressAssortControl(m_session, control)) {
         return *assort;
+    }
+    if (const auto economics = pressEconomicsControl(m_session, control)) {
+        return *economics;
     }
     if (const auto thin = thinControl(control)) {
         if (!m_session.thinning().press(*thin)) {
@@ -286,6 +293,9 @@ QString ScriptRunner::press(const QString &control) {
 QString ScriptRunner::print(const QString &control) {
     if (const auto assort = printAssortControl(m_session, control, m_out)) {
         return *assort;
+    }
+    if (const auto economics = printEconomicsControl(m_session, control, m_out)) {
+        return *economics;
     }
     if (control == QLatin1String("flxMain")) {
         for (const QStringList &row : m_session.main().table().visibleGrid()) {

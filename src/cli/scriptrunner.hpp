@@ -14,7 +14,9 @@
 // '#' starts a comment. Controls of other windows are named "window.name".
 // `set CONTROL` with no text empties the field; an element of a control array
 // carries its index ("frmTimberPrices.txtTimbVal(13)"); an option button
-// prints 1 when chosen, else 0.
+// prints 1 when chosen, else 0. The economics window: "press cmdEconomics",
+// "press frmEconomics.cmdOptimise", "press frmEconomics.cmdApply(K)", "print
+// frmEconomics" (cli/economicsscript.hpp).
 
 #include "cli/headlesssession.hpp"
 #include "document/documentcontroller.hpp"

@@ -3,6 +3,7 @@
 
 #include "assortments/assortmessages.hpp"
 #include "document/documentmessages.hpp"
+#include "economics/economicsmessages.hpp"
 #include "engine/catalogue.hpp"
 #include "ui/chartpane.hpp"
 #include "ui/groupheaderview.hpp"
@@ -308,6 +309,12 @@ QWidget *MainWindow::buildPanel() {
     QPushButton *prices =
         addButton(MainControl::cmdShowTimberPrice, workflow::text::showTimberPrices());
     commands->addWidget(prices, 4, 1);
+    // Beside NPV: the value of the rotation, its best age, the optimiser and
+    // the uncertainty, in a window of its own.
+    m_economicsButton = new QPushButton(economics::economicstext::buttonEconomics(), this);
+    m_economicsButton->setObjectName(QStringLiteral("cmdEconomics"));
+    m_economicsButton->setToolTip(economics::economicstext::hintEconomics());
+    commands->addWidget(m_economicsButton, 5, 1);
     connect(prices, &QPushButton::clicked, this, [this] {
         if (m_logic != nullptr) {
             m_logic->cmdShowTimberPrice_Click();

@@ -71,6 +71,8 @@ public:
     ReportMenu *reportMenu() const { return m_reportMenu; }
     /// Draws the charts again (the cash flow changed in its own window).
     void refreshCharts();
+    /// The button "Economics…" that opens the economics window.
+    QPushButton *economicsButton() const { return m_economicsButton; }
 
     // IMainView
     QString text(workflow::MainControl control) const override;
@@ -126,6 +128,7 @@ private:
     QAction *m_assortUserAction = nullptr;
     ChartPane *m_chartPane = nullptr;
     ReportMenu *m_reportMenu = nullptr;
+    QPushButton *m_economicsButton = nullptr;
     QTableView *m_grid = nullptr;
     ProjectionModel *m_model = nullptr;
     QTableView *m_summaryGrid = nullptr;

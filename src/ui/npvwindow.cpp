@@ -1,5 +1,6 @@
 #include "ui/npvwindow.hpp"
 
+#include "economics/economicsmessages.hpp"
 #include "economics/npvmessages.hpp"
 #include "economics/npvwindowlogic.hpp"
 #include "ui/fieldinput.hpp"
@@ -86,6 +87,11 @@ NpvWindow::NpvWindow(QWidget *main) : QDialog(main) {
     bottom->addStretch(1);
     bottom->addWidget(compute);
     bottom->addWidget(copy);
+    m_economicsButton = new QPushButton(economics::economicstext::buttonEconomics(), this);
+    m_economicsButton->setObjectName(QStringLiteral("cmdEconomics"));
+    m_economicsButton->setToolTip(economics::economicstext::hintEconomics());
+    m_economicsButton->setAutoDefault(false);
+    bottom->addWidget(m_economicsButton);
     bottom->addWidget(closeButton);
     layout->addLayout(bottom);
 

@@ -32,6 +32,8 @@ public:
 
     QWidget *control(economics::NpvControl control) const;
     QTableView *grid() const { return m_grid; }
+    /// "Economics…": the value of the same rotation in the economics window.
+    QPushButton *economicsButton() const { return m_economicsButton; }
 
     // INpvView
     QString text(economics::NpvControl control) const override;
@@ -57,6 +59,7 @@ private:
     economics::NpvWindowLogic *m_logic = nullptr;
     std::array<QWidget *, economics::kNpvControlCount> m_controls{};
     QTableView *m_grid = nullptr;
+    QPushButton *m_economicsButton = nullptr;
     StringGridModel *m_model = nullptr;
     bool m_followingLogic = false;
     bool m_widened = false;

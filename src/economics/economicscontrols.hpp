@@ -1,0 +1,58 @@
+#pragma once
+
+#include <QString>
+
+#include <optional>
+
+namespace arbolex::economics {
+
+/// The controls of the economics window `frmEconomics` that its logic reads or
+/// sets.
+enum class EconomicsControl {
+    // what the money is counted with
+    txtInterestRate,
+    txtEstablishmentCost,
+    txtAnnualCost,
+    // the Monte Carlo draws
+    txtDraws,
+    txtSeed,
+    txtPriceSpread,
+    txtRateLow,
+    txtRateHigh,
+    txtCostSpread,
+    // what the window tells
+    lblStand,
+    lblRegime,
+    lblRate,
+    lblNPV,
+    lblLEV,
+    lblEAA,
+    lblForestValue,
+    lblIRR,
+    lblBreakEven,
+    lblRotation,
+    lblBiological,
+    lblEconomic,
+    lblMAI,
+    lblYieldClass,
+    lblOptimiser,
+    lblMonteCarlo,
+    // commands
+    cmdCompute,
+    cmdOptimise,
+    cmdCancel,
+    cmdApply,
+    cmdMonteCarlo,
+    cmdClose,
+};
+
+inline constexpr int kEconomicsControlCount = static_cast<int>(EconomicsControl::cmdClose) + 1;
+
+/// The control's name ("txtInterestRate").
+QString economicsControlName(EconomicsControl control);
+/// The control named `name`, if the window has one.
+std::optional<EconomicsControl> economicsControlFromName(const QString &name);
+/// True for the fields the user types into.
+bool isEconomicsField(EconomicsControl control);
+
+} // namespace arbolex::economics

@@ -1,0 +1,471 @@
+// The economics window's figures: the rotation of the projection table
+// valued, its explorer, tornado and Monte Carlo draws, and the optimiser run
+// away from the window's thread.
+#include "economics/economicswindowlogic.hpp"
+
+#include "economics/economicsformat.hpp"
+#include "economics/economicsmessages.hpp"
+#include "economics/prices.hpp"
+#include "shell/apperror.hpp"
+#include "shell/interactive.hpp"
+#include "shell/vbformat.hpp"
+#include "shell/vbtext.hpp"
+#include "workflow/mainwindowlogic.hpp"
+#include "workflow/standmath.hpp"
+
+#include <cmath>
+#include <exception>
+
+namespace arbolex::economics {
+
+using C = EconomicsControl;
+
+namespace {
+
+/// Largest number of Monte Carlo draws: about a second of work.
+constexpr int kMostDraws = 100000;
+constexpr int kFewestDraws = 100;
+
+bool sameStand(const rotation::Stand &a, const rotation::Stand &b) {
+    return a.model == b.model && a.age == b.age && a.stocking == b.stocking &&
+           a.height == b.height && a.basalArea == b.basalArea;
+}
+
+bool sameMoney(const rotation::Economics &a, const rotation::Economics &b) {
+    return a.ratePercent == b.ratePercent && a.establishmentCost == b.establishmentCost &&
+           a.annualCost == b.annualCost && a.prices == b.prices;
+}
+
+QString irrText(const valuation::InternalRate &irr) {
+    switch (irr.outcome) {
+    case valuation::IrrOutcome::kRoot:
+        return quantityText(irr.ratePercent, 2) + QStringLiteral(" % a year");
+    case valuation::IrrOutcome::kNoSignChange:
+        return economicstext::irrNoSignChange();
+    case valuation::IrrOutcome::kNoRoot:
+        return economicstext::irrNoRoot();
+    case valuation::IrrOutcome::kMoreThanOneRoot:
+        return economicstext::irrMoreThanOneRoot();
+    }
+    return {};
+}
+
+QString breakEvenText(const std::optional<double> &factor) {
+    if (!factor) {
+        return economicstext::breakEvenNone();
+    }
+    const double k = *factor;
+    const QString times = quantityText(k, 2) + QStringLiteral(" × today's prices");
+    if (k <= 1.0) {
+        return times + QStringLiteral(" (prices may fall ") + quantityText((1.0 - k) * 100.0, 0) +
+               QStringLiteral(" % before the land earns nothing)");
+    }
+    return times + QStringLiteral(" (prices must rise ") + quantityText((k - 1.0) * 100.0, 0) +
+           QStringLiteral(" % for planting to pay)");
+}
+
+/// A whole number typed into a field, if it is one.
+std::optional<long long> wholeNumber(const QString &typed) {
+    bool ok = false;
+    const long long n = typed.trimmed().toLongLong(&ok);
+    return ok ? std::optional<long long>(n) : std::nullopt;
+}
+
+} // namespace
+
+EconomicsWindowLogic::EconomicsWindowLogic(workflow::MainWindowLogic &main,
+                                           thinning::ThinWindowLogic &thin, IEconomicsView &view,
+                                           shell::IInteractive &interactive)
+    : m_main(main), m_thin(thin), m_view(view), m_interactive(interactive) {}
+
+void EconomicsWindowLogic::message(const QString &text, EconomicsControl focus) {
+    m_interactive.message(economicstext::titleEconomics(), text, shell::kExclamation);
+    m_view.focus(focus);
+}
+
+void EconomicsWindowLogic::cmdEconomics_Click() {
+    Form_Load();
+    m_view.showWindow();
+}
+
+void EconomicsWindowLogic::Form_Load() {
+    shell::guard(m_main.errorLog(), QStringLiteral(" in frmEconomics.Form_Load()"), [&] {
+        m_view.setText(C::txtInterestRate, percentText(m_main.cashFlow().interestRate()));
+        const rotation::MonteCarloSettings draws;
+        const auto fill = [&](C c, const QString &value) {
+            if (m_view.text(c).isEmpty()) {
+                m_view.setText(c, value);
+            }
+        };
+        fill(C::txtEstablishmentCost, QStringLiteral("0"));
+        fill(C::txtAnnualCost, QStringLiteral("0"));
+        fill(C::txtDraws, QString::number(draws.draws));
+        fill(C::txtSeed, QString::number(draws.seed));
+        fill(C::txtPriceSpread, shell::generalNumber(draws.priceSpread * 100.0));
+        fill(C::txtRateLow, percentText(draws.rateLow));
+        fill(C::txtRateHigh, percentText(draws.rateHigh));
+        fill(C::txtCostSpread, shell::generalNumber(draws.costSpread * 100.0));
+        m_view.setEnabled(C::cmdCancel, false);
+        m_view.setEnabled(C::cmdApply, !m_best.empty());
+    });
+    cmdCompute_Click();
+}
+
+bool EconomicsWindowLogic::readEconomics() {
+    const QString rate = m_view.text(C::txtInterestRate).trimmed();
+    if (!shell::isNumeric(rate) || !(shell::val(rate) > 0.0)) {
+        message(economicstext::faultRate(), C::txtInterestRate);
+        return false;
+    }
+    rotation::Economics e;
+    e.ratePercent = shell::val(rate);
+    for (const C c : {C::txtEstablishmentCost, C::txtAnnualCost}) {
+        const QString typed = m_view.text(c).trimmed();
+        if (!typed.isEmpty() && (!shell::isNumeric(typed) || shell::val(typed) < 0.0)) {
+            message(economicstext::faultCost(), c);
+            return false;
+        }
+        (c == C::txtEstablishmentCost ? e.establishmentCost : e.annualCost) = shell::val(typed);
+    }
+    // The cash flow's own prices: the long-term averages, as their absolute values.
+    Prices longTerm;
+    longTerm.data() = m_main.prices().data();
+    longTerm.selectPriceSet(kLongTermPrices);
+    e.prices = longTerm.pricesInUse();
+    // One interest rate for the program: the cash flow's.
+    m_main.cashFlow().setInterestRate(e.ratePercent);
+    m_economics = e;
+    return true;
+}
+
+bool EconomicsWindowLogic::readStand() {
+    const std::int16_t model = m_main.grow().modelId();
+    if (const auto s = standFromTable(m_main.table(), model)) {
+        m_stand = *s;
+        return true;
+    }
+    // No table yet: the grow-from fields, checked as the grow command checks them.
+    if (!m_main.ChkGrowFromFlds() || !m_main.ChkGrowFromBnds()) {
+        return false;
+    }
+    const workflow::GrowFrom g = m_main.GetGrowFrom();
+    const float basalArea =
+        g.basalArea > 0.0f ? g.basalArea : workflow::basalAreaFromDbh(g.stocking, g.dbh);
+    m_stand = rotation::Stand{model, g.age, g.stocking, g.topHeight, basalArea};
+    return true;
+}
+
+void EconomicsWindowLogic::clearFigures(const QString &why) {
+    m_path.reset();
+    m_value.reset();
+    m_yours.reset();
+    m_explorer = {};
+    m_tornado.clear();
+    m_monteCarlo.reset();
+    for (int c = static_cast<int>(C::lblNPV); c <= static_cast<int>(C::lblMonteCarlo); ++c) {
+        m_view.setText(static_cast<C>(c), QString());
+    }
+    m_view.setText(C::lblRegime, why);
+    m_view.figuresChanged();
+    m_view.monteCarloChanged();
+}
+
+void EconomicsWindowLogic::cmdCompute_Click() {
+    shell::guard(m_main.errorLog(), QStringLiteral(" in frmEconomics.cmdCompute_Click()"), [&] {
+        if (m_optimising) {
+            return;
+        }
+        const rotation::Stand before = m_stand;
+        const rotation::Economics money = m_economics;
+        if (!readEconomics() || !readStand()) {
+            return;
+        }
+        if (!sameStand(before, m_stand) || !sameMoney(money, m_economics)) {
+            // The optimiser's regimes belong to another stand or other money.
+            m_best.clear();
+            m_view.setText(C::lblOptimiser, QString());
+            m_view.setEnabled(C::cmdApply, false);
+            m_view.regimesChanged();
+        }
+        m_table = regimeFromTable(m_main.table());
+        rotation::GrowthFailure failure;
+        m_path = rotation::growPath(m_grow, m_stand, m_table.regime, failure);
+        if (!m_path) {
+            clearFigures(QString::fromStdString(failure.text));
+            return;
+        }
+        m_explorer = rotation::exploreRotations(*m_path, m_table.regime, m_economics);
+        m_rotation = m_table.finalCut.value_or(m_explorer.economicRotation);
+        if (const auto problem = rotation::rotationProblem(*m_path, m_table.regime, m_rotation)) {
+            clearFigures(QString::fromStdString(*problem));
+            return;
+        }
+        m_value = rotation::valueRotation(*m_path, m_rotation, m_economics);
+        m_tornado = rotation::tornado(*m_path, m_rotation, m_economics);
+        m_yours = rotation::scoreRotation(*m_path, m_table.regime, m_rotation, m_economics,
+                                          rotation::Objective::kLev);
+        showFigures();
+        m_view.regimesChanged();
+        cmdMonteCarlo_Click();
+    });
+}
+
+QString EconomicsWindowLogic::rateText() const {
+    return percentText(m_economics.ratePercent);
+}
+
+void EconomicsWindowLogic::showFigures() {
+    const rotation::RotationValue &v = *m_value;
+    const rotation::Stand &s = m_stand;
+    m_view.setText(C::lblStand,
+                   QString::fromStdString(m_grow.label()) + QStringLiteral(" · age ") +
+                       QString::number(m_path->presentAge) + QStringLiteral(" years · ") +
+                       quantityText(s.stocking, 0) + QStringLiteral(" stems/ha · top height ") +
+                       quantityText(s.height, 1) + QStringLiteral(" m · basal area ") +
+                       quantityText(s.basalArea, 1) + QStringLiteral(" m²/ha · site index ") +
+                       quantityText(m_path->siteIndex, 1) + QStringLiteral(" m"));
+    QString regime = describeRegime(m_table.regime, m_rotation);
+    if (const QString note = irregularNote(m_table); !note.isEmpty()) {
+        regime += QLatin1Char(' ') + note;
+    }
+    if (!m_table.finalCut) {
+        regime += QStringLiteral(" The table has no final cut: the economic rotation is valued.");
+    }
+    m_view.setText(C::lblRegime, regime);
+    m_view.setText(C::lblRate, QStringLiteral("At ") + rateText() +
+                                   QStringLiteral(" % a year · long-term average timber prices · "
+                                                  "establishment ") +
+                                   euroText(m_economics.establishmentCost) +
+                                   QStringLiteral(" €/ha · annual cost ") +
+                                   euroText(m_economics.annualCost) + QStringLiteral(" €/ha/yr"));
+    m_view.setText(C::lblNPV, euroPerHaText(v.npv));
+    m_view.setText(C::lblLEV, euroPerHaText(v.lev));
+    m_view.setText(C::lblEAA, v.eaa ? euroText(*v.eaa) + QStringLiteral(" €/ha/yr")
+                                    : economicstext::noFigure());
+    m_view.setText(C::lblForestValue, euroPerHaText(v.forestValue));
+    m_view.setText(C::lblIRR, irrText(v.irr));
+    m_view.setText(C::lblBreakEven, breakEvenText(v.breakEvenPriceFactor));
+    m_view.setText(C::lblRotation,
+                   QString::number(m_rotation) +
+                       (m_table.finalCut ? QStringLiteral(" years (the final cut of the table)")
+                                         : QStringLiteral(" years (the economic rotation)")));
+    double largestMai = 0.0;
+    std::optional<double> largestLev;
+    for (const rotation::RotationRow &row : m_explorer.rows) {
+        if (row.age == m_explorer.biologicalRotation) {
+            largestMai = row.mai;
+        }
+        if (row.age == m_explorer.economicRotation) {
+            largestLev = row.lev;
+        }
+    }
+    // The MAI of a young or slow stand may still rise at the models' age limit.
+    const bool stillRising =
+        !m_explorer.rows.empty() && m_explorer.biologicalRotation == m_explorer.rows.back().age;
+    m_view.setText(C::lblBiological,
+                   QString::number(m_explorer.biologicalRotation) +
+                       (stillRising ? QStringLiteral(" years (the age limit: the MAI still rises, ")
+                                    : QStringLiteral(" years (largest MAI, ")) +
+                       quantityText(largestMai, 1) + QStringLiteral(" m³/ha/yr)"));
+    m_view.setText(C::lblEconomic, m_explorer.economicRotation > 0
+                                       ? QString::number(m_explorer.economicRotation) +
+                                             QStringLiteral(" years (largest LEV, ") +
+                                             euroPerHaText(largestLev) + QLatin1Char(')')
+                                       : economicstext::noFigure());
+    m_view.setText(C::lblMAI, quantityText(v.mai, 1) + QStringLiteral(" m³/ha/yr"));
+    m_view.setText(C::lblYieldClass, v.yieldClass > 0
+                                         ? QString::number(v.yieldClass)
+                                         : QStringLiteral("not reached: the MAI still rises"));
+    m_view.figuresChanged();
+}
+
+void EconomicsWindowLogic::cmdMonteCarlo_Click() {
+    shell::guard(m_main.errorLog(), QStringLiteral(" in frmEconomics.cmdMonteCarlo_Click()"), [&] {
+        if (!m_path || !m_value) {
+            message(economicstext::noStand(), C::txtInterestRate);
+            return;
+        }
+        rotation::MonteCarloSettings s;
+        const auto draws = wholeNumber(m_view.text(C::txtDraws));
+        if (!draws || *draws < kFewestDraws || *draws > kMostDraws) {
+            message(economicstext::faultDraws(), C::txtDraws);
+            return;
+        }
+        s.draws = static_cast<int>(*draws);
+        const auto seed = wholeNumber(m_view.text(C::txtSeed));
+        if (!seed || *seed < 0) {
+            message(economicstext::faultSeed(), C::txtSeed);
+            return;
+        }
+        s.seed = static_cast<std::uint64_t>(*seed);
+        for (const C c : {C::txtPriceSpread, C::txtCostSpread}) {
+            const QString typed = m_view.text(c).trimmed();
+            const double percent = shell::val(typed);
+            if (!shell::isNumeric(typed) || percent < 0.0 || percent > 100.0) {
+                message(economicstext::faultSpread(), c);
+                return;
+            }
+            (c == C::txtPriceSpread ? s.priceSpread : s.costSpread) = percent / 100.0;
+        }
+        const QString low = m_view.text(C::txtRateLow).trimmed();
+        const QString high = m_view.text(C::txtRateHigh).trimmed();
+        if (!shell::isNumeric(low) || !shell::isNumeric(high) || !(shell::val(low) > 0.0) ||
+            !(shell::val(low) < shell::val(high))) {
+            message(economicstext::faultRateRange(), C::txtRateLow);
+            return;
+        }
+        s.rateLow = shell::val(low);
+        s.rateHigh = shell::val(high);
+        m_monteCarlo = rotation::monteCarlo(*m_path, m_rotation, m_economics, s);
+        const rotation::MonteCarloResult &r = *m_monteCarlo;
+        m_view.setText(C::lblMonteCarlo, QStringLiteral("NPV P5 ") + euroText(r.npv.p5) +
+                                             QStringLiteral(" · P50 ") + euroText(r.npv.p50) +
+                                             QStringLiteral(" · P95 ") + euroText(r.npv.p95) +
+                                             QStringLiteral(" €/ha · P(NPV < 0) = ") +
+                                             quantityText(r.probabilityNpvBelowZero * 100.0, 1) +
+                                             QStringLiteral(" % · ") + quantityText(s.draws, 0) +
+                                             QStringLiteral(" draws at rates from ") +
+                                             percentText(s.rateLow) + QStringLiteral(" to ") +
+                                             percentText(s.rateHigh) + QStringLiteral(" % a year"));
+        m_view.monteCarloChanged();
+    });
+}
+
+void EconomicsWindowLogic::cmdOptimise_Click() {
+    shell::guard(m_main.errorLog(), QStringLiteral(" in frmEconomics.cmdOptimise_Click()"), [&] {
+        if (m_optimising) {
+            return;
+        }
+        if (!m_path || !m_value) {
+            message(economicstext::noStand(), C::txtInterestRate);
+            return;
+        }
+        struct Job {
+            rotation::Stand stand;
+            rotation::Economics economics;
+            rotation::OptimiserSettings settings;
+            std::optional<rotation::OptimiserResult> result;
+            rotation::GrowthFailure failure;
+        };
+        auto job = std::make_shared<Job>();
+        job->stand = m_stand;
+        job->economics = m_economics;
+        m_optimising = true;
+        m_cancel = false;
+        for (const C c : {C::cmdOptimise, C::cmdApply, C::cmdCompute, C::cmdMonteCarlo}) {
+            m_view.setEnabled(c, false);
+        }
+        m_view.setEnabled(C::cmdCancel, true);
+        m_view.setText(C::lblOptimiser, QStringLiteral("Searching…"));
+        m_view.setProgress(0.0);
+        m_view.runInBackground(
+            [this, job] {
+                // Each thread grows with an engine of its own.
+                try {
+                    engine::Grow grow;
+                    job->result =
+                        rotation::optimise(grow, job->stand, job->economics, job->settings,
+                                           job->failure, [this](double fraction) {
+                                               m_view.setProgress(fraction);
+                                               return !m_cancel.load();
+                                           });
+                } catch (const std::exception &e) {
+                    job->result.reset();
+                    job->failure.text = e.what();
+                }
+            },
+            [this, job] {
+                m_optimising = false;
+                for (const C c : {C::cmdOptimise, C::cmdCompute, C::cmdMonteCarlo}) {
+                    m_view.setEnabled(c, true);
+                }
+                m_view.setEnabled(C::cmdCancel, false);
+                if (!job->result) {
+                    m_view.setText(C::lblOptimiser, QString());
+                    message(economicstext::optimiserFailed() +
+                                QString::fromStdString(job->failure.text),
+                            C::cmdOptimise);
+                    return;
+                }
+                m_best = job->result->best;
+                m_chosen = 1;
+                m_view.setEnabled(C::cmdApply, !m_best.empty());
+                const QString grown = quantityText(job->result->regimesGrown, 0);
+                m_view.setText(C::lblOptimiser,
+                               job->result->completed
+                                   ? grown + QStringLiteral(" regimes grown and valued at ") +
+                                         rateText() + QStringLiteral(" % a year.")
+                                   : QStringLiteral("Cancelled after ") + grown +
+                                         QStringLiteral(" regimes: the best found so far."));
+                m_view.regimesChanged();
+            });
+    });
+}
+
+std::vector<QStringList> EconomicsWindowLogic::regimeGrid() const {
+    std::vector<QStringList> grid{economicstext::regimeHeaders()};
+    const auto row = [&](const QString &rank, const rotation::Candidate &c) {
+        const rotation::Regime &g = c.regime;
+        QStringList cells{rank};
+        if (g.thins()) {
+            cells << QString::number(g.thinFrom)
+                  << (g.thinUntil.value_or(g.thinFrom) > g.thinFrom ? QString::number(g.thinEvery)
+                                                                    : QString())
+                  << quantityText(g.thinVolume, g.thinVolume == std::round(g.thinVolume) ? 0 : 1)
+                  << QString::number(g.thinUntil.value_or(g.thinFrom));
+        } else {
+            cells << economicstext::noThinning() << QString() << QString() << QString();
+        }
+        cells << QString::number(c.rotation) << euroText(c.lev) << euroText(c.npv)
+              << quantityText(c.volume, 0)
+              << (m_yours ? euroText(c.lev - m_yours->lev) : economicstext::noFigure());
+        return cells;
+    };
+    for (std::size_t i = 0; i < m_best.size(); ++i) {
+        grid.push_back(row(QString::number(i + 1), m_best[i]));
+    }
+    if (m_yours) {
+        grid.push_back(row(economicstext::regimeYours(), *m_yours));
+    }
+    return grid;
+}
+
+QString EconomicsWindowLogic::figuresText() const {
+    QString lines;
+    for (int c = static_cast<int>(C::lblStand); c <= static_cast<int>(C::lblMonteCarlo); ++c) {
+        lines += economicsControlName(static_cast<C>(c)) + QLatin1Char('\t') +
+                 m_view.text(static_cast<C>(c)) + QLatin1Char('\n');
+    }
+    return lines;
+}
+
+void EconomicsWindowLogic::typeText(EconomicsControl control, const QString &typed) {
+    m_view.setText(control, typed);
+}
+
+bool EconomicsWindowLogic::press(EconomicsControl control) {
+    switch (control) {
+    case C::cmdCompute:
+        cmdCompute_Click();
+        return true;
+    case C::cmdOptimise:
+        cmdOptimise_Click();
+        return true;
+    case C::cmdCancel:
+        cmdCancel_Click();
+        return true;
+    case C::cmdApply:
+        cmdApply_Click(m_chosen);
+        return true;
+    case C::cmdMonteCarlo:
+        cmdMonteCarlo_Click();
+        return true;
+    case C::cmdClose:
+        cmdClose_Click();
+        return true;
+    default:
+        return false;
+    }
+}
+
+} // namespace arbolex::economics

@@ -1,0 +1,125 @@
+#pragma once
+
+// The logic of the economics window `frmEconomics`: the value of the rotation
+// in the projection table (NPV, LEV, annuity, forest value, IRR, break-even
+// price), the rotation explorer, the regime optimiser and its "Apply", the
+// tornado and the Monte Carlo draws. Every figure comes from the rotation
+// library for the stand, regime and final cut the table holds.
+
+#include "economics/ieconomicsview.hpp"
+#include "economics/tableregime.hpp"
+#include "rotation/optimiser.hpp"
+#include "rotation/rotation.hpp"
+#include "rotation/uncertainty.hpp"
+
+#include <QString>
+
+#include <atomic>
+#include <memory>
+#include <optional>
+#include <vector>
+
+namespace arbolex::shell {
+class IInteractive;
+}
+
+namespace arbolex::thinning {
+class ThinWindowLogic;
+}
+
+namespace arbolex::workflow {
+class MainWindowLogic;
+}
+
+namespace arbolex::economics {
+
+class EconomicsWindowLogic {
+public:
+    EconomicsWindowLogic(workflow::MainWindowLogic &main, thinning::ThinWindowLogic &thin,
+                         IEconomicsView &view, shell::IInteractive &interactive);
+
+    /// The main window's "Economics…": loads the window and shows it.
+    void cmdEconomics_Click();
+    /// The window's load: the interest rate of the cash flow, the defaults of
+    /// the draws, then the figures.
+    void Form_Load();
+    /// "Compute": reads the rate and the costs, derives the stand, the regime
+    /// and the final cut from the table, and values them.
+    void cmdCompute_Click();
+    /// "Optimise": searches the regimes away from the window's thread.
+    void cmdOptimise_Click();
+    /// "Cancel": the search stops at its next report of progress.
+    void cmdCancel_Click() { m_cancel = true; }
+    /// "Apply": writes regime `rank` (1 = best) into the projection table
+    /// through the main window's and the thinning window's commands.
+    void cmdApply_Click(int rank);
+    /// "Run": the Monte Carlo draws of the rotation valued.
+    void cmdMonteCarlo_Click();
+    void cmdClose_Click() { m_view.close(); }
+
+    /// Types `text` into a field, as the runner and the tests do.
+    void typeText(EconomicsControl control, const QString &text);
+    /// Presses the command `control` (Apply takes the chosen rank); false when
+    /// it is no command.
+    bool press(EconomicsControl control);
+    /// The regime Apply writes (1 = best).
+    void chooseRegime(int rank) { m_chosen = rank; }
+    int chosenRegime() const { return m_chosen; }
+
+    // ---- What the window shows -------------------------------------------------------
+
+    /// True once the figures of a rotation are shown.
+    bool valued() const { return m_value.has_value(); }
+    const rotation::Stand &stand() const { return m_stand; }
+    const rotation::Regime &regime() const { return m_table.regime; }
+    int rotationAge() const { return m_rotation; }
+    const rotation::Economics &economics() const { return m_economics; }
+    const std::optional<rotation::RotationValue> &value() const { return m_value; }
+    const rotation::RotationExplorer &explorer() const { return m_explorer; }
+    const std::vector<rotation::TornadoBar> &tornado() const { return m_tornado; }
+    const std::optional<rotation::MonteCarloResult> &monteCarlo() const { return m_monteCarlo; }
+    /// The optimiser's regimes, best first, and the user's own as it scores.
+    const std::vector<rotation::Candidate> &regimes() const { return m_best; }
+    const std::optional<rotation::Candidate> &yourRegime() const { return m_yours; }
+    bool optimising() const { return m_optimising; }
+    /// The optimiser's table as shown: headers, the regimes, then the user's.
+    std::vector<QStringList> regimeGrid() const;
+    /// The rate the figures used, as shown ("3.00").
+    QString rateText() const;
+    /// Every figure as "name<TAB>text" lines, for the runner.
+    QString figuresText() const;
+
+    IEconomicsView &view() { return m_view; }
+
+private:
+    void message(const QString &text, EconomicsControl focus);
+    bool readEconomics();
+    bool readStand();
+    void showFigures();
+    void clearFigures(const QString &why);
+
+    workflow::MainWindowLogic &m_main;
+    thinning::ThinWindowLogic &m_thin;
+    IEconomicsView &m_view;
+    shell::IInteractive &m_interactive;
+
+    rotation::Stand m_stand;
+    TableRegime m_table;
+    rotation::Economics m_economics;
+    int m_rotation = 0;
+    /// The engine of the figures; the optimiser grows with one of its own.
+    engine::Grow m_grow;
+    std::optional<rotation::GrowthPath> m_path;
+    std::optional<rotation::RotationValue> m_value;
+    rotation::RotationExplorer m_explorer;
+    std::vector<rotation::TornadoBar> m_tornado;
+    std::optional<rotation::MonteCarloResult> m_monteCarlo;
+
+    std::vector<rotation::Candidate> m_best;
+    std::optional<rotation::Candidate> m_yours;
+    int m_chosen = 1;
+    bool m_optimising = false;
+    std::atomic<bool> m_cancel{false};
+};
+
+} // namespace arbolex::economics

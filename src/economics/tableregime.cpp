@@ -1,0 +1,125 @@
+#include "economics/tableregime.hpp"
+
+#include "workflow/projectiontable.hpp"
+
+#include <QLocale>
+
+#include <algorithm>
+#include <cmath>
+#include <numeric>
+
+namespace arbolex::economics {
+
+namespace {
+
+/// Removals closer than this count as the same volume, m³/ha: the volume
+/// method leaves the typed removal up to single-precision rounding.
+constexpr float kSameVolume = 0.05f;
+
+int wholeAge(float age) {
+    return static_cast<int>(std::nearbyint(age));
+}
+
+QString volumeText(double volume) {
+    return QLocale(QLocale::English).toString(volume, 'f', volume == std::round(volume) ? 0 : 1);
+}
+
+/// "20, 25 and 30"
+QString ageList(const std::vector<int> &ages) {
+    QString list;
+    for (std::size_t i = 0; i < ages.size(); ++i) {
+        if (i > 0) {
+            list += i + 1 == ages.size() ? QStringLiteral(" and ") : QStringLiteral(", ");
+        }
+        list += QString::number(ages[i]);
+    }
+    return list;
+}
+
+} // namespace
+
+std::optional<rotation::Stand> standFromTable(const workflow::ProjectionTable &table,
+                                              std::int16_t model) {
+    for (int r = 1; r <= table.lastRow(); ++r) {
+        const workflow::TableRow &row = table.row(r);
+        if (row.isGrowth()) {
+            // The stand before any thinning of that age.
+            const workflow::RowRecord &s = row.record;
+            return rotation::Stand{model, s.age, s.stocking + s.removedStocking, s.topHeight,
+                                   s.basalArea + s.removedBasalArea};
+        }
+    }
+    return std::nullopt;
+}
+
+TableRegime regimeFromTable(const workflow::ProjectionTable &table) {
+    TableRegime t;
+    for (int r = 1; r <= table.lastRow(); ++r) {
+        const workflow::TableRow &row = table.row(r);
+        if (row.finalCut) {
+            t.finalCut = wholeAge(row.record.age);
+        } else if (row.isThinning()) {
+            t.ages.push_back(wholeAge(row.record.age));
+            t.volumes.push_back(row.record.removedVolume);
+        }
+    }
+    // A thinning in the year of the final cut is part of the final cut.
+    while (t.finalCut && !t.ages.empty() && t.ages.back() >= *t.finalCut) {
+        t.ages.pop_back();
+        t.volumes.pop_back();
+    }
+    if (t.ages.empty()) {
+        return t;
+    }
+    const auto n = static_cast<int>(t.ages.size());
+    const float mean = std::accumulate(t.volumes.begin(), t.volumes.end(), 0.0f) /
+                       static_cast<float>(t.volumes.size());
+    const auto [lightest, heaviest] = std::minmax_element(t.volumes.begin(), t.volumes.end());
+    bool sameIntervals = true;
+    for (int i = 2; i < n; ++i) {
+        sameIntervals = sameIntervals && t.ages[static_cast<std::size_t>(i)] -
+                                                 t.ages[static_cast<std::size_t>(i - 1)] ==
+                                             t.ages[1] - t.ages[0];
+    }
+    t.irregular = !sameIntervals || *heaviest - *lightest > kSameVolume;
+    t.regime.thinFrom = t.ages.front();
+    t.regime.thinUntil = t.ages.back();
+    t.regime.thinEvery =
+        n > 1 ? std::max(1, static_cast<int>(std::nearbyint(
+                                static_cast<double>(t.ages.back() - t.ages.front()) / (n - 1))))
+              : 1;
+    // Read back to the hundredth of a m³/ha, so a typed removal comes back as typed.
+    t.regime.thinVolume = std::round((t.irregular ? mean : t.volumes.front()) * 100.0f) / 100.0f;
+    return t;
+}
+
+QString describeRegime(const rotation::Regime &regime, int rotation) {
+    const QString cut =
+        QStringLiteral("final cut at ") + QString::number(rotation) + QStringLiteral(" years");
+    if (!regime.thins()) {
+        return QStringLiteral("No thinning; ") + cut + QLatin1Char('.');
+    }
+    std::vector<int> ages;
+    const int until = regime.thinUntil.value_or(rotation - 1);
+    for (int a = regime.thinFrom; a <= until && a < rotation; a += regime.thinEvery) {
+        ages.push_back(a);
+    }
+    return QStringLiteral("Thinning ") + volumeText(regime.thinVolume) +
+           QStringLiteral(" m³/ha at ") + ageList(ages) + QStringLiteral(" years; ") + cut +
+           QLatin1Char('.');
+}
+
+QString irregularNote(const TableRegime &t) {
+    if (!t.irregular) {
+        return {};
+    }
+    const auto [lightest, heaviest] = std::minmax_element(t.volumes.begin(), t.volumes.end());
+    return QStringLiteral("Your thinnings are irregular (at ") + ageList(t.ages) +
+           QStringLiteral(" years, ") + volumeText(*lightest) + QStringLiteral(" to ") +
+           volumeText(*heaviest) +
+           QStringLiteral(" m³/ha). Valued as a regular regime: their mean interval, ") +
+           QString::number(t.regime.thinEvery) + QStringLiteral(" years, and their mean volume, ") +
+           volumeText(t.regime.thinVolume) + QStringLiteral(" m³/ha.");
+}
+
+} // namespace arbolex::economics

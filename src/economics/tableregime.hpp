@@ -1,0 +1,48 @@
+#pragma once
+
+// The user's own rotation read back from the projection table: the stand of
+// its first row, the regime of its thinning rows and the age of its final cut,
+// in the terms of the rotation library.
+
+#include "rotation/rotation.hpp"
+
+#include <QString>
+
+#include <optional>
+#include <vector>
+
+namespace arbolex::workflow {
+class ProjectionTable;
+}
+
+namespace arbolex::economics {
+
+/// The regime the thinning rows describe.
+struct TableRegime {
+    rotation::Regime regime;
+    /// Ages of the thinning rows, years, oldest first.
+    std::vector<int> ages;
+    /// Volume each removed, m³/ha.
+    std::vector<float> volumes;
+    /// True when the intervals or the volumes differ: `regime` then takes
+    /// their mean interval (rounded) and mean volume.
+    bool irregular = false;
+    /// Age of the final cut of the table, when it has one.
+    std::optional<int> finalCut;
+};
+
+/// The stand of the table's first growth row, of model `model`; std::nullopt
+/// for a table without one.
+std::optional<rotation::Stand> standFromTable(const workflow::ProjectionTable &table,
+                                              std::int16_t model);
+
+/// The regime of the table's thinning rows before its final cut.
+TableRegime regimeFromTable(const workflow::ProjectionTable &table);
+
+/// "40 m³/ha at 20, 25 and 30 years", or "no thinning".
+QString describeRegime(const rotation::Regime &regime, int rotation);
+
+/// What was assumed for irregular thinnings, empty for a regular regime.
+QString irregularNote(const TableRegime &regime);
+
+} // namespace arbolex::economics

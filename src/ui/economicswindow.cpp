@@ -1,0 +1,445 @@
+#include "ui/economicswindow.hpp"
+
+#include "economics/economicsformat.hpp"
+#include "economics/economicsmessages.hpp"
+#include "economics/economicswindowlogic.hpp"
+#include "ui/economicscharts.hpp"
+#include "ui/fieldinput.hpp"
+#include "ui/stringgridmodel.hpp"
+
+#include <QApplication>
+#include <QChart>
+#include <QChartView>
+#include <QFormLayout>
+#include <QGroupBox>
+#include <QHBoxLayout>
+#include <QHeaderView>
+#include <QLabel>
+#include <QLineEdit>
+#include <QProgressBar>
+#include <QPushButton>
+#include <QScreen>
+#include <QTabWidget>
+#include <QTableView>
+#include <QThread>
+#include <QVBoxLayout>
+
+namespace arbolex::ui {
+
+using economics::EconomicsControl;
+using C = economics::EconomicsControl;
+namespace et = economics::economicstext;
+
+namespace {
+
+std::size_t slot(EconomicsControl c) {
+    return static_cast<std::size_t>(c);
+}
+
+QChartView *chartView(QWidget *parent) {
+    auto *view = new QChartView(new QChart, parent);
+    view->setRenderHint(QPainter::Antialiasing);
+    view->setMinimumSize(420, 300);
+    return view;
+}
+
+/// A row of "caption field" pairs.
+QHBoxLayout *fieldRow(const std::vector<std::pair<QString, QWidget *>> &fields) {
+    auto *row = new QHBoxLayout;
+    row->setSpacing(6);
+    for (const auto &[caption, widget] : fields) {
+        auto *label = new QLabel(caption);
+        label->setBuddy(widget);
+        row->addWidget(label);
+        row->addWidget(widget);
+        row->addSpacing(10);
+    }
+    return row;
+}
+
+} // namespace
+
+EconomicsWindow::EconomicsWindow(QWidget *main) : QDialog(main) {
+    setObjectName(QStringLiteral("frmEconomics"));
+    setWindowTitle(et::economicsCaption());
+    setModal(false);
+
+    auto *layout = new QVBoxLayout(this);
+    layout->setContentsMargins(14, 12, 14, 12);
+    layout->setSpacing(8);
+
+    QLabel *stand = label(C::lblStand);
+    QFont big = stand->font();
+    big.setBold(true);
+    big.setPointSizeF(big.pointSizeF() * 1.15);
+    stand->setFont(big);
+    layout->addWidget(stand);
+    QLabel *regime = label(C::lblRegime);
+    regime->setWordWrap(true);
+    layout->addWidget(regime);
+    QLabel *rate = label(C::lblRate);
+    rate->setStyleSheet(QStringLiteral("color: #4a4a4a;"));
+    layout->addWidget(rate);
+
+    QHBoxLayout *inputs =
+        fieldRow({{et::labelInterestRate(), field(C::txtInterestRate, 7)},
+                  {et::labelEstablishmentCost(), field(C::txtEstablishmentCost, 8)},
+                  {et::labelAnnualCost(), field(C::txtAnnualCost, 6)}});
+    inputs->addWidget(button(C::cmdCompute, et::buttonCompute()));
+    inputs->addStretch(1);
+    layout->addLayout(inputs);
+
+    m_tabs = new QTabWidget(this);
+    m_tabs->addTab(buildRotationTab(), et::tabRotation());
+    m_tabs->addTab(buildOptimiserTab(), et::tabOptimiser());
+    m_tabs->addTab(buildSensitivityTab(), et::tabSensitivity());
+    m_tabs->addTab(buildMonteCarloTab(), et::tabMonteCarlo());
+    layout->addWidget(m_tabs, 1);
+
+    auto *bottom = new QHBoxLayout;
+    bottom->addStretch(1);
+    bottom->addWidget(button(C::cmdClose, et::buttonClose()));
+    layout->addLayout(bottom);
+
+    for (const C c : {C::txtInterestRate, C::txtEstablishmentCost, C::txtAnnualCost}) {
+        connect(qobject_cast<QLineEdit *>(control(c)), &QLineEdit::returnPressed, this, [this] {
+            if (m_logic != nullptr) {
+                m_logic->cmdCompute_Click();
+            }
+        });
+    }
+    for (const C c : {C::txtDraws, C::txtSeed, C::txtPriceSpread, C::txtRateLow, C::txtRateHigh,
+                      C::txtCostSpread}) {
+        connect(qobject_cast<QLineEdit *>(control(c)), &QLineEdit::returnPressed, this, [this] {
+            if (m_logic != nullptr) {
+                m_logic->cmdMonteCarlo_Click();
+            }
+        });
+    }
+}
+
+EconomicsWindow::~EconomicsWindow() {
+    if (m_worker != nullptr) {
+        m_worker->wait();
+    }
+}
+
+void EconomicsWindow::waitForWork() {
+    if (m_worker != nullptr) {
+        if (m_logic != nullptr) {
+            m_logic->cmdCancel_Click();
+        }
+        m_worker->wait();
+    }
+}
+
+QWidget *EconomicsWindow::buildRotationTab() {
+    auto *tab = new QWidget;
+    auto *row = new QHBoxLayout(tab);
+    row->setSpacing(12);
+    auto *figures = new QGroupBox;
+    m_valueBox = figures;
+    figures->setObjectName(QStringLiteral("fraValue"));
+    auto *form = new QFormLayout(figures);
+    form->setLabelAlignment(Qt::AlignLeft);
+    form->setRowWrapPolicy(QFormLayout::DontWrapRows);
+    form->setVerticalSpacing(9);
+    const std::pair<QString, C> rows[] = {
+        {et::figureNpv(), C::lblNPV},
+        {et::figureLev(), C::lblLEV},
+        {et::figureEaa(), C::lblEAA},
+        {et::figureForestValue(), C::lblForestValue},
+        {et::figureIrr(), C::lblIRR},
+        {et::figureBreakEven(), C::lblBreakEven},
+        {et::figureRotation(), C::lblRotation},
+        {et::figureBiological(), C::lblBiological},
+        {et::figureEconomic(), C::lblEconomic},
+        {et::figureMai(), C::lblMAI},
+        {et::figureYieldClass(), C::lblYieldClass},
+    };
+    for (const auto &[caption, c] : rows) {
+        QLabel *value = label(c);
+        value->setWordWrap(true);
+        value->setMinimumWidth(230);
+        if (c == C::lblNPV || c == C::lblLEV) {
+            QFont bold = value->font();
+            bold.setBold(true);
+            value->setFont(bold);
+        }
+        form->addRow(new QLabel(caption + QLatin1Char(':')), value);
+    }
+    auto *notes = new QLabel(et::figureNotes());
+    notes->setWordWrap(true);
+    notes->setStyleSheet(QStringLiteral("color: #4a4a4a;"));
+    form->addRow(notes);
+    figures->setFixedWidth(490);
+    row->addWidget(figures);
+    m_rotationChart = chartView(tab);
+    row->addWidget(m_rotationChart, 1);
+    return tab;
+}
+
+QWidget *EconomicsWindow::buildOptimiserTab() {
+    auto *tab = new QWidget;
+    auto *column = new QVBoxLayout(tab);
+    column->setSpacing(8);
+    m_optimiserTitle = new QLabel;
+    QFont bold = m_optimiserTitle->font();
+    bold.setBold(true);
+    m_optimiserTitle->setFont(bold);
+    column->addWidget(m_optimiserTitle);
+    auto *run = new QHBoxLayout;
+    run->addWidget(button(C::cmdOptimise, et::buttonOptimise()));
+    m_progress = new QProgressBar(tab);
+    m_progress->setRange(0, 1000);
+    m_progress->setValue(0);
+    m_progress->setFormat(QStringLiteral("%p %"));
+    run->addWidget(m_progress, 1);
+    run->addWidget(button(C::cmdCancel, et::buttonCancel()));
+    column->addLayout(run);
+    column->addWidget(label(C::lblOptimiser));
+    m_regimes = new QTableView(tab);
+    m_regimes->setObjectName(QStringLiteral("grdRegimes"));
+    m_regimes->setSelectionBehavior(QAbstractItemView::SelectRows);
+    m_regimes->setSelectionMode(QAbstractItemView::SingleSelection);
+    m_regimes->setEditTriggers(QAbstractItemView::NoEditTriggers);
+    m_regimes->setAlternatingRowColors(true);
+    m_regimes->verticalHeader()->hide();
+    m_regimes->horizontalHeader()->setDefaultAlignment(
+        Qt::Alignment::fromInt(Qt::AlignCenter | Qt::TextWordWrap));
+    m_regimes->horizontalHeader()->setSectionResizeMode(QHeaderView::Stretch);
+    m_regimes->horizontalHeader()->setMinimumSectionSize(60);
+    const int headerHeight = m_regimes->fontMetrics().height() * 2 + 14;
+    m_regimes->horizontalHeader()->setFixedHeight(headerHeight);
+    // Five regimes and the user's: the table is as tall as its rows.
+    const int rowHeight = m_regimes->verticalHeader()->defaultSectionSize();
+    m_regimes->setFixedHeight(headerHeight + 6 * rowHeight + 2 * m_regimes->frameWidth() + 2);
+    column->addWidget(m_regimes);
+    const rotation::OptimiserSettings search;
+    auto *notes =
+        new QLabel(et::optimiserNotes(economics::quantityText(search.maxRemovalShare * 100.0, 0),
+                                      economics::quantityText(search.minStocking, 0)));
+    notes->setWordWrap(true);
+    notes->setStyleSheet(QStringLiteral("color: #4a4a4a;"));
+    column->addWidget(notes);
+    column->addStretch(1);
+    auto *apply = new QHBoxLayout;
+    QWidget *applyButton = button(C::cmdApply, et::buttonApply());
+    applyButton->setToolTip(et::hintApply());
+    apply->addWidget(applyButton);
+    auto *hint = new QLabel(et::hintApply());
+    hint->setStyleSheet(QStringLiteral("color: #4a4a4a;"));
+    apply->addWidget(hint, 1);
+    column->addLayout(apply);
+    return tab;
+}
+
+QWidget *EconomicsWindow::buildSensitivityTab() {
+    auto *tab = new QWidget;
+    auto *row = new QHBoxLayout(tab);
+    m_tornadoNpv = chartView(tab);
+    m_tornadoLev = chartView(tab);
+    row->addWidget(m_tornadoNpv, 1);
+    row->addWidget(m_tornadoLev, 1);
+    return tab;
+}
+
+QWidget *EconomicsWindow::buildMonteCarloTab() {
+    auto *tab = new QWidget;
+    auto *column = new QVBoxLayout(tab);
+    QHBoxLayout *inputs = fieldRow({{et::labelDraws(), field(C::txtDraws, 7)},
+                                    {et::labelSeed(), field(C::txtSeed, 5)},
+                                    {et::labelPriceSpread(), field(C::txtPriceSpread, 4)},
+                                    {et::labelRateFrom(), field(C::txtRateLow, 5)},
+                                    {et::labelRateTo(), field(C::txtRateHigh, 5)},
+                                    {et::labelCostSpread(), field(C::txtCostSpread, 4)}});
+    inputs->addWidget(button(C::cmdMonteCarlo, et::buttonRun()));
+    inputs->addStretch(1);
+    column->addLayout(inputs);
+    QLabel *summary = label(C::lblMonteCarlo);
+    QFont bold = summary->font();
+    bold.setBold(true);
+    summary->setFont(bold);
+    column->addWidget(summary);
+    m_histogram = chartView(tab);
+    column->addWidget(m_histogram, 1);
+    return tab;
+}
+
+QWidget *EconomicsWindow::field(EconomicsControl c, int characters) {
+    auto *edit = new QLineEdit(this);
+    edit->setObjectName(economics::economicsControlName(c));
+    edit->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
+    edit->setFixedWidth(edit->fontMetrics().horizontalAdvance(QString(characters, u'0')) + 16);
+    m_controls.at(slot(c)) = edit;
+    return edit;
+}
+
+QLabel *EconomicsWindow::label(EconomicsControl c) {
+    auto *l = new QLabel(this);
+    l->setObjectName(economics::economicsControlName(c));
+    l->setTextInteractionFlags(Qt::TextSelectableByMouse);
+    m_controls.at(slot(c)) = l;
+    return l;
+}
+
+QWidget *EconomicsWindow::button(EconomicsControl c, const QString &caption) {
+    auto *b = new QPushButton(caption, this);
+    b->setObjectName(economics::economicsControlName(c));
+    b->setAutoDefault(false);
+    m_controls.at(slot(c)) = b;
+    connect(b, &QPushButton::clicked, this, [this, c] {
+        if (m_logic != nullptr) {
+            m_logic->press(c);
+        }
+    });
+    return b;
+}
+
+void EconomicsWindow::attach(economics::EconomicsWindowLogic &logic) {
+    m_logic = &logic;
+    m_regimeModel = new StringGridModel([&logic] { return logic.regimeGrid(); }, this);
+    m_regimeModel->setTextColumns({0});
+    m_regimes->setModel(m_regimeModel);
+    // The rank is short; the figures share the rest.
+    m_regimes->horizontalHeader()->setSectionResizeMode(0, QHeaderView::ResizeToContents);
+    connect(m_regimes->selectionModel(), &QItemSelectionModel::currentRowChanged, this,
+            [this](const QModelIndex &current) {
+                if (m_logic != nullptr && current.isValid() &&
+                    current.row() < static_cast<int>(m_logic->regimes().size())) {
+                    m_logic->chooseRegime(current.row() + 1);
+                }
+            });
+}
+
+QWidget *EconomicsWindow::control(EconomicsControl c) const {
+    return m_controls.at(slot(c));
+}
+
+QString EconomicsWindow::text(EconomicsControl c) const {
+    if (auto *edit = qobject_cast<QLineEdit *>(control(c))) {
+        return edit->text();
+    }
+    if (auto *l = qobject_cast<QLabel *>(control(c))) {
+        return l->text();
+    }
+    if (auto *b = qobject_cast<QPushButton *>(control(c))) {
+        return b->text();
+    }
+    return {};
+}
+
+void EconomicsWindow::setText(EconomicsControl c, const QString &value) {
+    if (auto *edit = qobject_cast<QLineEdit *>(control(c))) {
+        edit->setText(value);
+    } else if (auto *l = qobject_cast<QLabel *>(control(c))) {
+        l->setText(value);
+    } else if (auto *b = qobject_cast<QPushButton *>(control(c))) {
+        b->setText(value);
+    }
+}
+
+void EconomicsWindow::setEnabled(EconomicsControl c, bool enabled) {
+    control(c)->setEnabled(enabled);
+}
+
+void EconomicsWindow::focus(EconomicsControl c) {
+    focusControl(control(c));
+}
+
+void EconomicsWindow::showChart(QChartView *view, QChart *chart) {
+    QChart *old = view->chart();
+    view->setChart(chart);
+    delete old;
+}
+
+void EconomicsWindow::figuresChanged() {
+    if (m_logic == nullptr) {
+        return;
+    }
+    const QString rate = et::atRate(m_logic->rateText());
+    m_valueBox->setTitle(et::panelValue() + QLatin1Char(' ') + rate);
+    showChart(m_rotationChart,
+              rotationChart(m_logic->explorer(), et::panelRotations() + QLatin1Char(' ') + rate));
+    const auto &value = m_logic->value();
+    if (value && value->npv && value->lev) {
+        showChart(m_tornadoNpv, tornadoChart(m_logic->tornado(), *value->npv, false,
+                                             et::panelTornadoNpv() + QLatin1Char(' ') + rate));
+        showChart(m_tornadoLev, tornadoChart(m_logic->tornado(), *value->lev, true,
+                                             et::panelTornadoLev() + QLatin1Char(' ') + rate));
+    } else {
+        showChart(m_tornadoNpv, new QChart);
+        showChart(m_tornadoLev, new QChart);
+    }
+    regimesChanged();
+}
+
+void EconomicsWindow::regimesChanged() {
+    if (m_logic == nullptr) {
+        return;
+    }
+    m_optimiserTitle->setText(et::panelOptimiser() + QLatin1Char(' ') +
+                              et::atRate(m_logic->rateText()));
+    m_regimeModel->setBoldFrom(static_cast<int>(m_logic->regimes().size()));
+    m_regimeModel->refresh();
+    if (!m_logic->regimes().empty()) {
+        m_regimes->selectRow(m_logic->chosenRegime() - 1);
+    }
+}
+
+void EconomicsWindow::monteCarloChanged() {
+    if (m_logic == nullptr) {
+        return;
+    }
+    if (const auto &result = m_logic->monteCarlo()) {
+        showChart(m_histogram, histogramChart(*result, et::panelMonteCarlo() +
+                                                           QStringLiteral(" (rate drawn "
+                                                                          "from ") +
+                                                           m_logic->view().text(C::txtRateLow) +
+                                                           QStringLiteral(" to ") +
+                                                           m_logic->view().text(C::txtRateHigh) +
+                                                           QStringLiteral(" % a year)")));
+    } else {
+        showChart(m_histogram, new QChart);
+    }
+}
+
+void EconomicsWindow::setProgress(double fraction) {
+    // Called from the optimiser's thread: the bar moves on the window's.
+    const int value = qRound(fraction * 1000.0);
+    QMetaObject::invokeMethod(
+        m_progress, [bar = m_progress, value] { bar->setValue(value); }, Qt::QueuedConnection);
+}
+
+void EconomicsWindow::runInBackground(std::function<void()> work, std::function<void()> done) {
+    m_worker = QThread::create(std::move(work));
+    connect(m_worker, &QThread::finished, this, [this, done = std::move(done)] {
+        m_worker->deleteLater();
+        m_worker = nullptr;
+        done();
+    });
+    m_worker->start();
+}
+
+void EconomicsWindow::showWindow() {
+    if (!isVisible()) {
+        const QRect screen = parentWidget() != nullptr
+                                 ? parentWidget()->screen()->availableGeometry()
+                                 : QApplication::primaryScreen()->availableGeometry();
+        resize(std::min(screen.width() - 40, 1200), std::min(screen.height() - 40, 780));
+        move(screen.center() - rect().center());
+    }
+    show();
+    raise();
+    activateWindow();
+}
+
+void EconomicsWindow::close() {
+    hide();
+}
+
+bool EconomicsWindow::isShown() const {
+    return isVisible();
+}
+
+} // namespace arbolex::ui

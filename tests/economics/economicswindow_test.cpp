@@ -1,0 +1,217 @@
+// The economics window: its figures are the rotation library's for the stand,
+// regime and final cut of the table; bad input keeps what is shown; the
+// optimiser can be cancelled; Apply writes what a user would have typed.
+#include "thinning/thinningfixture.hpp"
+
+#include "economics/economicsformat.hpp"
+#include "economics/economicsmessages.hpp"
+#include "economics/economicswindowlogic.hpp"
+#include "economics/prices.hpp"
+
+namespace arbolex::testing {
+namespace {
+
+using economics::EconomicsControl;
+using workflow::MainControl;
+
+class EconomicsWindowTest : public ThinningTest {
+protected:
+    /// Thins `volumes[i]` at `ages[i]` from the young stand grown by 5 years,
+    /// then grows to `finalCut` and fells there (0: no final cut).
+    void typeRotation(const std::vector<int> &ages, const std::vector<QString> &volumes,
+                      int finalCut) {
+        // A step of 5 years, or the whole span when it is shorter.
+        const auto growTo = [&](int from, int to) {
+            type(MainControl::txtToA, QString::number(to));
+            type(MainControl::txtByA, QString::number(std::min(5, to - from)));
+            logic.cmdGrow_Click();
+        };
+        logic.cmdClear_Click();
+        typeStand();
+        growTo(15, ages.front());
+        for (std::size_t i = 0; i < ages.size(); ++i) {
+            if (i > 0) {
+                growTo(ages[i - 1], ages[i]);
+                interactive.answers.append(false); // no thinning loop
+            }
+            logic.cmdThin_Click();
+            typeThin(ThinControl::txtRemV, volumes[i]);
+            thin.cmdThin_Click();
+            thin.cmdAccept_Click();
+        }
+        if (finalCut > 0) {
+            growTo(ages.back(), finalCut);
+            logic.cmdFinalCut_Click();
+        }
+    }
+
+    std::vector<QStringList> tableCells() const {
+        std::vector<QStringList> all;
+        for (int r = 1; r <= logic.table().lastRow(); ++r) {
+            all.push_back(logic.table().row(r).cells);
+        }
+        return all;
+    }
+
+    economics::HeadlessEconomicsView view;
+    economics::EconomicsWindowLogic economics{logic, thin, view, interactive};
+};
+
+TEST_F(EconomicsWindowTest, FiguresAreTheRotationLibrarysForTheTablesRotation) {
+    typeRotation({20, 25, 30}, {QStringLiteral("40"), QStringLiteral("40"), QStringLiteral("40")},
+                 45);
+    logic.cashFlow().setInterestRate(3.0);
+    economics.typeText(EconomicsControl::txtEstablishmentCost, QStringLiteral("1800"));
+    economics.typeText(EconomicsControl::txtAnnualCost, QStringLiteral("15"));
+    economics.cmdEconomics_Click();
+    ASSERT_TRUE(economics.valued()) << view.text(EconomicsControl::lblRegime).toStdString();
+
+    // The same rotation asked of the library directly.
+    rotation::Economics money;
+    money.ratePercent = 3.0;
+    money.establishmentCost = 1800.0;
+    money.annualCost = 15.0;
+    economics::Prices longTerm;
+    longTerm.data() = prices.data();
+    longTerm.selectPriceSet(economics::kLongTermPrices);
+    money.prices = longTerm.pricesInUse();
+    const rotation::Regime regime{20, 5, 40.0f, 30};
+    engine::Grow own;
+    rotation::GrowthFailure failure;
+    const auto path = rotation::growPath(own, {0, 15.0f, 2500.0f, 7.0f, 20.0f}, regime, failure);
+    ASSERT_TRUE(path);
+    const rotation::RotationValue expected = rotation::valueRotation(*path, 45, money);
+    const rotation::RotationExplorer explorer = rotation::exploreRotations(*path, regime, money);
+
+    const rotation::RotationValue &shown = *economics.value();
+    EXPECT_EQ(economics.rotationAge(), 45);
+    EXPECT_EQ(shown.npv, expected.npv);
+    EXPECT_EQ(shown.lev, expected.lev);
+    EXPECT_EQ(shown.forestValue, expected.forestValue);
+    EXPECT_EQ(shown.irr.ratePercent, expected.irr.ratePercent);
+    EXPECT_EQ(shown.breakEvenPriceFactor, expected.breakEvenPriceFactor);
+    EXPECT_EQ(economics.explorer().economicRotation, explorer.economicRotation);
+    EXPECT_EQ(economics.explorer().biologicalRotation, explorer.biologicalRotation);
+    EXPECT_EQ(view.text(EconomicsControl::lblNPV), economics::euroPerHaText(expected.npv));
+    EXPECT_EQ(view.text(EconomicsControl::lblLEV), economics::euroPerHaText(expected.lev));
+    // Every panel names its rate.
+    EXPECT_TRUE(view.text(EconomicsControl::lblRate).startsWith(QStringLiteral("At 3.00 %")));
+    EXPECT_TRUE(view.text(EconomicsControl::lblIRR).endsWith(QStringLiteral("% a year")));
+    EXPECT_FALSE(view.text(EconomicsControl::lblRegime).contains(QStringLiteral("irregular")));
+    // The Monte Carlo draws come with the figures.
+    ASSERT_TRUE(economics.monteCarlo());
+    EXPECT_TRUE(view.text(EconomicsControl::lblMonteCarlo).contains(QStringLiteral("10,000")));
+}
+
+TEST_F(EconomicsWindowTest, IrregularThinningsAreValuedAsTheirMeansAndSaidSo) {
+    typeRotation({20, 25, 32}, {QStringLiteral("30"), QStringLiteral("50"), QStringLiteral("40")},
+                 0);
+    economics.cmdEconomics_Click();
+    ASSERT_TRUE(economics.valued());
+    EXPECT_EQ(economics.regime().thinFrom, 20);
+    EXPECT_EQ(economics.regime().thinEvery, 6);
+    EXPECT_EQ(economics.regime().thinUntil, 32);
+    EXPECT_NEAR(economics.regime().thinVolume, 40.0f, 0.01f);
+    const QString note = view.text(EconomicsControl::lblRegime);
+    EXPECT_TRUE(note.contains(QStringLiteral("irregular (at 20, 25 and 32 years, 30 to 50")))
+        << note.toStdString();
+    // Without a final cut the economic rotation is valued.
+    EXPECT_EQ(economics.rotationAge(), economics.explorer().economicRotation);
+    EXPECT_TRUE(note.contains(QStringLiteral("economic rotation")));
+}
+
+TEST_F(EconomicsWindowTest, BadInputIsRefusedAndKeepsWhatIsShown) {
+    typeRotation({20}, {QStringLiteral("40")}, 40);
+    economics.cmdEconomics_Click();
+    ASSERT_TRUE(economics.valued());
+    const QString npv = view.text(EconomicsControl::lblNPV);
+    const int draws = economics.monteCarlo()->histogram.empty() ? 0 : 1;
+
+    const struct {
+        EconomicsControl field;
+        QString typed;
+        EconomicsControl command;
+        QString message;
+    } cases[] = {
+        {EconomicsControl::txtInterestRate, QStringLiteral("0"), EconomicsControl::cmdCompute,
+         economics::economicstext::faultRate()},
+        {EconomicsControl::txtAnnualCost, QStringLiteral("-5"), EconomicsControl::cmdCompute,
+         economics::economicstext::faultCost()},
+        {EconomicsControl::txtDraws, QStringLiteral("5"), EconomicsControl::cmdMonteCarlo,
+         economics::economicstext::faultDraws()},
+        {EconomicsControl::txtRateHigh, QStringLiteral("1"), EconomicsControl::cmdMonteCarlo,
+         economics::economicstext::faultRateRange()},
+    };
+    for (const auto &c : cases) {
+        const QString before = view.text(c.field);
+        interactive.messages.clear();
+        economics.typeText(c.field, c.typed);
+        economics.press(c.command);
+        ASSERT_EQ(interactive.messages.size(), 1) << c.typed.toStdString();
+        EXPECT_EQ(interactive.messages.front().text, c.message);
+        EXPECT_EQ(view.text(EconomicsControl::lblNPV), npv);
+        EXPECT_EQ(economics.monteCarlo()->histogram.empty() ? 0 : 1, draws);
+        economics.typeText(c.field, before);
+    }
+    EXPECT_EQ(logic.cashFlow().interestRate(), 5.0) << "a refused rate is not kept";
+}
+
+TEST_F(EconomicsWindowTest, CancelStopsTheOptimiser) {
+    typeRotation({20}, {QStringLiteral("40")}, 40);
+    economics.cmdEconomics_Click();
+    view.onProgress = [&](double fraction) {
+        if (fraction > 0.2) {
+            economics.cmdCancel_Click();
+        }
+    };
+    economics.cmdOptimise_Click();
+    EXPECT_FALSE(economics.optimising());
+    EXPECT_LT(view.progress().back(), 1.0);
+    EXPECT_TRUE(view.text(EconomicsControl::lblOptimiser).startsWith(QStringLiteral("Cancelled")));
+    EXPECT_TRUE(view.isEnabled(EconomicsControl::cmdOptimise));
+    EXPECT_FALSE(view.isEnabled(EconomicsControl::cmdCancel));
+}
+
+TEST_F(EconomicsWindowTest, ApplyWritesTheTableAUserWouldType) {
+    typeRotation({20}, {QStringLiteral("40")}, 40);
+    economics.cmdEconomics_Click();
+    economics.cmdOptimise_Click();
+    ASSERT_EQ(economics.regimes().size(), 5u);
+    EXPECT_EQ(view.progress().back(), 1.0);
+    // The first regime of the five that thins more than once.
+    int rank = 0;
+    for (std::size_t i = 0; i < economics.regimes().size() && rank == 0; ++i) {
+        const rotation::Regime &g = economics.regimes()[i].regime;
+        if (g.thins() && g.thinUntil.value_or(0) > g.thinFrom) {
+            rank = static_cast<int>(i) + 1;
+        }
+    }
+    ASSERT_GT(rank, 0);
+    const rotation::Candidate chosen = economics.regimes()[static_cast<std::size_t>(rank - 1)];
+    economics.cmdApply_Click(rank);
+    const std::vector<QStringList> applied = tableCells();
+
+    // The same regime typed by hand.
+    std::vector<int> ages;
+    std::vector<QString> volumes;
+    for (int a = chosen.regime.thinFrom; a <= *chosen.regime.thinUntil;
+         a += chosen.regime.thinEvery) {
+        ages.push_back(a);
+        volumes.push_back(shell::singleText(chosen.regime.thinVolume));
+    }
+    typeRotation(ages, volumes, chosen.rotation);
+    EXPECT_EQ(tableCells(), applied);
+    EXPECT_TRUE(logic.felled());
+
+    // The window now values the applied regime: it scores as the optimiser said.
+    economics.cmdCompute_Click();
+    EXPECT_EQ(economics.regime().thinFrom, chosen.regime.thinFrom);
+    EXPECT_EQ(economics.regime().thinUntil, chosen.regime.thinUntil);
+    EXPECT_EQ(economics.rotationAge(), chosen.rotation);
+    ASSERT_TRUE(economics.yourRegime());
+    EXPECT_DOUBLE_EQ(economics.yourRegime()->lev, chosen.lev);
+    EXPECT_EQ(economics.regimes().size(), 5u) << "the same stand and money keep the regimes";
+}
+
+} // namespace
+} // namespace arbolex::testing
