@@ -3,6 +3,7 @@
 // the user choose the model in the model choice window.
 #include "assortments/assortuserlogic.hpp"
 #include "assortments/assortwindowlogic.hpp"
+#include "economics/assortpriceswindowlogic.hpp"
 #include "economics/npvwindowlogic.hpp"
 #include "economics/prices.hpp"
 #include "economics/timberpriceswindowlogic.hpp"
@@ -12,6 +13,7 @@
 #include "shell/errorlog.hpp"
 #include "shell/version.hpp"
 #include "thinning/thinwindowlogic.hpp"
+#include "ui/assortpriceswindow.hpp"
 #include "ui/assortuserwindow.hpp"
 #include "ui/assortwindow.hpp"
 #include "ui/mainwindow.hpp"
@@ -199,6 +201,8 @@ struct Options {
         parser.addOption(demoPrices);
         demoAssort.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(demoAssort);
+        demoAssortPrices.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(demoAssortPrices);
         quitWhenShown.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(quitWhenShown);
     }
@@ -219,6 +223,8 @@ struct Options {
     QCommandLineOption demoPrices{QStringLiteral("demo-prices")};
     QCommandLineOption demoAssort{QStringLiteral("demo-assort"), QString(),
                                   QStringLiteral("STAGE")};
+    /// Opens the assortment prices window with changes allowed.
+    QCommandLineOption demoAssortPrices{QStringLiteral("demo-assort-prices")};
     /// Ends the program once the main window is on screen: start-up is timed with it.
     QCommandLineOption quitWhenShown{QStringLiteral("quit-when-shown")};
 };
@@ -299,6 +305,14 @@ int main(int argc, char *argv[]) {
     assortUserWindow.attach(assortUserLogic);
     QObject::connect(window.assortUserAction(), &QAction::triggered, &window,
                      [&assortUserLogic] { assortUserLogic.mnuAssortUser_Click(); });
+    // The assortment prices from the same menu.
+    arbolex::ui::AssortPricesWindow assortPricesWindow(&window);
+    arbolex::economics::AssortPricesWindowLogic assortPricesLogic(prices.data(), log,
+                                                                  assortPricesWindow, interactive);
+    assortPricesWindow.attach(assortPricesLogic);
+    pricesLogic.attachAssortmentPrices(&assortPricesLogic);
+    QObject::connect(window.assortPricesAction(), &QAction::triggered, &window,
+                     [&assortPricesLogic] { assortPricesLogic.show(); });
     logic.Form_Load(settings, QGuiApplication::primaryScreen()->availableGeometry());
 
     if (parser.isSet(options.demoRotation)) {
@@ -324,6 +338,11 @@ int main(int argc, char *argv[]) {
             if (!demoThin(logic, thinLogic, stage)) {
                 qWarning("unknown thinning demonstration: %s", qPrintable(stage));
             }
+        });
+    } else if (parser.isSet(options.demoAssortPrices)) {
+        QTimer::singleShot(0, &window, [&assortPricesLogic] {
+            assortPricesLogic.show();
+            assortPricesLogic.cmdChangeAsmtPrices_Click();
         });
     } else if (parser.isSet(options.demoPrices)) {
         QTimer::singleShot(0, &window, [&logic] { logic.cmdShowTimberPrice_Click(); });

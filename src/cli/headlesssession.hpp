@@ -7,6 +7,8 @@
 #include "assortments/assortuserlogic.hpp"
 #include "assortments/assortwindowlogic.hpp"
 #include "assortments/headlessassortview.hpp"
+#include "economics/assortpriceswindowlogic.hpp"
+#include "economics/headlessassortpricesview.hpp"
 #include "economics/headlesstimberpricesview.hpp"
 #include "economics/inpvview.hpp"
 #include "economics/npvwindowlogic.hpp"
@@ -73,6 +75,8 @@ public:
     shell::HeadlessClipboard &clipboard() { return m_clipboard; }
     economics::TimberPricesWindowLogic &timberPrices() { return m_timberPrices; }
     economics::HeadlessTimberPricesView &timberPricesView() { return m_timberPricesView; }
+    economics::AssortPricesWindowLogic &assortPrices() { return m_assortPrices; }
+    economics::HeadlessAssortPricesView &assortPricesView() { return m_assortPricesView; }
 
 private:
     shell::ErrorLog m_log;
@@ -93,6 +97,9 @@ private:
     assortments::AssortWindowLogic m_assort;
     assortments::HeadlessAssortUserView m_assortUserView;
     assortments::AssortUserLogic m_assortUser;
+    economics::HeadlessAssortPricesView m_assortPricesView;
+    economics::AssortPricesWindowLogic m_assortPrices{m_prices.data(), m_log, m_assortPricesView,
+                                                      m_interactive};
 };
 
 } // namespace arbolex::cli

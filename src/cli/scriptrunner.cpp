@@ -1,5 +1,6 @@
 #include "cli/scriptrunner.hpp"
 
+#include "cli/assortpricescript.hpp"
 #include "cli/assortscript.hpp"
 #include "shell/tableexport.hpp"
 
@@ -225,6 +226,9 @@ QString ScriptRunner::set(const QString &control, const QString &text) {
     if (const auto assort = setAssortControl(m_session, control, text)) {
         return *assort;
     }
+    if (const auto asmtPrices = setAssortPricesControl(m_session, control, text)) {
+        return *asmtPrices;
+    }
     if (const auto thin = thinControl(control)) {
         if (!thinning::isThinField(*thin)) {
             return QStringLiteral("no field named '") + control + QLatin1Char('\'');
@@ -249,6 +253,9 @@ QString ScriptRunner::press(const QString &control) {
     }
     if (const auto assort = pressAssortControl(m_session, control)) {
         return *assort;
+    }
+    if (const auto asmtPrices = pressAssortPricesControl(m_session, control)) {
+        return *asmtPrices;
     }
     if (const auto thin = thinControl(control)) {
         if (!m_session.thinning().press(*thin)) {
@@ -281,6 +288,9 @@ QString ScriptRunner::press(const QString &control) {
 QString ScriptRunner::print(const QString &control) {
     if (const auto assort = printAssortControl(m_session, control, m_out)) {
         return *assort;
+    }
+    if (const auto asmtPrices = printAssortPricesControl(m_session, control, m_out)) {
+        return *asmtPrices;
     }
     if (control == QLatin1String("flxMain")) {
         for (const QStringList &row : m_session.main().table().visibleGrid()) {

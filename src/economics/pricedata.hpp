@@ -1,5 +1,6 @@
 #pragma once
 
+#include "rotation/assortmentprices.hpp"
 #include "rotation/priceclasses.hpp"
 
 #include <QString>
@@ -48,6 +49,8 @@ struct PriceData {
     std::array<QString, 2> privatePeriod;
     /// User assortment categories 1 to 5 ("UD_Assort.qdm").
     std::array<UserCategory, kUserCategoryCount> categories;
+    /// Prices of the top-diameter classes 7-14, 14-20 and >20 cm ("AssortPrices.qdm").
+    rotation::AssortmentPriceList assortmentPrices{};
 };
 
 /// Data file names, joined to the data folder.

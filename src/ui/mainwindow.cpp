@@ -2,6 +2,7 @@
 #include "ui/fieldinput.hpp"
 
 #include "assortments/assortmessages.hpp"
+#include "economics/assortpricesmessages.hpp"
 #include "engine/catalogue.hpp"
 #include "ui/groupheaderview.hpp"
 #include "ui/projectionmodel.hpp"
@@ -140,6 +141,8 @@ void MainWindow::buildMenus() {
     QMenu *assortMenu = menuBar()->addMenu(assortments::text::menuAssortments());
     m_assortUserAction = assortMenu->addAction(assortments::text::userMenu());
     m_assortUserAction->setObjectName(QStringLiteral("mnuAssortUser"));
+    m_assortPricesAction = assortMenu->addAction(economics::text::assortPricesMenu());
+    m_assortPricesAction->setObjectName(QStringLiteral("mnuAssortPrices"));
 
     QMenu *help = menuBar()->addMenu(text::menuHelp());
     connect(help->addAction(text::menuThreshold()), &QAction::triggered, this, [this] {

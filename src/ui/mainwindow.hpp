@@ -49,6 +49,8 @@ public:
     QActionGroup *modelMenu() const { return m_modelActions; }
     /// The entry `mnuAssortUser` that opens the user categories window.
     QAction *assortUserAction() const { return m_assortUserAction; }
+    /// The entry `mnuAssortPrices` that opens the assortment prices window.
+    QAction *assortPricesAction() const { return m_assortPricesAction; }
 
     // IMainView
     QString text(workflow::MainControl control) const override;
@@ -98,6 +100,7 @@ private:
 
     QActionGroup *m_modelActions = nullptr;
     QAction *m_assortUserAction = nullptr;
+    QAction *m_assortPricesAction = nullptr;
     QTableView *m_grid = nullptr;
     ProjectionModel *m_model = nullptr;
     QTableView *m_summaryGrid = nullptr;
