@@ -24,12 +24,22 @@ inline QString assortClassHeading() {
 inline QString assortPriceHeading() {
     return QStringLiteral("\u20ac / m3");
 }
+/// What each class is sold as, beside its price.
+inline QString productOf(int classIndex) {
+    switch (classIndex) {
+    case 0:
+        return QStringLiteral("pulpwood");
+    case 1:
+        return QStringLiteral("pallet wood");
+    default:
+        return QStringLiteral("sawlog");
+    }
+}
 inline QString lblAsmtDesc() {
-    return QStringLiteral(
-        "Standing prices (\u20ac / m3) of the timber in each top-diameter class of the "
-        "assortment report: pulpwood 7-14 cm, pallet wood 14-20 cm and sawlog over 20 cm. "
-        "Valued by assortments, every thinning and the final cut is divided into these "
-        "classes and each class is sold at its own price.");
+    return QStringLiteral("Standing prices (\u20ac / m3) by top diameter, the classes of the "
+                          "assortment report. Valued by assortments, every thinning and the "
+                          "final cut is divided into these classes and each class is sold at "
+                          "its own price.");
 }
 inline QString closeAsmtPrices() {
     return QStringLiteral("Close");

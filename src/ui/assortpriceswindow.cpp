@@ -26,7 +26,7 @@ namespace {
 /// Width of a price field, in digits of the window's font: room for "9999.99".
 constexpr int kPriceDigits = 8;
 /// Width of the description, in average characters of the window's font.
-constexpr int kDescriptionChars = 52;
+constexpr int kDescriptionChars = 46;
 
 std::size_t at(int index) {
     return static_cast<std::size_t>(index);
@@ -64,6 +64,8 @@ AssortPricesWindow::AssortPricesWindow(QWidget *parent) : QDialog(parent) {
     classHeading->setFont(bold(classHeading->font()));
     priceHeading->setFont(bold(priceHeading->font()));
     grid->addWidget(classHeading, 0, 0, Qt::AlignRight);
+    // Room on the left, so the captions stand a little in from the edge.
+    grid->setColumnMinimumWidth(0, classHeading->sizeHint().width() + 24);
     grid->addWidget(priceHeading, 0, 1, Qt::AlignHCenter);
     for (int k = 0; k < rotation::kAssortmentClassCount; ++k) {
         auto *caption = new QLabel(this);
@@ -85,8 +87,12 @@ AssortPricesWindow::AssortPricesWindow(QWidget *parent) : QDialog(parent) {
         field->installEventFilter(this);
         m_fields.at(at(k)) = field;
         grid->addWidget(field, k + 1, 1);
+
+        auto *product = new QLabel(economics::text::productOf(k), this);
+        product->setEnabled(false); // a quiet note beside the price
+        grid->addWidget(product, k + 1, 2);
     }
-    grid->setColumnStretch(2, 1);
+    grid->setColumnStretch(3, 1);
     layout->addLayout(grid);
 
     auto *commands = new QHBoxLayout;
