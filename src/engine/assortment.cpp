@@ -153,12 +153,26 @@ std::optional<AssortmentRatios> StandRatios(float G, float N, const AssortmentBo
     }
     // Quadratic mean diameter, cm, as everywhere in the program.
     const double dq = 200.0 * std::sqrt(double{G} / (double{N} * 3.14159265358979));
+    // Neighbouring classes share their bounds, and the first starts at the
+    // floor: each distinct diameter is evaluated once.
+    std::array<std::pair<double, double>, 2 * kMaxAssortmentClasses + 1> evaluated{};
+    std::size_t count = 0;
+    auto ratioAt = [&](double t) {
+        for (std::size_t k = 0; k < count; ++k) {
+            if (evaluated[k].first == t) {
+                return evaluated[k].second;
+            }
+        }
+        const double s = StandVolumeRatio(dq, t, ratio);
+        evaluated[count++] = {t, s};
+        return s;
+    };
     AssortmentRatios ratios;
-    ratios.reference = StandVolumeRatio(dq, kAssortmentFloor, ratio);
+    ratios.reference = ratioAt(kAssortmentFloor);
     for (std::size_t i = 0; i < bounds.count; ++i) {
-        ratios.lower[i] = StandVolumeRatio(dq, bounds.lower[i], ratio);
+        ratios.lower[i] = ratioAt(bounds.lower[i]);
         // A class reaches up to the next class's lower bound, across the gap.
-        ratios.upper[i] = StandVolumeRatio(dq, bounds.upper[i] + kGap, ratio);
+        ratios.upper[i] = ratioAt(bounds.upper[i] + kGap);
     }
     bool valid = std::isfinite(ratios.reference) && ratios.reference > 0.0;
     for (std::size_t i = 0; valid && i < bounds.count; ++i) {

@@ -104,9 +104,9 @@ Figures figures(const Flows &f, int presentAge, double ratePercent) {
 }
 
 /// Values `h` as `economics` says; valued by assortments, the harvest is
-/// first divided into its classes.
-void price(Harvest &h, const GrowthPath &path, const Economics &economics) {
-    if (economics.valuation == Valuation::kAssortments) {
+/// first divided into its classes unless it was `divided` before.
+void price(Harvest &h, const GrowthPath &path, const Economics &economics, bool divided) {
+    if (economics.valuation == Valuation::kAssortments && !divided) {
         h.assortments = divideHarvest(h.volume, h.basalArea, h.stocking, path.volumeRatio);
     }
     h.revenue = harvestRevenue(h, economics);
@@ -119,7 +119,7 @@ std::vector<Harvest> harvests(const GrowthPath &path, int rotation, const Econom
     for (const Harvest &t : path.thinnings) {
         if (t.age < rotation) {
             all.push_back(t);
-            price(all.back(), path, economics);
+            price(all.back(), path, economics, path.thinningsDivided);
         }
     }
     const engine::StandState &s = path.at(rotation);
@@ -130,7 +130,7 @@ std::vector<Harvest> harvests(const GrowthPath &path, int rotation, const Econom
     finalCut.basalArea = s.basalArea;
     finalCut.meanTreeVolume = shownMeanTree(s.volume, s.stocking);
     finalCut.priceClass = priceClassOf(finalCut.meanTreeVolume);
-    price(finalCut, path, economics);
+    price(finalCut, path, economics, false);
     all.push_back(finalCut);
     return all;
 }
@@ -302,6 +302,13 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
         nextThinning += regime.thinEvery;
     }
     return path;
+}
+
+void divideThinnings(GrowthPath &path) {
+    for (Harvest &t : path.thinnings) {
+        t.assortments = divideHarvest(t.volume, t.basalArea, t.stocking, path.volumeRatio);
+    }
+    path.thinningsDivided = true;
 }
 
 RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics) {

@@ -119,6 +119,8 @@ struct GrowthPath {
     std::vector<engine::StandState> years;
     /// The thinnings, oldest first; revenues 0 until a rotation is valued.
     std::vector<Harvest> thinnings;
+    /// True once divideThinnings has divided the thinnings into assortments.
+    bool thinningsDivided = false;
 
     /// Last age grown, years: the age limit, or the age of a thinning the
     /// limits did not allow.
@@ -165,6 +167,11 @@ struct ThinningLimits {
 /// fills `failure` when it cannot.
 std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const Regime &regime,
                                    GrowthFailure &failure, const ThinningLimits *limits = nullptr);
+
+/// Divides the thinnings of `path` into their assortments once, so that
+/// valuing its rotations by assortments reads them instead of dividing them
+/// again for every final-cut age.
+void divideThinnings(GrowthPath &path);
 
 /// One year of the cash flow of a rotation from bare land, euro/ha.
 struct CashFlowYear {

@@ -105,6 +105,10 @@ TEST_F(AssortmentValuationTest, EveryFigureFollowsTheValuation) {
     EXPECT_EQ(row.npv, v.npv);
     EXPECT_EQ(row.lev, v.lev);
     EXPECT_EQ(scoreRotation(path, regime, 45, e, Objective::kLev).lev, *v.lev);
+    // Thinnings divided once, as the optimiser does, value the same.
+    GrowthPath divided = path;
+    divideThinnings(divided);
+    EXPECT_EQ(valueRotation(divided, 45, e).lev, v.lev);
 
     ASSERT_TRUE(v.breakEvenPriceFactor.has_value());
     Economics atBreakEven = e;
