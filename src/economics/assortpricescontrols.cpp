@@ -21,7 +21,7 @@ int elements(AssortPricesControl control) {
 } // namespace
 
 QString controlName(AssortPricesItem item) {
-    const QString name = shell::controlNameIn(kNames, item.control);
+    QString name = shell::controlNameIn(kNames, item.control);
     if (elements(item.control) == 1) {
         return name;
     }

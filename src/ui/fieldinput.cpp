@@ -21,7 +21,7 @@ bool refusedByKeyFilter(const QKeyEvent &key) {
 
 QChar priceFieldKey(const QKeyEvent &key) {
     if (key.key() == Qt::Key_Backspace || key.key() == Qt::Key_Delete) {
-        return QChar(u'\b');
+        return {u'\b'};
     }
     if (!(key.modifiers() & (Qt::ControlModifier | Qt::AltModifier)) && !key.text().isEmpty() &&
         key.text().front().isPrint()) {
