@@ -17,8 +17,6 @@ class ErrorLog;
 
 namespace arbolex::economics {
 
-inline constexpr const char *kAssortmentPricesFile = "AssortPrices.qdm";
-
 /// Highest price of a class, euro per m³: what a price field shows ("#0.00").
 inline constexpr double kMaxAssortmentPrice = 9999.99;
 

@@ -59,6 +59,7 @@ inline constexpr const char *kPrivatePricesFile = "OVRA_PRIC.qdm";
 inline constexpr const char *kUserPricesFile = "USRPRIC.qdm";
 inline constexpr const char *kAveragePricesFile = "AvPRIC_npv.qdm";
 inline constexpr const char *kUserAssortmentsFile = "UD_Assort.qdm";
+inline constexpr const char *kAssortmentPricesFile = "AssortPrices.qdm";
 
 /// Selector of WritePricesInFiles.
 enum PriceFileSelector : std::int16_t {
