@@ -1,6 +1,6 @@
 // The economic questions of one stand: the regime optimiser's whole search
-// (target under 200 ms on one core) and 10,000 Monte Carlo draws of a
-// rotation's valuation (target under 100 ms).
+// (target under 200 ms on one core, by mean-tree prices or by assortments) and
+// 10,000 Monte Carlo draws of a rotation's valuation (target under 100 ms).
 #include "engine_stands.hpp"
 #include "plantingeconomics.hpp"
 
@@ -15,10 +15,17 @@ namespace {
 const rotation::Stand kStand{kTypicalStand.model, kTypicalStand.age, kTypicalStand.stocking,
                              kTypicalStand.height, kTypicalStand.basalArea};
 
-// The default search of the optimiser: the coarse grid, then its refinement.
-void BM_OptimiseOneStand(benchmark::State &state) {
+/// The planting's economics, every harvest valued by assortments at the
+/// shipped class prices.
+rotation::Economics byAssortments() {
+    rotation::Economics e = plantingEconomics();
+    e.valuation = rotation::Valuation::kAssortments;
+    e.assortmentPrices = {10.0, 28.0, 48.0};
+    return e;
+}
+
+void optimiseOneStand(benchmark::State &state, const rotation::Economics &e) {
     engine::Grow grow;
-    const rotation::Economics e = plantingEconomics();
     const rotation::OptimiserSettings settings;
     int grown = 0;
     for (auto _ : state) {
@@ -29,7 +36,19 @@ void BM_OptimiseOneStand(benchmark::State &state) {
     }
     state.counters["regimes"] = grown;
 }
+
+// The default search of the optimiser: the coarse grid, then its refinement.
+void BM_OptimiseOneStand(benchmark::State &state) {
+    optimiseOneStand(state, plantingEconomics());
+}
 BENCHMARK(BM_OptimiseOneStand)->Unit(benchmark::kMillisecond);
+
+// The same search valued by assortments: every harvest of every candidate is
+// divided into its classes.
+void BM_OptimiseOneStandByAssortments(benchmark::State &state) {
+    optimiseOneStand(state, byAssortments());
+}
+BENCHMARK(BM_OptimiseOneStandByAssortments)->Unit(benchmark::kMillisecond);
 
 // 10,000 draws of price level, rate and cost level over one grown rotation.
 void BM_MonteCarlo10000(benchmark::State &state) {

@@ -9,7 +9,8 @@
 # whole rotation (age 15, 2500 stems/ha, 9 m, 22 m²/ha, 10 ha, thinned by
 # 50 m³/ha at 30, grown to 60): the final cut with its question, the summary,
 # and the net present value window; and the timber prices window as Show
-# Timber Prices opens it (the whole screen, and the window alone).
+# Timber Prices opens it (the whole screen, and the window alone); and the
+# assortment prices window with changes allowed.
 #
 #   scripts/screenshot.sh [OUTPUT_FOLDER]      (default /tmp/shots)
 #
@@ -128,3 +129,9 @@ done
 export WINDOW_TITLE=
 export SHOT="$out/economics-table.png"
 shoot economics-table --no-intro --demo-economics table
+# The assortment prices window, opened with changes allowed.
+export WINDOW_TITLE="Assortment Prices"
+export SHOT="$out/assort-prices.png"
+rm -f "${SHOT%.png}-window.png"
+shoot assort-prices --no-intro --demo-assort-prices
+export WINDOW_TITLE=

@@ -4,6 +4,7 @@
 #include "assortments/assortuserlogic.hpp"
 #include "assortments/assortwindowlogic.hpp"
 #include "document/documentcontroller.hpp"
+#include "economics/assortpriceswindowlogic.hpp"
 #include "economics/economicswindowlogic.hpp"
 #include "economics/npvwindowlogic.hpp"
 #include "economics/prices.hpp"
@@ -15,6 +16,7 @@
 #include "shell/errorlog.hpp"
 #include "shell/version.hpp"
 #include "thinning/thinwindowlogic.hpp"
+#include "ui/assortpriceswindow.hpp"
 #include "ui/assortuserwindow.hpp"
 #include "ui/assortwindow.hpp"
 #include "ui/chartpane.hpp"
@@ -350,6 +352,8 @@ struct Options {
                                      QStringLiteral("[FILE]"));
         demoEconomics.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(demoEconomics);
+        demoAssortPrices.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(demoAssortPrices);
         quitWhenShown.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(quitWhenShown);
     }
@@ -379,6 +383,8 @@ struct Options {
                                     QStringLiteral("STAGE")};
     QCommandLineOption demoEconomics{QStringLiteral("demo-economics"), QString(),
                                      QStringLiteral("STAGE")};
+    /// Opens the assortment prices window with changes allowed.
+    QCommandLineOption demoAssortPrices{QStringLiteral("demo-assort-prices")};
     /// Ends the program once the main window is on screen: start-up is timed with it.
     QCommandLineOption quitWhenShown{QStringLiteral("quit-when-shown")};
 };
@@ -475,6 +481,14 @@ int main(int argc, char *argv[]) {
                      [&economicsLogic] { economicsLogic.cmdEconomics_Click(); });
     QObject::connect(npvWindow.economicsButton(), &QPushButton::clicked, &window,
                      [&economicsLogic] { economicsLogic.cmdEconomics_Click(); });
+    // The assortment prices from the same menu.
+    arbolex::ui::AssortPricesWindow assortPricesWindow(&window);
+    arbolex::economics::AssortPricesWindowLogic assortPricesLogic(prices.data(), log,
+                                                                  assortPricesWindow, interactive);
+    assortPricesWindow.attach(assortPricesLogic);
+    pricesLogic.attachAssortmentPrices(&assortPricesLogic);
+    QObject::connect(window.assortPricesAction(), &QAction::triggered, &window,
+                     [&assortPricesLogic] { assortPricesLogic.show(); });
     logic.Form_Load(settings, QGuiApplication::primaryScreen()->availableGeometry());
     // The sub-compartment as a document: the File menu, and the question
     // before the window closes on unsaved work.
@@ -537,6 +551,11 @@ int main(int argc, char *argv[]) {
             if (!demoDocument(logic, thinLogic, documents, stage)) {
                 qWarning("unknown document demonstration: %s", qPrintable(stage));
             }
+        });
+    } else if (parser.isSet(options.demoAssortPrices)) {
+        QTimer::singleShot(0, &window, [&assortPricesLogic] {
+            assortPricesLogic.show();
+            assortPricesLogic.cmdChangeAsmtPrices_Click();
         });
     } else if (parser.isSet(options.demoPrices)) {
         QTimer::singleShot(0, &window, [&logic] { logic.cmdShowTimberPrice_Click(); });

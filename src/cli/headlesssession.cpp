@@ -35,6 +35,7 @@ HeadlessSession::HeadlessSession(const QString &dataFolder, QTextStream &out)
     m_main.attachNpv(&m_npv);
     m_main.attachClipboard(&m_clipboard);
     m_main.attachTimberPrices(&m_timberPrices);
+    m_timberPrices.attachAssortmentPrices(&m_assortPrices);
     m_main.attachAssortments(&m_assort);
     m_thin.attachAssortments(&m_assort);
 }

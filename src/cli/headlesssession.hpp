@@ -7,7 +7,9 @@
 #include "assortments/assortuserlogic.hpp"
 #include "assortments/assortwindowlogic.hpp"
 #include "assortments/headlessassortview.hpp"
+#include "economics/assortpriceswindowlogic.hpp"
 #include "economics/economicswindowlogic.hpp"
+#include "economics/headlessassortpricesview.hpp"
 #include "economics/headlesstimberpricesview.hpp"
 #include "economics/inpvview.hpp"
 #include "economics/npvwindowlogic.hpp"
@@ -76,6 +78,8 @@ public:
     economics::HeadlessTimberPricesView &timberPricesView() { return m_timberPricesView; }
     economics::EconomicsWindowLogic &economics() { return m_economics; }
     economics::HeadlessEconomicsView &economicsView() { return m_economicsView; }
+    economics::AssortPricesWindowLogic &assortPrices() { return m_assortPrices; }
+    economics::HeadlessAssortPricesView &assortPricesView() { return m_assortPricesView; }
 
 private:
     shell::ErrorLog m_log;
@@ -98,6 +102,9 @@ private:
     assortments::AssortUserLogic m_assortUser;
     economics::HeadlessEconomicsView m_economicsView;
     economics::EconomicsWindowLogic m_economics{m_main, m_thin, m_economicsView, m_interactive};
+    economics::HeadlessAssortPricesView m_assortPricesView;
+    economics::AssortPricesWindowLogic m_assortPrices{m_prices.data(), m_log, m_assortPricesView,
+                                                      m_interactive};
 };
 
 } // namespace arbolex::cli

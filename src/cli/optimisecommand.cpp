@@ -140,6 +140,7 @@ int runOptimise(CommandContext &context) {
         }
         QJsonObject o{{QStringLiteral("model"), QString::fromStdString(grow.label())},
                       {QStringLiteral("rate"), in.economics.ratePercent},
+                      {QStringLiteral("valuation"), valuationName(in.economics)},
                       {QStringLiteral("regimes_grown"), result->regimesGrown},
                       {QStringLiteral("best"), best}};
         if (current) {
@@ -150,7 +151,7 @@ int runOptimise(CommandContext &context) {
         }
         context.out << QJsonDocument(o).toJson(QJsonDocument::Indented);
     } else {
-        writeRotationPreamble(context.out, grow, in.economics.ratePercent);
+        writeRotationPreamble(context.out, grow, in.economics);
         context.out << "rank\tthin_from\tthin_every\tthin_volume\tthin_until\trotation\tnpv\tlev"
                        "\tvolume\n";
         for (std::size_t i = 0; i < result->best.size(); ++i) {
@@ -175,7 +176,8 @@ Command optimiseCommand() {
             "                            (--basal-area G | --dbh D) [REGIME] [--rotation R]\n"
             "                            [--objective lev|npv|volume] [--rate P]\n"
             "                            [--establishment-cost C] [--annual-cost C]\n"
-            "                            [--prices LIST] [--max-removal PERCENT]\n"
+            "                            [--prices LIST] [--valuation stand|assortment]\n"
+            "                            [--assortment-prices FILE] [--max-removal PERCENT]\n"
             "                            [--min-stocking N] [--top K] [--format tsv|json]\n"
             "\n"
             "Searches the first thinning age, the years between thinnings, the volume per\n"

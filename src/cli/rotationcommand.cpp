@@ -38,13 +38,27 @@ QString irrNote(valuation::IrrOutcome outcome) {
     return {};
 }
 
-QJsonObject harvestJson(const Harvest &h, bool withStocking) {
+/// The classes of a harvest valued by assortments, as the assortment report
+/// names them, with their volumes (m³/ha).
+QJsonObject assortmentsJson(const Harvest &h) {
+    QJsonObject o;
+    for (std::size_t i = 0; i < h.assortments.size(); ++i) {
+        o.insert(QLatin1String(rotation::kAssortmentClassCaptions.at(i)),
+                 quantity(h.assortments.at(i)));
+    }
+    return o;
+}
+
+QJsonObject harvestJson(const Harvest &h, bool withStocking, bool byAssortments) {
     QJsonObject o{{QStringLiteral("age"), h.age},
                   {QStringLiteral("volume"), quantity(h.volume)},
                   {QStringLiteral("mean_tree_volume"), h.meanTreeVolume},
                   {QStringLiteral("revenue"), moneyJson(h.revenue)}};
     if (withStocking) {
         o.insert(QStringLiteral("stocking"), quantity(h.stocking));
+    }
+    if (byAssortments) {
+        o.insert(QStringLiteral("assortments"), assortmentsJson(h));
     }
     return o;
 }
@@ -53,14 +67,16 @@ struct Report {
     const rotation::GrowthPath &path;
     const rotation::RotationValue &value;
     const rotation::RotationExplorer &explorer;
-    double ratePercent;
+    const rotation::Economics &economics;
+
+    bool byAssortments() const { return economics.valuation == rotation::Valuation::kAssortments; }
 };
 
 QJsonObject toJson(const Report &r, const engine::Grow &grow) {
     const rotation::RotationValue &v = r.value;
     QJsonArray thinnings;
     for (const Harvest &t : v.thinnings) {
-        thinnings.append(harvestJson(t, true));
+        thinnings.append(harvestJson(t, true, r.byAssortments()));
     }
     QJsonArray cashflow;
     for (const rotation::CashFlowYear &c : v.cashflow) {
@@ -80,7 +96,8 @@ QJsonObject toJson(const Report &r, const engine::Grow &grow) {
     QJsonObject o{{QStringLiteral("model"), QString::fromStdString(grow.label())},
                   {QStringLiteral("site_index"), quantity(r.path.siteIndex)},
                   {QStringLiteral("present_age"), r.path.presentAge},
-                  {QStringLiteral("rate"), r.ratePercent},
+                  {QStringLiteral("rate"), r.economics.ratePercent},
+                  {QStringLiteral("valuation"), valuationName(r.economics)},
                   {QStringLiteral("rotation"), v.rotation},
                   {QStringLiteral("economic_rotation"), r.explorer.economicRotation},
                   {QStringLiteral("biological_rotation"), r.explorer.biologicalRotation},
@@ -97,7 +114,7 @@ QJsonObject toJson(const Report &r, const engine::Grow &grow) {
                    v.breakEvenPriceFactor ? QJsonValue(*v.breakEvenPriceFactor)
                                           : QJsonValue(QJsonValue::Null)},
                   {QStringLiteral("thinnings"), thinnings},
-                  {QStringLiteral("final_cut"), harvestJson(v.finalCut, false)},
+                  {QStringLiteral("final_cut"), harvestJson(v.finalCut, false, r.byAssortments())},
                   {QStringLiteral("cashflow"), cashflow},
                   {QStringLiteral("by_age"), byAge}};
     if (v.irr.outcome != valuation::IrrOutcome::kRoot) {
@@ -108,7 +125,7 @@ QJsonObject toJson(const Report &r, const engine::Grow &grow) {
 
 void writeTsv(QTextStream &out, const Report &r, const engine::Grow &grow) {
     const rotation::RotationValue &v = r.value;
-    writeRotationPreamble(out, grow, r.ratePercent);
+    writeRotationPreamble(out, grow, r.economics);
     out << "rotation\t" << v.rotation << '\n'
         << "economic_rotation\t" << r.explorer.economicRotation << '\n'
         << "biological_rotation\t" << r.explorer.biologicalRotation << '\n'
@@ -124,16 +141,28 @@ void writeTsv(QTextStream &out, const Report &r, const engine::Grow &grow) {
         << '\n'
         << "break_even_price_factor\t"
         << (v.breakEvenPriceFactor ? formatNumber(*v.breakEvenPriceFactor) : QString()) << '\n';
-    out << "\n# harvests\nkind\tage\tvolume\tstocking\tmean_tree_volume\trevenue\n";
-    for (const Harvest &t : v.thinnings) {
-        out << "thinning\t" << t.age << '\t' << formatNumber(t.volume) << '\t'
-            << formatNumber(t.stocking) << '\t' << formatNumber(t.meanTreeVolume) << '\t'
-            << moneyText(t.revenue) << '\n';
+    out << "\n# harvests\nkind\tage\tvolume\tstocking\tmean_tree_volume\trevenue";
+    if (r.byAssortments()) {
+        for (const std::string_view caption : rotation::kAssortmentClassCaptions) {
+            out << '\t' << QLatin1String(caption);
+        }
     }
-    const Harvest &f = v.finalCut;
-    out << "final_cut\t" << f.age << '\t' << formatNumber(f.volume) << '\t'
-        << formatNumber(f.stocking) << '\t' << formatNumber(f.meanTreeVolume) << '\t'
-        << moneyText(f.revenue) << '\n';
+    out << '\n';
+    auto harvestLine = [&](const char *kind, const Harvest &h) {
+        out << kind << '\t' << h.age << '\t' << formatNumber(h.volume) << '\t'
+            << formatNumber(h.stocking) << '\t' << formatNumber(h.meanTreeVolume) << '\t'
+            << moneyText(h.revenue);
+        if (r.byAssortments()) {
+            for (const float volume : h.assortments) {
+                out << '\t' << formatNumber(volume);
+            }
+        }
+        out << '\n';
+    };
+    for (const Harvest &t : v.thinnings) {
+        harvestLine("thinning", t);
+    }
+    harvestLine("final_cut", v.finalCut);
     out << "\n# cashflow\nage\tcost\trevenue\n";
     for (const rotation::CashFlowYear &c : v.cashflow) {
         out << c.age << '\t' << moneyText(c.cost) << '\t' << moneyText(c.revenue) << '\n';
@@ -168,7 +197,7 @@ int runRotation(CommandContext &context) {
         rotation::exploreRotations(path, in.regime, in.economics);
     const rotation::RotationValue value =
         rotation::valueRotation(path, grown.rotation, in.economics);
-    const Report r{path, value, explorer, in.economics.ratePercent};
+    const Report r{path, value, explorer, in.economics};
     if (in.format == QLatin1String("json")) {
         context.out << QJsonDocument(toJson(r, grow)).toJson(QJsonDocument::Indented);
     } else {
@@ -189,6 +218,8 @@ Command rotationCommand() {
                 "                             [--thin-until AGE]] [--rotation R] [--rate P]\n"
                 "                            [--establishment-cost C] [--annual-cost C]\n"
                 "                            [--prices current|user|longterm|private]\n"
+                "                            [--valuation stand|assortment]\n"
+                "                            [--assortment-prices FILE]\n"
                 "                            [--format tsv|json] [--data-dir DIR]\n"
                 "\n"
                 "Grows the stand year by year to the model's age limit, thinning the given\n"
@@ -196,7 +227,9 @@ Command rotationCommand() {
                 "it at the rotation age R (without --rotation, the economic rotation: the\n"
                 "age of the largest land expectation value). Thinnings are valued at the\n"
                 "standing price of the removal's mean tree, the final cut at that of the\n"
-                "crop's mean tree. Money is euro/ha; the rate in percent.\n"
+                "crop's mean tree; with --valuation assortment each harvest is divided into\n"
+                "the top-diameter classes 7-14, 14-20 and >20 cm, each class sold at its\n"
+                "assortment price. Money is euro/ha; the rate in percent.\n"
                 "Prints the figures (npv, lev, eaa, forest_value, irr, break_even_price_factor,\n"
                 "yield_class, the rotations), the harvests, the cash flow from age 0 to R and\n"
                 "the rotation explorer (by_age: the final cut at every age after the last\n"

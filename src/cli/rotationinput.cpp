@@ -1,10 +1,13 @@
 #include "cli/rotationinput.hpp"
 
 #include "cli/command.hpp"
+#include "economics/assortmentpricefile.hpp"
 #include "economics/prices.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/settings.hpp"
 #include "valuation/discounting.hpp"
+
+#include <QDir>
 
 #include <algorithm>
 #include <iterator>
@@ -38,7 +41,39 @@ double cost(const Options &options, const char *name) {
     return c;
 }
 
+/// --valuation and --assortment-prices: how harvests are valued, and with
+/// which assortment prices (the data folder's file without the option).
+void readValuation(const Options &options, const QString &dataFolder,
+                   rotation::Economics &economics) {
+    const QString word =
+        options.has("valuation") ? options.text("valuation") : QStringLiteral("stand");
+    if (word != QLatin1String("stand") && word != QLatin1String("assortment")) {
+        throw UsageError{QStringLiteral("--valuation takes stand or assortment")};
+    }
+    if (word == QLatin1String("stand")) {
+        if (options.has("assortment-prices")) {
+            throw UsageError{QStringLiteral("--assortment-prices is for --valuation assortment")};
+        }
+        return;
+    }
+    const QString path =
+        options.has("assortment-prices")
+            ? options.text("assortment-prices")
+            : QDir(dataFolder).filePath(QLatin1String(economics::kAssortmentPricesFile));
+    const economics::AssortmentPricesReading read = economics::readAssortmentPrices(path);
+    if (!read.prices) {
+        throw UsageError{QStringLiteral("assortment prices ") + read.fault};
+    }
+    economics.valuation = rotation::Valuation::kAssortments;
+    economics.assortmentPrices = *read.prices;
+}
+
 } // namespace
+
+QString valuationName(const rotation::Economics &economics) {
+    return economics.valuation == rotation::Valuation::kAssortments ? QStringLiteral("assortment")
+                                                                    : QStringLiteral("stand");
+}
 
 std::vector<const char *> regimeOptionNames() {
     return {"thin-from", "thin-every", "thin-volume", "thin-until"};
@@ -68,7 +103,8 @@ rotation::Regime readRegime(const Options &options) {
 }
 
 std::vector<const char *> economicsOptionNames() {
-    return {"rate", "establishment-cost", "annual-cost", "prices"};
+    return {"rate",   "establishment-cost", "annual-cost",
+            "prices", "valuation",          "assortment-prices"};
 }
 
 QString economicsOptionsHelp() {
@@ -80,7 +116,14 @@ QString economicsOptionsHelp() {
                "  --annual-cost C           cost of every year, euro/ha (default 0)\n"
                "  --prices current|user|longterm|private\n"
                "                            price list (default longterm: the long-term\n"
-               "                            average prices the net present value uses)\n");
+               "                            average prices the net present value uses)\n"
+               "  --valuation stand|assortment\n"
+               "                            stand: each harvest at the standing price of its\n"
+               "                            mean tree (default); assortment: its volumes by\n"
+               "                            top-diameter class at the assortment prices\n"
+               "  --assortment-prices FILE  the three prices, euro/m3, of 7-14, 14-20 and\n"
+               "                            >20 cm (default: AssortPrices.qdm of the data "
+               "folder)\n");
 }
 
 rotation::Economics readEconomics(const Options &options, const QString &dataFolder) {
@@ -109,6 +152,7 @@ rotation::Economics readEconomics(const Options &options, const QString &dataFol
     economics::GetPricesFromFiles(dataFolder, prices.data(), log);
     prices.selectPriceSet(set);
     economics.prices = prices.pricesInUse();
+    readValuation(options, dataFolder, economics);
     return economics;
 }
 
@@ -142,9 +186,11 @@ RotationInput readRotationInput(const Options &options, const QString &dataFolde
     return input;
 }
 
-void writeRotationPreamble(QTextStream &out, const engine::Grow &grow, double ratePercent) {
+void writeRotationPreamble(QTextStream &out, const engine::Grow &grow,
+                           const rotation::Economics &economics) {
     writePreamble(out, grow, true);
-    out << "# rate\t" << formatNumber(ratePercent) << '\n';
+    out << "# rate\t" << formatNumber(economics.ratePercent) << '\n'
+        << "# valuation\t" << valuationName(economics) << '\n';
 }
 
 GrownRotation growRotation(engine::Grow &grow, const RotationInput &input, const QString &command,

@@ -36,9 +36,14 @@ QString economicsOptionsHelp();
 /// Reads the interest rate (above 0, the program's default rate without it),
 /// the costs (0 by default, never negative) and the price list (long-term
 /// average prices without --prices), whose prices come from the data folder's
-/// files as the program reads them, each as its absolute value. Throws
+/// files as the program reads them, each as its absolute value, and the
+/// valuation (--valuation, by assortments with the prices of
+/// --assortment-prices or the data folder's assortment price file). Throws
 /// UsageError.
 rotation::Economics readEconomics(const Options &options, const QString &dataFolder);
+
+/// The valuation of the harvests as the output names it: "stand" or "assortment".
+QString valuationName(const rotation::Economics &economics);
 
 /// The output format: "tsv" (the default) or "json". Throws UsageError.
 QString readFormat(const Options &options);
@@ -61,8 +66,9 @@ struct RotationInput {
 /// Reads the stand, the regime, --rotation, --format and the money. Throws UsageError.
 RotationInput readRotationInput(const Options &options, const QString &dataFolder);
 
-/// The "# site_index", "# model" and "# rate" lines of a table.
-void writeRotationPreamble(QTextStream &out, const engine::Grow &grow, double ratePercent);
+/// The "# site_index", "# model", "# rate" and "# valuation" lines of a table.
+void writeRotationPreamble(QTextStream &out, const engine::Grow &grow,
+                           const rotation::Economics &economics);
 
 /// The stand grown under the regime and the final-cut age (--rotation, else
 /// the economic rotation), or the exit status after the reason has been

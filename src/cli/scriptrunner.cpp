@@ -1,5 +1,6 @@
 #include "cli/scriptrunner.hpp"
 
+#include "cli/assortpricescript.hpp"
 #include "cli/assortscript.hpp"
 #include "cli/documentscript.hpp"
 #include "cli/economicsscript.hpp"
@@ -234,6 +235,9 @@ QString ScriptRunner::set(const QString &control, const QString &text) {
     if (const auto economics = setEconomicsControl(m_session, control, text)) {
         return *economics;
     }
+    if (const auto asmtPrices = setAssortPricesControl(m_session, control, text)) {
+        return *asmtPrices;
+    }
     if (const auto thin = thinControl(control)) {
         if (!thinning::isThinField(*thin)) {
             return QStringLiteral("no field named '") + control + QLatin1Char('\'');
@@ -261,6 +265,9 @@ QString ScriptRunner::press(const QString &control) {
     }
     if (const auto economics = pressEconomicsControl(m_session, control)) {
         return *economics;
+    }
+    if (const auto asmtPrices = pressAssortPricesControl(m_session, control)) {
+        return *asmtPrices;
     }
     if (const auto thin = thinControl(control)) {
         if (!m_session.thinning().press(*thin)) {
@@ -296,6 +303,9 @@ QString ScriptRunner::print(const QString &control) {
     }
     if (const auto economics = printEconomicsControl(m_session, control, m_out)) {
         return *economics;
+    }
+    if (const auto asmtPrices = printAssortPricesControl(m_session, control, m_out)) {
+        return *asmtPrices;
     }
     if (control == QLatin1String("flxMain")) {
         for (const QStringList &row : m_session.main().table().visibleGrid()) {

@@ -132,6 +132,7 @@ int runUncertainty(CommandContext &context) {
         const QJsonObject o{
             {QStringLiteral("rotation"), age},
             {QStringLiteral("rate"), in.economics.ratePercent},
+            {QStringLiteral("valuation"), valuationName(in.economics)},
             {QStringLiteral("draws"), settings.draws},
             {QStringLiteral("seed"), static_cast<qint64>(settings.seed)},
             {QStringLiteral("npv"), percentilesJson(mc.npv)},
@@ -144,7 +145,7 @@ int runUncertainty(CommandContext &context) {
             {QStringLiteral("tornado"), tornado}};
         context.out << QJsonDocument(o).toJson(QJsonDocument::Indented);
     } else {
-        writeRotationPreamble(context.out, grow, in.economics.ratePercent);
+        writeRotationPreamble(context.out, grow, in.economics);
         context.out << "# rotation\t" << age << '\n';
         writeTsv(context.out, mc, bars);
     }
@@ -162,7 +163,8 @@ Command uncertaintyCommand() {
                 "                               [--rotation R] [--draws N] [--seed S]\n"
                 "                               [--price-spread SD] [--rate-range LO HI]\n"
                 "                               [--cost-spread SD] [--rate P] [costs]\n"
-                "                               [--prices LIST] [--format tsv|json]\n"
+                "                               [--prices LIST] [--valuation stand|assortment]\n"
+                "                               [--assortment-prices FILE] [--format tsv|json]\n"
                 "\n"
                 "Grows the rotation once (at --rotation, else its economic rotation) and\n"
                 "values it N times (default 10000) with a price level drawn log-normal\n"

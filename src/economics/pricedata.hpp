@@ -1,5 +1,6 @@
 #pragma once
 
+#include "rotation/assortmentprices.hpp"
 #include "rotation/priceclasses.hpp"
 
 #include <QString>
@@ -48,6 +49,8 @@ struct PriceData {
     std::array<QString, 2> privatePeriod;
     /// User assortment categories 1 to 5 ("UD_Assort.qdm").
     std::array<UserCategory, kUserCategoryCount> categories;
+    /// Prices of the top-diameter classes 7-14, 14-20 and >20 cm ("AssortPrices.qdm").
+    rotation::AssortmentPriceList assortmentPrices{};
 };
 
 /// Data file names, joined to the data folder.
@@ -56,9 +59,11 @@ inline constexpr const char *kPrivatePricesFile = "OVRA_PRIC.qdm";
 inline constexpr const char *kUserPricesFile = "USRPRIC.qdm";
 inline constexpr const char *kAveragePricesFile = "AvPRIC_npv.qdm";
 inline constexpr const char *kUserAssortmentsFile = "UD_Assort.qdm";
+inline constexpr const char *kAssortmentPricesFile = "AssortPrices.qdm";
 /// The files the exit writes back, which the data history keeps.
 inline constexpr const char *kFilesWrittenAtExit[] = {kCurrentPricesFile, kUserPricesFile,
-                                                      kAveragePricesFile, kUserAssortmentsFile};
+                                                      kAveragePricesFile, kUserAssortmentsFile,
+                                                      kAssortmentPricesFile};
 
 /// Selector of WritePricesInFiles.
 enum PriceFileSelector : std::int16_t {

@@ -8,11 +8,24 @@
 namespace arbolex::economics {
 
 namespace {
-constexpr std::array<const char *, kTimberPricesControlCount> kNames = {
-    "txtTimbVal",      "lblTimbCat",        "fraTimbPrice", "OptCurentPrices", "OptUserPrices",
-    "OptNPVprices",    "OptOvraPrices",     "lblCTP",       "lblUTP",          "lblnpvTP",
-    "lblOVRA_TP",      "lblNote",           "lblNote2",     "lblNote_OVRA1",   "lblNote_OVRA2",
-    "cmdChangePrices", "cmdClosePricesList"};
+constexpr std::array<const char *, kTimberPricesControlCount> kNames = {"txtTimbVal",
+                                                                        "lblTimbCat",
+                                                                        "fraTimbPrice",
+                                                                        "OptCurentPrices",
+                                                                        "OptUserPrices",
+                                                                        "OptNPVprices",
+                                                                        "OptOvraPrices",
+                                                                        "lblCTP",
+                                                                        "lblUTP",
+                                                                        "lblnpvTP",
+                                                                        "lblOVRA_TP",
+                                                                        "lblNote",
+                                                                        "lblNote2",
+                                                                        "lblNote_OVRA1",
+                                                                        "lblNote_OVRA2",
+                                                                        "cmdChangePrices",
+                                                                        "cmdClosePricesList",
+                                                                        "cmdAssortPrices"};
 } // namespace
 
 int elementCount(TimberPricesControl control) {
@@ -37,25 +50,12 @@ QString controlName(TimberPricesItem item) {
 }
 
 std::optional<TimberPricesItem> timberPricesItemFromName(const QString &name) {
-    const qsizetype open = name.indexOf(QLatin1Char('('));
-    const auto control =
-        shell::controlNamedIn<TimberPricesControl>(kNames, open < 0 ? name : name.left(open));
-    if (!control) {
+    const auto found =
+        shell::controlElementNamedIn<TimberPricesControl>(kNames, name, elementCount);
+    if (!found) {
         return std::nullopt;
     }
-    const bool isArray = elementCount(*control) > 1;
-    if (open < 0) {
-        return isArray ? std::nullopt : std::optional(TimberPricesItem{*control, 0});
-    }
-    if (!isArray || !name.endsWith(QLatin1Char(')'))) {
-        return std::nullopt;
-    }
-    bool ok = false;
-    const int index = name.mid(open + 1, name.size() - open - 2).toInt(&ok);
-    if (!ok || index < 0 || index >= elementCount(*control)) {
-        return std::nullopt;
-    }
-    return TimberPricesItem{*control, index};
+    return TimberPricesItem{found->first, found->second};
 }
 
 bool isPriceOption(TimberPricesControl control) {

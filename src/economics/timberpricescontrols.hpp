@@ -30,10 +30,12 @@ enum class TimberPricesControl {
     // commands
     cmdChangePrices,
     cmdClosePricesList,
+    /// Opens the assortment prices window.
+    cmdAssortPrices,
 };
 
 inline constexpr int kTimberPricesControlCount =
-    static_cast<int>(TimberPricesControl::cmdClosePricesList) + 1;
+    static_cast<int>(TimberPricesControl::cmdAssortPrices) + 1;
 
 /// Price fields: four blocks of 13, one per list.
 inline constexpr int kPriceFieldCount = 52;

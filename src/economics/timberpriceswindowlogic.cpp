@@ -1,5 +1,8 @@
 #include "economics/timberpriceswindowlogic.hpp"
 
+#include "economics/assortpricesmessages.hpp"
+#include "economics/assortpriceswindowlogic.hpp"
+#include "economics/pricefieldkeys.hpp"
 #include "economics/pricelookup.hpp"
 #include "economics/timberpricesmessages.hpp"
 #include "shell/apperror.hpp"
@@ -14,9 +17,6 @@ namespace {
 
 /// Display format of a price, euro per m³.
 constexpr char16_t kPriceFormat[] = u"#0.00";
-
-/// The typed character of the Backspace key.
-constexpr QChar kBackspace(u'\b');
 
 /// The first field of each block; the block number is the price set's.
 constexpr int kUserFirstField = kUserPrices * kPriceClassCount;
@@ -80,7 +80,8 @@ void TimberPricesWindowLogic::Form_Load() {
             {C::lblNote2, text::lblNote2()},
             {C::lblNote_OVRA1, text::lblNote_OVRA1()},
             {C::lblNote_OVRA2, text::lblNote_OVRA2()},
-            {C::cmdClosePricesList, text::closePricesList()}};
+            {C::cmdClosePricesList, text::closePricesList()},
+            {C::cmdAssortPrices, text::assortPricesButton()}};
         for (const auto &[control, caption] : texts) {
             m_view.setText(single(control), caption);
         }
@@ -170,26 +171,26 @@ void TimberPricesWindowLogic::cmdClosePricesList_Click() {
     shell::guard(m_log, windowLabel("cmdClosePricesList_Click"), [&] { m_view.close(); });
 }
 
+void TimberPricesWindowLogic::cmdAssortPrices_Click() {
+    shell::guard(m_log, windowLabel("cmdAssortPrices_Click"), [&] {
+        if (m_assortPrices != nullptr) {
+            m_assortPrices->show();
+        }
+    });
+}
+
 bool TimberPricesWindowLogic::txtTimbVal_KeyPress(int f, QChar key) const {
     if (!m_prices.priceChanges() || !isUserField(f)) {
         return false;
     }
-    if (key.isDigit() || key == kBackspace) {
-        return true;
-    }
-    return key == QLatin1Char('.') && !m_view.text(field(f)).contains(QLatin1Char('.'));
+    return priceKeyAccepted(m_view.text(field(f)), key);
 }
 
 void TimberPricesWindowLogic::typeText(int f, const QString &typed) {
     if (!txtTimbVal_KeyPress(f, kBackspace)) {
         return;
     }
-    m_view.setText(field(f), QString());
-    for (const QChar c : typed) {
-        if (txtTimbVal_KeyPress(f, c)) {
-            m_view.setText(field(f), m_view.text(field(f)) + c);
-        }
-    }
+    m_view.setText(field(f), typedPrice(typed));
 }
 
 bool TimberPricesWindowLogic::press(TimberPricesControl control) {
@@ -211,6 +212,9 @@ bool TimberPricesWindowLogic::press(TimberPricesControl control) {
         return true;
     case TimberPricesControl::cmdClosePricesList:
         cmdClosePricesList_Click();
+        return true;
+    case TimberPricesControl::cmdAssortPrices:
+        cmdAssortPrices_Click();
         return true;
     default:
         return false;

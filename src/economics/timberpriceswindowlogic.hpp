@@ -16,6 +16,8 @@ class ErrorLog;
 
 namespace arbolex::economics {
 
+class AssortPricesWindowLogic;
+
 class TimberPricesWindowLogic {
 public:
     TimberPricesWindowLogic(Prices &prices, shell::ErrorLog &log, ITimberPricesView &view);
@@ -36,6 +38,9 @@ public:
     void OptNPVprices_Click();
     void OptOvraPrices_Click();
     void cmdClosePricesList_Click();
+    /// Opens the assortment prices window, once one is attached.
+    void cmdAssortPrices_Click();
+    void attachAssortmentPrices(AssortPricesWindowLogic *window) { m_assortPrices = window; }
 
     /// Key filter of price field `field` (0 to 51); `key` is the typed
     /// character, '\b' for Backspace. Only the user fields (13 to 25) take
@@ -65,6 +70,7 @@ private:
     Prices &m_prices;
     shell::ErrorLog &m_log;
     ITimberPricesView &m_view;
+    AssortPricesWindowLogic *m_assortPrices = nullptr;
 };
 
 } // namespace arbolex::economics

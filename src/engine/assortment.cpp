@@ -124,6 +124,78 @@ VolumeRatioCoefficients VolumeRatioFor(std::span<const float, 38> a) {
     return reference;
 }
 
+std::optional<AssortmentBounds> ClassBounds(std::span<const AssortmentCategory> categories) {
+    if (categories.empty()) {
+        categories = kFixedClasses;
+    }
+    if (categories.size() > kMaxAssortmentClasses) {
+        return std::nullopt;
+    }
+    AssortmentBounds bounds;
+    for (std::size_t i = 0; i < categories.size(); ++i) {
+        const double small = categories[i].smallEnd;
+        const double big = categories[i].bigEnd;
+        if (!(std::isfinite(small) && std::isfinite(big) && small - kBelow >= kAssortmentFloor &&
+              (big == 0.0 || big >= small))) {
+            return std::nullopt;
+        }
+        bounds.lower[i] = small - kBelow;
+        bounds.upper[i] = big == 0.0 ? std::numeric_limits<double>::infinity() : big + kAbove;
+    }
+    bounds.count = categories.size();
+    return bounds;
+}
+
+std::optional<AssortmentRatios> StandRatios(float G, float N, const AssortmentBounds &bounds,
+                                            VolumeRatioCoefficients ratio) {
+    if (!(std::isfinite(G) && std::isfinite(N) && G > 0.0f && N > 0.0f)) {
+        return std::nullopt;
+    }
+    // Quadratic mean diameter, cm, as everywhere in the program.
+    const double dq = 200.0 * std::sqrt(double{G} / (double{N} * 3.14159265358979));
+    // Neighbouring classes share their bounds, and the first starts at the
+    // floor: each distinct diameter is evaluated once.
+    std::array<std::pair<double, double>, 2 * kMaxAssortmentClasses + 1> evaluated{};
+    std::size_t count = 0;
+    auto ratioAt = [&](double t) {
+        for (std::size_t k = 0; k < count; ++k) {
+            if (evaluated[k].first == t) {
+                return evaluated[k].second;
+            }
+        }
+        const double s = StandVolumeRatio(dq, t, ratio);
+        evaluated[count++] = {t, s};
+        return s;
+    };
+    AssortmentRatios ratios;
+    ratios.reference = ratioAt(kAssortmentFloor);
+    for (std::size_t i = 0; i < bounds.count; ++i) {
+        ratios.lower[i] = ratioAt(bounds.lower[i]);
+        // A class reaches up to the next class's lower bound, across the gap.
+        ratios.upper[i] = ratioAt(bounds.upper[i] + kGap);
+    }
+    bool valid = std::isfinite(ratios.reference) && ratios.reference > 0.0;
+    for (std::size_t i = 0; valid && i < bounds.count; ++i) {
+        valid = std::isfinite(ratios.lower[i]) && std::isfinite(ratios.upper[i]);
+    }
+    return valid ? std::optional(ratios) : std::nullopt;
+}
+
+Assortment DivideVolume(float volume, const AssortmentBounds &bounds,
+                        const AssortmentRatios &ratios) {
+    Assortment result;
+    result.volume = volume;
+    result.count = bounds.count;
+    if (volume > 0.0f) {
+        for (std::size_t i = 0; i < bounds.count; ++i) {
+            const double share =
+                std::max(0.0, ratios.lower[i] - ratios.upper[i]) / ratios.reference;
+            result.classVolume[i] = static_cast<float>(double{volume} * share);
+        }
+    }
+    return result;
+}
+
 void Grow::assortmentFailure(std::string_view text, std::string_view mark) {
     ++m_faultCount;
     m_errorFlag = -1;
@@ -136,48 +208,19 @@ void Grow::assortmentFailure(std::string_view text, std::string_view mark) {
 }
 
 bool Grow::AsmtG(std::span<const AssortmentCategory> categories, AssortmentBounds &bounds) {
-    if (categories.empty()) {
-        categories = kFixedClasses;
-    }
-    bounds = {};
-    bool valid = categories.size() <= kMaxAssortmentClasses;
-    for (std::size_t i = 0; valid && i < categories.size(); ++i) {
-        const double small = categories[i].smallEnd;
-        const double big = categories[i].bigEnd;
-        valid = std::isfinite(small) && std::isfinite(big) && small - kBelow >= kAssortmentFloor &&
-                (big == 0.0 || big >= small);
-        bounds.lower[i] = small - kBelow;
-        bounds.upper[i] = big == 0.0 ? std::numeric_limits<double>::infinity() : big + kAbove;
-    }
-    if (!valid) {
-        bounds = {};
+    const std::optional<AssortmentBounds> set = ClassBounds(categories);
+    bounds = set.value_or(AssortmentBounds{});
+    if (!set) {
         assortmentFailure("ERROR - Non-recoverable AsmtG calculation error", " in Grow.AsmtG()");
         return false;
     }
-    bounds.count = categories.size();
     return true;
 }
 
 bool Grow::AsmtH(float G, float N, const AssortmentBounds &bounds, AssortmentRatios &ratios) {
-    ratios = {};
-    bool valid = std::isfinite(G) && std::isfinite(N) && G > 0.0f && N > 0.0f;
-    if (valid) {
-        // Quadratic mean diameter, cm, as everywhere in the program.
-        const double dq = 200.0 * std::sqrt(double{G} / (double{N} * 3.14159265358979));
-        const VolumeRatioCoefficients ratio = VolumeRatioFor(m_a);
-        ratios.reference = StandVolumeRatio(dq, kAssortmentFloor, ratio);
-        for (std::size_t i = 0; i < bounds.count; ++i) {
-            ratios.lower[i] = StandVolumeRatio(dq, bounds.lower[i], ratio);
-            // A class reaches up to the next class's lower bound, across the gap.
-            ratios.upper[i] = StandVolumeRatio(dq, bounds.upper[i] + kGap, ratio);
-        }
-        valid = std::isfinite(ratios.reference) && ratios.reference > 0.0;
-        for (std::size_t i = 0; valid && i < bounds.count; ++i) {
-            valid = std::isfinite(ratios.lower[i]) && std::isfinite(ratios.upper[i]);
-        }
-    }
-    if (!valid) {
-        ratios = {};
+    const std::optional<AssortmentRatios> found = StandRatios(G, N, bounds, VolumeRatioFor(m_a));
+    ratios = found.value_or(AssortmentRatios{});
+    if (!found) {
         assortmentFailure("ERROR - Non-recoverable AsmtH calculation error", " in Grow.AsmtH()");
         return false;
     }
@@ -201,15 +244,7 @@ bool Grow::AsmtB(float G, float N, float H, std::span<const AssortmentCategory> 
                           " in Grow.AsmtB()");
         return false;
     }
-    result.volume = volume;
-    result.count = bounds.count;
-    if (volume > 0.0f) {
-        for (std::size_t i = 0; i < bounds.count; ++i) {
-            const double share =
-                std::max(0.0, ratios.lower[i] - ratios.upper[i]) / ratios.reference;
-            result.classVolume[i] = static_cast<float>(double{volume} * share);
-        }
-    }
+    result = DivideVolume(volume, bounds, ratios);
     return true;
 }
 

@@ -6,6 +6,7 @@
 
 #include <array>
 #include <cstddef>
+#include <optional>
 #include <span>
 
 namespace arbolex::engine {
@@ -81,5 +82,21 @@ double StandVolumeRatio(double dq, double t, VolumeRatioCoefficients ratio);
 /// select (docs/assortments.md): A7 and A8 when A1 is 0, the catalogue's
 /// reference conifer function otherwise.
 VolumeRatioCoefficients VolumeRatioFor(std::span<const float, 38> a);
+
+/// AsmtG without its report: the class bounds of `categories` (the fixed
+/// classes when there are none), or std::nullopt for categories AsmtG refuses.
+std::optional<AssortmentBounds> ClassBounds(std::span<const AssortmentCategory> categories);
+
+/// AsmtH without its report: the stand ratios at every bound for a stand of
+/// basal area G (m²/ha) and stocking N (stems/ha), or std::nullopt when the
+/// stand has no basal area or stems or a ratio is not a finite number.
+std::optional<AssortmentRatios> StandRatios(float G, float N, const AssortmentBounds &bounds,
+                                            VolumeRatioCoefficients ratio);
+
+/// AsmtB's division of `volume` (m³/ha) among the classes of `bounds` by
+/// their ratios: V · (S(lower) − S(upper + 0.001)) / S(6.5); every class 0
+/// when the volume is 0 or less.
+Assortment DivideVolume(float volume, const AssortmentBounds &bounds,
+                        const AssortmentRatios &ratios);
 
 } // namespace arbolex::engine

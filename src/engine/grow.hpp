@@ -63,6 +63,8 @@ public:
     double V(int i) const { return m_v[static_cast<std::size_t>(i)]; }
     /// Assortment coefficient Ai, i = 1..38.
     float A(int i) const { return m_a[static_cast<std::size_t>(i - 1)]; }
+    /// The volume-ratio function the active model's assortment coefficients select.
+    VolumeRatioCoefficients volumeRatio() const { return VolumeRatioFor(m_a); }
 
     /// Tallest top height the active model allows, m: the height asymptote
     /// K^(1/b) with K = S6 and b = S1.

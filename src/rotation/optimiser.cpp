@@ -62,8 +62,11 @@ public:
         ++m_regimesGrown;
         // A regime the engine cannot grow is left out: its own engine keeps
         // such failures from the user's report.
-        if (const std::optional<GrowthPath> path =
+        if (std::optional<GrowthPath> path =
                 growPath(m_quiet, m_stand, regime, failure, &m_limits)) {
+            if (m_economics.valuation == Valuation::kAssortments) {
+                divideThinnings(*path);
+            }
             scorePath(*path, regime);
         }
         return true;

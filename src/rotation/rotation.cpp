@@ -103,8 +103,13 @@ Figures figures(const Flows &f, int presentAge, double ratePercent) {
     return out;
 }
 
-void price(Harvest &h, const PriceList &prices) {
-    h.revenue = double{h.volume} * prices[static_cast<std::size_t>(h.priceClass)];
+/// Values `h` as `economics` says; valued by assortments, the harvest is
+/// first divided into its classes unless it was `divided` before.
+void price(Harvest &h, const GrowthPath &path, const Economics &economics, bool divided) {
+    if (economics.valuation == Valuation::kAssortments && !divided) {
+        h.assortments = divideHarvest(h.volume, h.basalArea, h.stocking, path.volumeRatio);
+    }
+    h.revenue = harvestRevenue(h, economics);
 }
 
 /// Thinnings before `rotation` and the final cut at it, valued.
@@ -114,7 +119,7 @@ std::vector<Harvest> harvests(const GrowthPath &path, int rotation, const Econom
     for (const Harvest &t : path.thinnings) {
         if (t.age < rotation) {
             all.push_back(t);
-            price(all.back(), economics.prices);
+            price(all.back(), path, economics, path.thinningsDivided);
         }
     }
     const engine::StandState &s = path.at(rotation);
@@ -125,12 +130,20 @@ std::vector<Harvest> harvests(const GrowthPath &path, int rotation, const Econom
     finalCut.basalArea = s.basalArea;
     finalCut.meanTreeVolume = shownMeanTree(s.volume, s.stocking);
     finalCut.priceClass = priceClassOf(finalCut.meanTreeVolume);
-    price(finalCut, economics.prices);
+    price(finalCut, path, economics, false);
     all.push_back(finalCut);
     return all;
 }
 
 } // namespace
+
+double harvestRevenue(const Harvest &harvest, const Economics &economics, double volumeFactor) {
+    if (economics.valuation == Valuation::kAssortments) {
+        return volumeFactor * assortmentRevenue(harvest.assortments, economics.assortmentPrices);
+    }
+    const int k = priceClassOf(harvest.meanTreeVolume * volumeFactor);
+    return volumeFactor * double{harvest.volume} * economics.prices[static_cast<std::size_t>(k)];
+}
 
 int modelAgeLimit(std::int16_t model) {
     return model == 7 ? 58 : 60;
@@ -204,6 +217,7 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
     }
     float siteIndex = grow.siteIndex();
     path.siteIndex = siteIndex;
+    path.volumeRatio = grow.volumeRatio();
     grow.TM(siteIndex);
     float age = stand.age;
     float basalArea = stand.basalArea;
@@ -290,6 +304,13 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
         nextThinning += regime.thinEvery;
     }
     return path;
+}
+
+void divideThinnings(GrowthPath &path) {
+    for (Harvest &t : path.thinnings) {
+        t.assortments = divideHarvest(t.volume, t.basalArea, t.stocking, path.volumeRatio);
+    }
+    path.thinningsDivided = true;
 }
 
 RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics,

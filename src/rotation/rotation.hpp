@@ -7,6 +7,7 @@
 
 #include "engine/grow.hpp"
 #include "engine/standstate.hpp"
+#include "rotation/assortmentprices.hpp"
 #include "rotation/priceclasses.hpp"
 #include "valuation/forestvalue.hpp"
 
@@ -49,6 +50,14 @@ struct Regime {
     bool thins() const { return thinFrom > 0; }
 };
 
+/// How the harvests of a rotation are valued.
+enum class Valuation {
+    /// The whole volume at the standing price of the mean tree's class.
+    kStandingPrice,
+    /// Each top-diameter class of the assortment report at its own price.
+    kAssortments,
+};
+
 /// What the money of a rotation is counted with.
 struct Economics {
     /// Interest rate, percent.
@@ -59,6 +68,9 @@ struct Economics {
     double annualCost = 0.0;
     /// Standing prices, euro/m³, by mean tree volume class.
     PriceList prices{};
+    Valuation valuation = Valuation::kStandingPrice;
+    /// Prices of the top-diameter classes, euro/m³, when valued by assortments.
+    AssortmentPriceList assortmentPrices{};
 };
 
 /// A thinning or the final cut, per hectare.
@@ -75,9 +87,19 @@ struct Harvest {
     double meanTreeVolume = 0.0;
     /// Price class 0 to 12 of the mean tree.
     int priceClass = 0;
-    /// Revenue, euro/ha: volume × standing price of the mean tree's class.
+    /// Volume in each top-diameter class, m³/ha; filled when the rotation is
+    /// valued by assortments.
+    AssortmentVolumes assortments{};
+    /// Revenue, euro/ha: volume × standing price of the mean tree's class, or
+    /// the sum of the classes' volumes × their prices.
     double revenue = 0.0;
 };
+
+/// Revenue of `harvest`, euro/ha, valued as `economics` says, with its volume
+/// and mean tree times `volumeFactor` (at the same stems, so the mean tree may
+/// change its price class; its assortments keep their shares).
+double harvestRevenue(const Harvest &harvest, const Economics &economics,
+                      double volumeFactor = 1.0);
 
 /// The stand under a regime, year by year from the present age to the age
 /// limit, with every thinning of the regime up to there. One path serves every
@@ -90,10 +112,15 @@ struct GrowthPath {
     int ageLimit = 0;
     /// Site index, m (top height at age 30).
     float siteIndex = 0.0f;
+    /// The model's volume-ratio function, which divides a harvest into
+    /// assortments.
+    engine::VolumeRatioCoefficients volumeRatio{};
     /// State at presentAge + i, before any thinning of that age.
     std::vector<engine::StandState> years;
     /// The thinnings, oldest first; revenues 0 until a rotation is valued.
     std::vector<Harvest> thinnings;
+    /// True once divideThinnings has divided the thinnings into assortments.
+    bool thinningsDivided = false;
 
     /// Last age grown, years: the age limit, or the age of a thinning the
     /// limits did not allow.
@@ -144,6 +171,11 @@ struct ThinningLimits {
 std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const Regime &regime,
                                    GrowthFailure &failure, const ThinningLimits *limits = nullptr,
                                    std::optional<int> finalCut = std::nullopt);
+
+/// Divides the thinnings of `path` into their assortments once, so that
+/// valuing its rotations by assortments reads them instead of dividing them
+/// again for every final-cut age.
+void divideThinnings(GrowthPath &path);
 
 /// One year of the cash flow of a rotation from bare land, euro/ha.
 struct CashFlowYear {

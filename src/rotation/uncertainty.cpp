@@ -20,7 +20,7 @@ public:
     };
 
     Flows(const GrowthPath &path, int rotation, const Economics &economics)
-        : m_presentAge(path.presentAge), m_prices(economics.prices) {
+        : m_presentAge(path.presentAge), m_economics(economics) {
         const RotationValue v = valueRotation(path, rotation, economics);
         for (const CashFlowYear &c : v.cashflow) {
             m_revenue.push_back(c.revenue);
@@ -36,9 +36,8 @@ public:
     std::vector<double> revenueWithVolume(double volumeFactor) const {
         std::vector<double> revenue(m_revenue.size(), 0.0);
         for (const Harvest &h : m_harvests) {
-            const int k = priceClassOf(h.meanTreeVolume * volumeFactor);
             revenue[static_cast<std::size_t>(h.age)] +=
-                volumeFactor * double{h.volume} * m_prices[static_cast<std::size_t>(k)];
+                harvestRevenue(h, m_economics, volumeFactor);
         }
         return revenue;
     }
@@ -62,7 +61,7 @@ public:
 
 private:
     int m_presentAge;
-    PriceList m_prices;
+    Economics m_economics;
     std::vector<Harvest> m_harvests;
     std::vector<double> m_revenue;
     std::vector<double> m_cost;

@@ -19,6 +19,22 @@ bool refusedByKeyFilter(const QKeyEvent &key) {
     return false;
 }
 
+QChar priceFieldKey(const QKeyEvent &key) {
+    if (key.key() == Qt::Key_Backspace || key.key() == Qt::Key_Delete) {
+        return {u'\b'};
+    }
+    if (!(key.modifiers() & (Qt::ControlModifier | Qt::AltModifier)) && !key.text().isEmpty() &&
+        key.text().front().isPrint()) {
+        return key.text().front();
+    }
+    return {};
+}
+
+bool isPriceFieldShortcut(const QKeyEvent &key) {
+    return key.matches(QKeySequence::Paste) || key.matches(QKeySequence::Cut) ||
+           key.matches(QKeySequence::Undo) || key.matches(QKeySequence::Redo);
+}
+
 void focusControl(QWidget *control) {
     if (control == nullptr) {
         return;

@@ -3,6 +3,7 @@
 
 #include "assortments/assortmessages.hpp"
 #include "document/documentmessages.hpp"
+#include "economics/assortpricesmessages.hpp"
 #include "economics/economicsmessages.hpp"
 #include "engine/catalogue.hpp"
 #include "ui/chartpane.hpp"
@@ -166,6 +167,8 @@ void MainWindow::buildMenus() {
     QMenu *assortMenu = menuBar()->addMenu(assortments::text::menuAssortments());
     m_assortUserAction = assortMenu->addAction(assortments::text::userMenu());
     m_assortUserAction->setObjectName(QStringLiteral("mnuAssortUser"));
+    m_assortPricesAction = assortMenu->addAction(economics::text::assortPricesMenu());
+    m_assortPricesAction->setObjectName(QStringLiteral("mnuAssortPrices"));
 
     QMenu *help = menuBar()->addMenu(text::menuHelp());
     connect(help->addAction(text::menuThreshold()), &QAction::triggered, this, [this] {

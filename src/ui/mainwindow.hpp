@@ -73,6 +73,8 @@ public:
     void refreshCharts();
     /// The button "Economics…" that opens the economics window.
     QPushButton *economicsButton() const { return m_economicsButton; }
+    /// The entry `mnuAssortPrices` that opens the assortment prices window.
+    QAction *assortPricesAction() const { return m_assortPricesAction; }
 
     // IMainView
     QString text(workflow::MainControl control) const override;
@@ -129,6 +131,7 @@ private:
     ChartPane *m_chartPane = nullptr;
     ReportMenu *m_reportMenu = nullptr;
     QPushButton *m_economicsButton = nullptr;
+    QAction *m_assortPricesAction = nullptr;
     QTableView *m_grid = nullptr;
     ProjectionModel *m_model = nullptr;
     QTableView *m_summaryGrid = nullptr;

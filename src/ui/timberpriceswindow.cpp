@@ -3,6 +3,7 @@
 #include "economics/timberpricesmessages.hpp"
 #include "economics/timberpriceswindowlogic.hpp"
 #include "ui/controltext.hpp"
+#include "ui/fieldinput.hpp"
 
 #include <QCloseEvent>
 #include <QGridLayout>
@@ -223,7 +224,6 @@ QLayout *TimberPricesWindow::buildNotes() {
 QLayout *TimberPricesWindow::buildCommands() {
     auto *row = new QHBoxLayout;
     row->setSpacing(8);
-    row->addStretch(1);
     const auto add = [this, row](TimberPricesControl c) {
         auto *button = new QPushButton(this);
         button->setObjectName(economics::controlName({c, 0}));
@@ -234,8 +234,12 @@ QLayout *TimberPricesWindow::buildCommands() {
         row->addWidget(button);
         return button;
     };
+    QPushButton *assortPrices = add(TimberPricesControl::cmdAssortPrices);
+    row->addStretch(1);
     QPushButton *change = add(TimberPricesControl::cmdChangePrices);
     QPushButton *closeList = add(TimberPricesControl::cmdClosePricesList);
+    connect(assortPrices, &QPushButton::clicked, this,
+            [this] { run(&TimberPricesWindowLogic::cmdAssortPrices_Click); });
     connect(change, &QPushButton::clicked, this,
             [this] { run(&TimberPricesWindowLogic::cmdChangePrices_Click); });
     connect(closeList, &QPushButton::clicked, this,
@@ -343,18 +347,10 @@ bool TimberPricesWindow::eventFilter(QObject *watched, QEvent *event) {
         return QDialog::eventFilter(watched, event);
     }
     const auto &key = *static_cast<QKeyEvent *>(event);
-    // Keys that would put anything else than typed digits into the field.
-    if (key.matches(QKeySequence::Paste) || key.matches(QKeySequence::Cut) ||
-        key.matches(QKeySequence::Undo) || key.matches(QKeySequence::Redo)) {
+    if (isPriceFieldShortcut(key)) {
         return true;
     }
-    QChar typed;
-    if (key.key() == Qt::Key_Backspace || key.key() == Qt::Key_Delete) {
-        typed = QChar(u'\b');
-    } else if (!(key.modifiers() & (Qt::ControlModifier | Qt::AltModifier)) &&
-               !key.text().isEmpty() && key.text().front().isPrint()) {
-        typed = key.text().front();
-    }
+    const QChar typed = priceFieldKey(key);
     if (!typed.isNull() && !m_logic->txtTimbVal_KeyPress(field, typed)) {
         return true;
     }

@@ -1,5 +1,6 @@
 // The main window's load and unload, the model menu and its information boxes.
 #include "document/documentmessages.hpp"
+#include "economics/assortmentpricefile.hpp"
 #include "economics/pricedata.hpp"
 #include "economics/prices.hpp"
 #include "shell/apperror.hpp"
@@ -56,6 +57,7 @@ void MainWindowLogic::Form_Load(QSettings &settings, const QRect &screen) {
         ChkGrowFromBD();
         showSiteIndex(stored.age, stored.topHeight);
         economics::GetPricesFromFiles(m_dataFolder, m_prices.data(), m_log);
+        economics::GetAssortmentPricesFromFile(m_dataFolder, m_prices.data(), m_log);
         m_prices.selectPriceSet(economics::kCurrentPrices);
         showSummary(false);
         m_view.setText(MainControl::cmdShowTimberPrice, text::showTimberPrices());
@@ -93,6 +95,7 @@ void MainWindowLogic::Form_Unload(QSettings &settings) {
     }
     economics::WritePricesInFiles(3, m_dataFolder, m_prices.data(), m_log);
     economics::WriteUserDefinedAssortmentsInFile(m_dataFolder, m_prices.data(), m_log);
+    economics::WriteAssortmentPricesInFile(m_dataFolder, m_prices.data(), m_log);
 }
 
 void MainWindowLogic::reloadDataFiles() {
@@ -100,6 +103,7 @@ void MainWindowLogic::reloadDataFiles() {
         const std::int16_t inUse = m_prices.priceSetInUse();
         m_prices.data() = economics::PriceData{};
         economics::GetPricesFromFiles(m_dataFolder, m_prices.data(), m_log);
+        economics::GetAssortmentPricesFromFile(m_dataFolder, m_prices.data(), m_log);
         m_prices.selectPriceSet(inUse);
     });
 }

@@ -148,8 +148,12 @@ INSTANTIATE_TEST_SUITE_P(
         BadRotation{"--thin-from 20 --thin-volume 40", "--thin-every is required"},
         BadRotation{"--thin-from 20 --thin-every 5 --thin-volume 900",
                     "the thinning at age 20 removes 900.00 m3/ha"},
-        BadRotation{"--thin-from 10 --thin-every 5 --thin-volume 40",
-                    "before the present age 15"}));
+        BadRotation{"--thin-from 10 --thin-every 5 --thin-volume 40", "before the present age 15"},
+        BadRotation{"--valuation price", "--valuation takes stand or assortment"},
+        BadRotation{"--assortment-prices p.qdm",
+                    "--assortment-prices is for --valuation assortment"},
+        BadRotation{"--valuation assortment --assortment-prices /nonexistent/p.qdm",
+                    "assortment prices \"p.qdm\": File not found"}));
 
 TEST_F(RotationCliTest, UnthinnedModelRefusesARegime) {
     const Outcome r = run(QStringLiteral(

@@ -74,10 +74,33 @@ TEST_F(RunnerPricesTest, RefusesWhatTheWindowDoesNotHave) {
         {"set frmTimberPrices.lblTimbCat(0) 1", "no field named 'frmTimberPrices.lblTimbCat(0)'"},
         {"press frmTimberPrices.txtTimbVal(1)", "no command named 'frmTimberPrices.txtTimbVal(1)'"},
         {"press frmTimberPrices.OptPrices", "no command named 'frmTimberPrices.OptPrices'"},
+        {"set frmAssortPrices.txtAsmtVal(3) 1", "no field named 'frmAssortPrices.txtAsmtVal(3)'"},
+        {"set frmAssortPrices.lblAsmtCat(0) 1", "no field named 'frmAssortPrices.lblAsmtCat(0)'"},
+        {"press frmAssortPrices.txtAsmtVal(0)", "no command named 'frmAssortPrices.txtAsmtVal(0)'"},
     };
     for (const Case &c : cases) {
         EXPECT_EQ(runner.runLine(QLatin1String(c.line)), QString::fromUtf8(c.error)) << c.line;
     }
+}
+
+TEST_F(RunnerPricesTest, AssortmentPricesFromTheTimberPricesWindowAreSavedAtExit) {
+    const QStringList lines = run({
+        QStringLiteral("press cmdShowTimberPrice"),
+        QStringLiteral("press frmTimberPrices.cmdAssortPrices"),
+        QStringLiteral("print frmAssortPrices.lblAsmtCat(2)"),
+        QStringLiteral("print frmAssortPrices.txtAsmtVal(2)"),
+        QStringLiteral("press frmAssortPrices.cmdChangeAsmtPrices"),
+        QStringLiteral("set frmAssortPrices.txtAsmtVal(2) 55"),
+        QStringLiteral("press frmAssortPrices.cmdChangeAsmtPrices"),
+        QStringLiteral("press frmAssortPrices.cmdCloseAsmtPrices"),
+    });
+    ASSERT_TRUE(outcome.ok()) << outcome.error.toStdString();
+    EXPECT_EQ(lines, (QStringList{QStringLiteral(">20 cm:"), QStringLiteral("48.00")}));
+    EXPECT_FALSE(session.assortPricesView().isShown());
+    session.main().Form_Unload(settings);
+    QFile file(dir.filePath(QStringLiteral("AssortPrices.qdm")));
+    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
+    EXPECT_EQ(file.readAll(), QByteArray("10\r\n28\r\n55\r\n"));
 }
 
 } // namespace
