@@ -12,18 +12,18 @@ constexpr std::array<const char *, kEconomicsControlCount> kNames = {
     "txtAnnualCost",   "txtDraws",
     "txtSeed",         "txtPriceSpread",
     "txtRateLow",      "txtRateHigh",
-    "txtCostSpread",   "lblStand",
-    "lblRegime",       "lblRate",
-    "lblNPV",          "lblLEV",
-    "lblEAA",          "lblForestValue",
-    "lblIRR",          "lblBreakEven",
-    "lblRotation",     "lblBiological",
-    "lblEconomic",     "lblMAI",
-    "lblYieldClass",   "lblOptimiser",
-    "lblMonteCarlo",   "cmdCompute",
-    "cmdOptimise",     "cmdCancel",
-    "cmdApply",        "cmdMonteCarlo",
-    "cmdClose"};
+    "txtCostSpread",   "cboValuation",
+    "lblStand",        "lblRegime",
+    "lblRate",         "lblNPV",
+    "lblLEV",          "lblEAA",
+    "lblForestValue",  "lblIRR",
+    "lblBreakEven",    "lblRotation",
+    "lblBiological",   "lblEconomic",
+    "lblMAI",          "lblYieldClass",
+    "lblOptimiser",    "lblMonteCarlo",
+    "cmdCompute",      "cmdOptimise",
+    "cmdCancel",       "cmdApply",
+    "cmdMonteCarlo",   "cmdClose"};
 } // namespace
 
 QString economicsControlName(EconomicsControl control) {
@@ -35,7 +35,7 @@ std::optional<EconomicsControl> economicsControlFromName(const QString &name) {
 }
 
 bool isEconomicsField(EconomicsControl control) {
-    return control <= EconomicsControl::txtCostSpread;
+    return control <= EconomicsControl::cboValuation;
 }
 
 } // namespace arbolex::economics

@@ -20,6 +20,8 @@ enum class EconomicsControl {
     txtRateLow,
     txtRateHigh,
     txtCostSpread,
+    // how the harvests are valued: by the mean tree's standing price or by assortments
+    cboValuation,
     // what the window tells
     lblStand,
     lblRegime,
@@ -52,7 +54,7 @@ inline constexpr int kEconomicsControlCount = static_cast<int>(EconomicsControl:
 QString economicsControlName(EconomicsControl control);
 /// The control named `name`, if the window has one.
 std::optional<EconomicsControl> economicsControlFromName(const QString &name);
-/// True for the fields the user types into.
+/// True for the fields the user types into (and the valuation choice).
 bool isEconomicsField(EconomicsControl control);
 
 } // namespace arbolex::economics

@@ -38,6 +38,17 @@ inline QString labelInterestRate() {
 inline QString labelEstablishmentCost() {
     return QStringLiteral("Establishment cost (€/ha):");
 }
+inline QString labelValuation() {
+    return QStringLiteral("Valued by:");
+}
+/// The two valuations of the choice cboValuation; a script may type the
+/// first word ("standing", "assortment").
+inline QString valuationStanding() {
+    return QStringLiteral("Standing price of the mean tree");
+}
+inline QString valuationAssortments() {
+    return QStringLiteral("Assortment prices (7-14, 14-20, >20 cm)");
+}
 inline QString labelAnnualCost() {
     return QStringLiteral("Annual cost (€/ha/yr):");
 }

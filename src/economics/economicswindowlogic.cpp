@@ -31,9 +31,25 @@ bool sameStand(const rotation::Stand &a, const rotation::Stand &b) {
            a.height == b.height && a.basalArea == b.basalArea;
 }
 
+/// What the harvests were valued with, for the line under the stand.
+QString pricesText(const rotation::Economics &e) {
+    if (e.valuation == rotation::Valuation::kStandingPrice) {
+        return QStringLiteral("long-term average timber prices");
+    }
+    QStringList classes;
+    for (std::size_t i = 0; i < e.assortmentPrices.size(); ++i) {
+        classes.append(QString::fromUtf8(
+                           rotation::kAssortmentClassCaptions[i].data(),
+                           static_cast<qsizetype>(rotation::kAssortmentClassCaptions[i].size())) +
+                       QLatin1Char(' ') + QString::number(e.assortmentPrices[i], 'f', 2));
+    }
+    return QStringLiteral("assortment prices €/m³ ") + classes.join(QStringLiteral(", "));
+}
+
 bool sameMoney(const rotation::Economics &a, const rotation::Economics &b) {
     return a.ratePercent == b.ratePercent && a.establishmentCost == b.establishmentCost &&
-           a.annualCost == b.annualCost && a.prices == b.prices;
+           a.annualCost == b.annualCost && a.prices == b.prices && a.valuation == b.valuation &&
+           a.assortmentPrices == b.assortmentPrices;
 }
 
 QString irrText(const valuation::InternalRate &irr) {
@@ -132,6 +148,14 @@ bool EconomicsWindowLogic::readEconomics() {
     longTerm.data() = m_main.prices().data();
     longTerm.selectPriceSet(kLongTermPrices);
     e.prices = longTerm.pricesInUse();
+    // Or every harvest divided into the assortment report's classes and sold
+    // at the assortment prices.
+    if (m_view.text(C::cboValuation)
+            .trimmed()
+            .startsWith(QStringLiteral("assortment"), Qt::CaseInsensitive)) {
+        e.valuation = rotation::Valuation::kAssortments;
+        e.assortmentPrices = m_main.prices().data().assortmentPrices;
+    }
     // One interest rate for the program: the cash flow's.
     m_main.cashFlow().setInterestRate(e.ratePercent);
     m_economics = e;
@@ -232,9 +256,8 @@ void EconomicsWindowLogic::showFigures() {
         regime += QStringLiteral(" The table has no final cut: the economic rotation is valued.");
     }
     m_view.setText(C::lblRegime, regime);
-    m_view.setText(C::lblRate, QStringLiteral("At ") + rateText() +
-                                   QStringLiteral(" % a year · long-term average timber prices · "
-                                                  "establishment ") +
+    m_view.setText(C::lblRate, QStringLiteral("At ") + rateText() + QStringLiteral(" % a year · ") +
+                                   pricesText(m_economics) + QStringLiteral(" · establishment ") +
                                    euroText(m_economics.establishmentCost) +
                                    QStringLiteral(" €/ha · annual cost ") +
                                    euroText(m_economics.annualCost) + QStringLiteral(" €/ha/yr"));

@@ -10,6 +10,7 @@
 #include <QApplication>
 #include <QChart>
 #include <QChartView>
+#include <QComboBox>
 #include <QFormLayout>
 #include <QGroupBox>
 #include <QHBoxLayout>
@@ -85,6 +86,9 @@ EconomicsWindow::EconomicsWindow(QWidget *main) : QDialog(main) {
         fieldRow({{et::labelInterestRate(), field(C::txtInterestRate, 7)},
                   {et::labelEstablishmentCost(), field(C::txtEstablishmentCost, 8)},
                   {et::labelAnnualCost(), field(C::txtAnnualCost, 6)}});
+    inputs->addSpacing(8);
+    inputs->addWidget(new QLabel(et::labelValuation(), this));
+    inputs->addWidget(valuationChoice());
     inputs->addWidget(button(C::cmdCompute, et::buttonCompute()));
     inputs->addStretch(1);
     layout->addLayout(inputs);
@@ -275,6 +279,19 @@ QWidget *EconomicsWindow::field(EconomicsControl c, int characters) {
     return edit;
 }
 
+QWidget *EconomicsWindow::valuationChoice() {
+    auto *choice = new QComboBox(this);
+    choice->setObjectName(economics::economicsControlName(C::cboValuation));
+    choice->addItems({et::valuationStanding(), et::valuationAssortments()});
+    m_controls.at(slot(C::cboValuation)) = choice;
+    connect(choice, &QComboBox::activated, this, [this] {
+        if (m_logic != nullptr) {
+            m_logic->cmdCompute_Click();
+        }
+    });
+    return choice;
+}
+
 QLabel *EconomicsWindow::label(EconomicsControl c) {
     auto *l = new QLabel(this);
     l->setObjectName(economics::economicsControlName(c));
@@ -320,6 +337,9 @@ QString EconomicsWindow::text(EconomicsControl c) const {
     if (auto *edit = qobject_cast<QLineEdit *>(control(c))) {
         return edit->text();
     }
+    if (auto *choice = qobject_cast<QComboBox *>(control(c))) {
+        return choice->currentText();
+    }
     if (auto *l = qobject_cast<QLabel *>(control(c))) {
         return l->text();
     }
@@ -332,6 +352,9 @@ QString EconomicsWindow::text(EconomicsControl c) const {
 void EconomicsWindow::setText(EconomicsControl c, const QString &value) {
     if (auto *edit = qobject_cast<QLineEdit *>(control(c))) {
         edit->setText(value);
+    } else if (auto *choice = qobject_cast<QComboBox *>(control(c))) {
+        const int found = choice->findText(value, Qt::MatchStartsWith);
+        choice->setCurrentIndex(found >= 0 ? found : 0);
     } else if (auto *l = qobject_cast<QLabel *>(control(c))) {
         l->setText(value);
     } else if (auto *b = qobject_cast<QPushButton *>(control(c))) {

@@ -64,6 +64,8 @@ private:
     QWidget *buildMonteCarloTab();
     QWidget *field(economics::EconomicsControl control, int characters);
     QLabel *label(economics::EconomicsControl control);
+    /// The choice cboValuation: standing price of the mean tree or assortments.
+    QWidget *valuationChoice();
     QWidget *button(economics::EconomicsControl control, const QString &caption);
     /// Shows `chart` in `view`, deleting the chart it showed before.
     static void showChart(QChartView *view, QChart *chart);

@@ -101,6 +101,18 @@ TEST_F(EconomicsWindowTest, FiguresAreTheRotationLibrarysForTheTablesRotation) {
     // The Monte Carlo draws come with the figures.
     ASSERT_TRUE(economics.monteCarlo());
     EXPECT_TRUE(view.text(EconomicsControl::lblMonteCarlo).contains(QStringLiteral("10,000")));
+
+    // Valued by assortments instead, at the assortment prices in use.
+    prices.data().assortmentPrices = {10.0, 28.0, 48.0};
+    economics.typeText(EconomicsControl::cboValuation, QStringLiteral("Assortment"));
+    economics.cmdCompute_Click();
+    money.valuation = rotation::Valuation::kAssortments;
+    money.assortmentPrices = {10.0, 28.0, 48.0};
+    const rotation::RotationValue byClass = rotation::valueRotation(*path, 45, money);
+    EXPECT_EQ(economics.value()->npv, byClass.npv);
+    EXPECT_EQ(economics.value()->lev, byClass.lev);
+    EXPECT_NE(byClass.npv, expected.npv);
+    EXPECT_TRUE(view.text(EconomicsControl::lblRate).contains(QStringLiteral("assortment prices")));
 }
 
 TEST_F(EconomicsWindowTest, IrregularThinningsAreValuedAsTheirMeansAndSaidSo) {
