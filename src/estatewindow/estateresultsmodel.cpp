@@ -66,9 +66,17 @@ QString EstateResultsModel::cellText(int row, int column) const {
         break;
     }
     const int figure = kFigureOf.at(static_cast<std::size_t>(column));
-    return figure >= 0 && static_cast<std::size_t>(figure) < r.figures.size()
-               ? QString::fromStdString(r.figures[static_cast<std::size_t>(figure)])
-               : QString();
+    if (figure < 0 || static_cast<std::size_t>(figure) >= r.figures.size()) {
+        return {};
+    }
+    const QString value = QString::fromStdString(r.figures[static_cast<std::size_t>(figure)]);
+    // The site index as the main window shows it, volumes to the cubic metre.
+    const int decimals = column == kSiteIndexColumn                            ? 1
+                         : column == kThinnedColumn || column == kFelledColumn ? 0
+                                                                               : -1;
+    bool ok = false;
+    const double number = value.toDouble(&ok);
+    return decimals >= 0 && ok ? QString::number(number, 'f', decimals) : value;
 }
 
 QVariant EstateResultsModel::data(const QModelIndex &index, int role) const {
