@@ -3,8 +3,6 @@
 #include "estatewindow/estatemessages.hpp"
 #include "shell/vbformat.hpp"
 
-#include <limits>
-
 #include <array>
 
 namespace arbolex::estatewindow {
@@ -101,8 +99,8 @@ QVariant EstateResultsModel::data(const QModelIndex &index, int role) const {
         }
         bool ok = false;
         const double number = text.toDouble(&ok);
-        // Rows without the figure sort after every number.
-        return ok ? QVariant(number) : QVariant(std::numeric_limits<double>::max());
+        // No value for a row without the figure: the view keeps those last.
+        return ok ? QVariant(number) : QVariant();
     }
     default:
         return {};

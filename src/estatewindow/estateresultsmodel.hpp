@@ -36,7 +36,8 @@ class EstateResultsModel : public QAbstractTableModel {
     Q_OBJECT
 public:
     enum Role {
-        /// The value a column sorts by: a number, or the text.
+        /// The value a column sorts by: a number, or the text; no value for
+        /// a figure the row does not have.
         kSortRole = Qt::UserRole,
         /// True for a row that was not grown.
         kNotGrownRole,

@@ -58,6 +58,20 @@ public:
         }
         return QSortFilterProxyModel::data(index, role);
     }
+
+protected:
+    /// Rows without the figure stay at the bottom in either order.
+    bool lessThan(const QModelIndex &left, const QModelIndex &right) const override {
+        const bool hasLeft = left.data(sortRole()).isValid();
+        const bool hasRight = right.data(sortRole()).isValid();
+        if (hasLeft && hasRight) {
+            return QSortFilterProxyModel::lessThan(left, right);
+        }
+        if (hasLeft == hasRight) {
+            return false;
+        }
+        return sortOrder() == Qt::DescendingOrder ? !hasLeft : !hasRight;
+    }
 };
 
 EstateWindow::EstateWindow(QWidget *parent) : QWidget(parent, Qt::Window) {

@@ -60,7 +60,7 @@ protected:
     }
 
     QString writeEstate(const char *name, const char *text) {
-        const QString path = dir.filePath(QLatin1String(name));
+        QString path = dir.filePath(QLatin1String(name));
         QFile f(path);
         EXPECT_TRUE(f.open(QIODevice::WriteOnly));
         f.write(text);
@@ -176,11 +176,12 @@ TEST_F(EstateWindowTest, ARowNotGrownIsMarkedWithItsMessageAndCannotBeOpened) {
     EXPECT_EQ(model.data(bad, Qt::ToolTipRole).toString(), message);
     EXPECT_EQ(model.cellText(1, EstateResultsModel::kStatusColumn), QStringLiteral("refused"));
     EXPECT_EQ(model.cellText(1, EstateResultsModel::kNpvColumn), QString());
-    // Sorting by a figure puts the row without one last.
-    EXPECT_GT(
-        model.data(bad, EstateResultsModel::kSortRole).toDouble(),
+    // A figure sorts by its number; a row without one has nothing to sort by.
+    EXPECT_FALSE(model.data(bad, EstateResultsModel::kSortRole).isValid());
+    EXPECT_EQ(
         model.data(model.index(0, EstateResultsModel::kNpvColumn), EstateResultsModel::kSortRole)
-            .toDouble());
+            .typeId(),
+        QMetaType::Double);
 
     growTo(QStringLiteral("30"));
     const auto before = tableCells();
@@ -248,6 +249,18 @@ TEST_F(EstateWindowTest, AnOpenedRowIsItsRegimeTypedByHandAsANewUnsavedDocument)
     EXPECT_EQ(documents.displayName(), QStringLiteral("GL-01"));
     EXPECT_TRUE(documents.isModified());
     EXPECT_TRUE(view.caption().contains(QStringLiteral("GL-01")));
+}
+
+TEST_F(EstateWindowTest, EveryRowOfTheExampleOpensGrownAndFelled) {
+    estateLogic.openEstate(exampleEstate());
+    for (int row = estateLogic.model().rowCount() - 1; row >= 0; --row) {
+        interactive.unsavedAnswers.append(shell::UnsavedChoice::Discard);
+        estateLogic.openSubCompartment(row);
+        const auto &r = estateLogic.model().rows()[static_cast<std::size_t>(row)];
+        EXPECT_TRUE(logic.felled()) << r.id.toStdString();
+        EXPECT_EQ(logic.identification().subCompartment, r.id);
+    }
+    EXPECT_TRUE(interactive.messages.isEmpty()) << interactive.messages.value(0).text.toStdString();
 }
 
 } // namespace
