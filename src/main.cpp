@@ -10,6 +10,7 @@
 #include "economics/prices.hpp"
 #include "economics/timberpriceswindowlogic.hpp"
 #include "engine/grow.hpp"
+#include "estatewindow/estatewindowlogic.hpp"
 #include "shell/datafolder.hpp"
 #include "shell/datahistory.hpp"
 #include "shell/enginereport.hpp"
@@ -23,6 +24,7 @@
 #include "ui/chartpanel.hpp"
 #include "ui/documentmenu.hpp"
 #include "ui/economicswindow.hpp"
+#include "ui/estatewindow.hpp"
 #include "ui/mainwindow.hpp"
 #include "ui/modelchoicedialog.hpp"
 #include "ui/npvwindow.hpp"
@@ -39,6 +41,7 @@
 #include <QCommandLineParser>
 #include <QDir>
 #include <QFile>
+#include <QMenu>
 #include <QPushButton>
 #include <QScreen>
 #include <QSettings>
@@ -323,6 +326,45 @@ bool demoEconomics(MainWindowLogic &logic, ThinWindowLogic &thin,
     return true;
 }
 
+/// The estate demonstrations, on the example estate (examples/estate.csv of
+/// the data folder or of the current folder's data):
+///   table   the sub-compartments;
+///   chart   the harvest forecast;
+///   marked  the same with two rows the program refuses added, in red;
+///   opened  the first sub-compartment opened in the main window.
+/// False for an unknown stage.
+bool demoEstate(arbolex::estatewindow::EstateWindowLogic &estate, arbolex::ui::EstateWindow &window,
+                const QString &dataFolder, const QString &stage) {
+    const QStringList stages = {QStringLiteral("table"), QStringLiteral("chart"),
+                                QStringLiteral("marked"), QStringLiteral("opened")};
+    if (!stages.contains(stage)) {
+        return false;
+    }
+    QString path = QDir(dataFolder).filePath(QStringLiteral("examples/estate.csv"));
+    if (!QFile::exists(path)) {
+        path = QDir::current().filePath(QStringLiteral("data/examples/estate.csv"));
+    }
+    if (stage == QLatin1String("marked")) {
+        QFile example(path);
+        path = QDir::temp().filePath(QStringLiteral("arbolex-demo-estate.csv"));
+        QFile marked(path);
+        if (example.open(QIODevice::ReadOnly) && marked.open(QIODevice::WriteOnly)) {
+            marked.write(example.readAll());
+            marked.write("GL-04,Glenmore,0,15,lots,7.0,20.0,,3.0,20,5,40,,\n"
+                         "AR-04,Ardnish,3,95,1500,20.0,40.0,,2.0,0,,,,\n");
+        }
+    }
+    window.tabs()->setCurrentIndex(stage == QLatin1String("chart") ? 1 : 0);
+    estate.openEstate(path);
+    if (stage == QLatin1String("opened")) {
+        QTimer::singleShot(2500, &window, [&estate, &window] {
+            window.hide();
+            estate.openSubCompartment(0);
+        });
+    }
+    return true;
+}
+
 /// The options of the command line.
 struct Options {
     explicit Options(QCommandLineParser &parser) {
@@ -354,6 +396,8 @@ struct Options {
         parser.addOption(demoEconomics);
         demoAssortPrices.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(demoAssortPrices);
+        demoEstate.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(demoEstate);
         quitWhenShown.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(quitWhenShown);
     }
@@ -385,6 +429,9 @@ struct Options {
                                      QStringLiteral("STAGE")};
     /// Opens the assortment prices window with changes allowed.
     QCommandLineOption demoAssortPrices{QStringLiteral("demo-assort-prices")};
+    /// The example estate run: table, chart, or opened (its first row in the main window).
+    QCommandLineOption demoEstate{QStringLiteral("demo-estate"), QString(),
+                                  QStringLiteral("STAGE")};
     /// Ends the program once the main window is on screen: start-up is timed with it.
     QCommandLineOption quitWhenShown{QStringLiteral("quit-when-shown")};
 };
@@ -498,6 +545,12 @@ int main(int argc, char *argv[]) {
     documentMenu.attach(documents);
     window.setCloseCheck([&documents] { return documents.maySafelyDiscard(); });
     documents.start();
+    // The estate window, from File → Open Estate…
+    arbolex::ui::EstateWindow estateWindow(&window);
+    arbolex::estatewindow::EstateWindowLogic estateLogic(logic, thinLogic, documents, estateWindow,
+                                                         interactive);
+    estateWindow.attach(estateLogic);
+    estateWindow.addOpenEntry(*window.fileMenu(), documentMenu.recentMenu()->menuAction());
     if (const QStringList files = parser.positionalArguments(); !files.isEmpty()) {
         const QString file = files.first();
         QTimer::singleShot(0, &window, [&documents, file] { documents.open(file); });
@@ -552,6 +605,14 @@ int main(int argc, char *argv[]) {
                 qWarning("unknown document demonstration: %s", qPrintable(stage));
             }
         });
+    } else if (parser.isSet(options.demoEstate)) {
+        const QString stage = parser.value(options.demoEstate);
+        interactive.queueAnswer(false); // the final cut's offer of the net present value
+        QTimer::singleShot(0, &window, [&, stage] {
+            if (!demoEstate(estateLogic, estateWindow, folder, stage)) {
+                qWarning("unknown estate demonstration: %s", qPrintable(stage));
+            }
+        });
     } else if (parser.isSet(options.demoAssortPrices)) {
         QTimer::singleShot(0, &window, [&assortPricesLogic] {
             assortPricesLogic.show();
@@ -575,5 +636,6 @@ int main(int argc, char *argv[]) {
     }
     app.exec();
     economicsWindow.waitForWork();
+    estateWindow.waitForWork();
     return 0;
 }

@@ -37,7 +37,10 @@ void DocumentController::start() {
 }
 
 QString DocumentController::displayName() const {
-    return m_path.isEmpty() ? text::untitled() : QFileInfo(m_path).fileName();
+    if (m_path.isEmpty()) {
+        return m_newName.isEmpty() ? text::untitled() : m_newName;
+    }
+    return QFileInfo(m_path).fileName();
 }
 
 bool DocumentController::isModified() const {
@@ -50,6 +53,7 @@ void DocumentController::refreshCaption() {
 
 void DocumentController::adopt(const QString &path) {
     m_path = path;
+    m_newName.clear();
     m_saved = m_main.snapshot();
     if (!path.isEmpty()) {
         rememberRecent(path);
@@ -87,7 +91,7 @@ bool DocumentController::maySafelyDiscard() {
     return false;
 }
 
-void DocumentController::becomeEmpty() {
+Document DocumentController::emptyWork() const {
     Document empty = m_main.snapshot();
     empty.identification = {};
     empty.rows.clear();
@@ -96,8 +100,19 @@ void DocumentController::becomeEmpty() {
     empty.standingVolume = 0.0;
     empty.felled = false;
     empty.cashFlow.clear();
-    m_main.restore(empty);
+    return empty;
+}
+
+void DocumentController::becomeEmpty() {
+    m_main.restore(emptyWork());
     adopt(QString());
+}
+
+void DocumentController::adoptNew(const QString &name) {
+    m_path.clear();
+    m_newName = name;
+    m_saved = emptyWork();
+    refreshCaption();
 }
 
 void DocumentController::fileNew() {

@@ -58,6 +58,11 @@ public:
     void editIdentification();
     void setIdentification(const SubCompartment &id);
 
+    /// The work now in the window becomes a new document, never saved and
+    /// named `name` until it is: everything in it counts as unsaved. The
+    /// caller asks maySafelyDiscard() before it replaces the work.
+    void adoptNew(const QString &name);
+
     /// Asks before unsaved work would be lost (Save / Discard / Cancel);
     /// true when the work may go: nothing unsaved, saved, or discarded.
     bool maySafelyDiscard();
@@ -78,6 +83,8 @@ private:
     /// The document's file is now `path`, holding exactly the work as it stands.
     void adopt(const QString &path);
     void becomeEmpty();
+    /// The work as it stands with an empty table and no identification.
+    Document emptyWork() const;
     bool openFile(const QString &path, bool askFirst);
     void rememberRecent(const QString &path);
     QString lastFolder() const;
@@ -87,6 +94,8 @@ private:
     QSettings *m_settings;
     IDocumentDialogs *m_dialogs;
     QString m_path;
+    /// Name of a new document that has none from a file ("Untitled" when empty).
+    QString m_newName;
     /// The work as last opened or saved.
     Document m_saved;
     QStringList m_recent;

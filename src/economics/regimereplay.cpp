@@ -1,6 +1,7 @@
 // "Apply": a regime of the optimiser written into the projection table by the
 // commands a user would press: clear, type the stand, grow to each thinning
 // age, thin by the volume method and accept, grow to the rotation, final cut.
+#include "economics/regimereplay.hpp"
 #include "economics/economicsmessages.hpp"
 #include "economics/economicswindowlogic.hpp"
 #include "shell/apperror.hpp"
@@ -38,11 +39,11 @@ private:
     thinning::ThinningFlags &m_flags;
 };
 
-/// Writes `regime` felled at `rotation` for `stand` into the table; the reason
-/// when a step could not be made.
-std::optional<QString> replay(workflow::MainWindowLogic &main, thinning::ThinWindowLogic &thin,
-                              const rotation::Stand &stand, const rotation::Regime &regime,
-                              int rotation) {
+} // namespace
+
+std::optional<QString> replayRegime(workflow::MainWindowLogic &main,
+                                    thinning::ThinWindowLogic &thin, const rotation::Stand &stand,
+                                    const rotation::Regime &regime, int rotation) {
     const double typedStep = shell::val(main.view().text(MainControl::txtByA));
     const double step = typedStep >= 1.0 ? typedStep : kDefaultStep;
     // Whole years: the grow command moves the start to the nearest one.
@@ -93,8 +94,6 @@ std::optional<QString> replay(workflow::MainWindowLogic &main, thinning::ThinWin
     return std::nullopt;
 }
 
-} // namespace
-
 void EconomicsWindowLogic::cmdApply_Click(int rank) {
     shell::guard(m_main.errorLog(), QStringLiteral(" in frmEconomics.cmdApply_Click()"), [&] {
         if (m_optimising) {
@@ -105,7 +104,8 @@ void EconomicsWindowLogic::cmdApply_Click(int rank) {
             return;
         }
         const rotation::Candidate chosen = m_best[static_cast<std::size_t>(rank - 1)];
-        if (const auto failed = replay(m_main, m_thin, m_stand, chosen.regime, chosen.rotation)) {
+        if (const auto failed =
+                replayRegime(m_main, m_thin, m_stand, chosen.regime, chosen.rotation)) {
             m_interactive.message(economicstext::titleEconomics(),
                                   economicstext::applyStopped() + *failed, shell::kExclamation);
         }
