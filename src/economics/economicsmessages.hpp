@@ -132,8 +132,8 @@ inline QString figureNotes() {
         "LEV: bare land planted now and managed this way for ever. Annuity: the LEV as a "
         "yearly rent. Forest value: the NPV and, after the final cut, the land's LEV. "
         "IRR: the rate at which planting just pays. Break-even: the share of today's timber "
-        "prices at which the LEV is 0. Timber at long-term average standing prices; money "
-        "per hectare.");
+        "prices at which the LEV is 0. Timber at the prices named above (long-term average "
+        "standing prices, or assortment prices); money per hectare.");
 }
 inline QString figureYieldClass() {
     return QStringLiteral("Yield class");

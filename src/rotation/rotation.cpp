@@ -359,7 +359,8 @@ RotationExplorer exploreRotations(const GrowthPath &path, const Regime &regime,
     RotationExplorer e;
     double bestMai = -std::numeric_limits<double>::infinity();
     double bestLev = -std::numeric_limits<double>::infinity();
-    for (int r = firstRotation(path, regime); r <= path.ageLimit; ++r) {
+    // A path that ended early (limits, or grown for one final cut) has no later ages.
+    for (int r = firstRotation(path, regime); r <= path.lastAge(); ++r) {
         Harvest finalCut;
         const Flows f = cashFlows(harvests(path, r, economics, finalCut), r, economics);
         const Figures fig = figures(f, path.presentAge, economics.ratePercent);
