@@ -11,6 +11,9 @@ namespace arbolex::estate {
 
 namespace {
 
+/// Largest area of one sub-compartment, ha.
+constexpr double kLargestAreaHa = 100000.0;
+
 /// Ages and intervals of a regime, years, as the command line takes them.
 constexpr int kLongestAge = 200;
 
@@ -187,6 +190,12 @@ std::variant<RowPlan, std::string> planRow(const Layout &layout, const RowValues
     const std::optional<double> area = row.value(Column::kAreaHa);
     if (!area || !(*area > 0.0)) {
         return "the area_ha \"" + row.text(Column::kAreaHa) + "\" is not an area above 0 ha";
+    }
+    // Larger is no sub-compartment; and the forecast's whole litres and cents
+    // of a million such rows still add up within 64 bits.
+    if (*area > kLargestAreaHa) {
+        return "the area_ha \"" + row.text(Column::kAreaHa) +
+               "\" is larger than a sub-compartment can be (100000 ha)";
     }
     plan.areaHa = *area;
 

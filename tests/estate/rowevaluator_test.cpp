@@ -76,6 +76,8 @@ INSTANTIATE_TEST_SUITE_P(
                text(kRangeBasalArea)},
         BadRow{"area not positive", with(sitkaRow(), "area_ha", "0"), kRefused,
                "the area_ha \"0\" is not an area above 0 ha"},
+        BadRow{"area past any sub-compartment", with(sitkaRow(), "area_ha", "2.5e31"), kRefused,
+               "the area_ha \"2.5e31\" is larger than a sub-compartment can be (100000 ha)"},
         BadRow{"area missing", with(sitkaRow(), "area_ha", ""), kRefused,
                "the area_ha has no value"},
         BadRow{"interval not whole", with(sitkaRow(), "thin_every", "five"), kRefused,
