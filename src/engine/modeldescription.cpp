@@ -25,8 +25,8 @@ const CatalogueEntry &entry(int modelId) {
     return catalogue()[static_cast<std::size_t>(modelId)];
 }
 
-std::string_view speciesOf(std::string_view label) {
-    const std::string_view code = label.substr(0, label.find(' '));
+std::string_view speciesName(int modelId) {
+    const std::string_view code = speciesCode(modelId);
     for (const auto &[abbreviation, name] : kSpecies) {
         if (abbreviation == code) {
             return name;
@@ -102,6 +102,11 @@ std::string regimeText(bool thinned) {
 
 } // namespace
 
+std::string_view speciesCode(int modelId) {
+    const std::string_view label = entry(modelId).label;
+    return label.substr(0, label.find(' '));
+}
+
 bool HasVolumeCorrection(int modelId) {
     return modelId == 16 || modelId == 17;
 }
@@ -109,7 +114,7 @@ bool HasVolumeCorrection(int modelId) {
 ModelDescription describeModel(int modelId) {
     const CatalogueEntry &own = entry(modelId);
     ModelDescription model;
-    model.species = speciesOf(own.label);
+    model.species = speciesName(modelId);
     model.thinnedRegime = std::string_view(own.label).find("(Thinned)") != std::string_view::npos;
     model.baseModel = baseOf(modelId);
     model.thinningResponse =

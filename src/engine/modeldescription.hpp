@@ -30,6 +30,9 @@ struct ModelDescription {
     bool alternative(int modelId) const { return baseModel != modelId; }
 };
 
+/// Species abbreviation of entry `modelId` (0 to 21), as its label begins: "SS", "LPC".
+std::string_view speciesCode(int modelId);
+
 /// True for the entries whose standing volume `GetVCF` corrects by site index.
 bool HasVolumeCorrection(int modelId);
 

@@ -1,6 +1,7 @@
 #include "estate/rowevaluator.hpp"
 
 #include "engine/catalogue.hpp"
+#include "engine/modeldescription.hpp"
 #include "rotation/standchecks.hpp"
 
 #include <cmath>
@@ -11,10 +12,6 @@ namespace {
 
 std::int64_t whole(double x) {
     return static_cast<std::int64_t>(std::llround(x));
-}
-
-std::string speciesOf(const std::string &label) {
-    return label.substr(0, label.find(' '));
 }
 
 } // namespace
@@ -67,7 +64,7 @@ RowResult RowEvaluator::evaluate(const RowValues &values) {
     m_grow = engine::Grow(&m_report);
     m_grow.GetModel(plan.stand.model);
     result.modelLabel = m_grow.label();
-    result.species = speciesOf(result.modelLabel);
+    result.species = std::string(engine::speciesCode(plan.stand.model));
     if (auto fault = rotation::standFault(plan.stand, m_grow.maxTopHeight())) {
         result.status = RowStatus::kRefused;
         result.message = std::move(*fault);
