@@ -56,8 +56,7 @@ void MainWindowLogic::Form_Load(QSettings &settings, const QRect &screen) {
         }
         ChkGrowFromBD();
         showSiteIndex(stored.age, stored.topHeight);
-        economics::GetPricesFromFiles(m_dataFolder, m_prices.data(), m_log);
-        economics::GetAssortmentPricesFromFile(m_dataFolder, m_prices.data(), m_log);
+        readPriceFiles();
         m_prices.selectPriceSet(economics::kCurrentPrices);
         showSummary(false);
         m_view.setText(MainControl::cmdShowTimberPrice, text::showTimberPrices());
@@ -98,12 +97,16 @@ void MainWindowLogic::Form_Unload(QSettings &settings) {
     economics::WriteAssortmentPricesInFile(m_dataFolder, m_prices.data(), m_log);
 }
 
+void MainWindowLogic::readPriceFiles() {
+    economics::GetPricesFromFiles(m_dataFolder, m_prices.data(), m_log);
+    economics::GetAssortmentPricesFromFile(m_dataFolder, m_prices.data(), m_log);
+}
+
 void MainWindowLogic::reloadDataFiles() {
     shell::guard(m_log, QStringLiteral(" in frmMain.reloadDataFiles()"), [&] {
         const std::int16_t inUse = m_prices.priceSetInUse();
         m_prices.data() = economics::PriceData{};
-        economics::GetPricesFromFiles(m_dataFolder, m_prices.data(), m_log);
-        economics::GetAssortmentPricesFromFile(m_dataFolder, m_prices.data(), m_log);
+        readPriceFiles();
         m_prices.selectPriceSet(inUse);
     });
 }

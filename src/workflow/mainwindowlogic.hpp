@@ -230,6 +230,8 @@ private:
     void copyRowToFields(int row);
     void afterClear(HeaderLayout layout);
     void updateCaption();
+    /// The price lists, categories and assortment prices from the data folder.
+    void readPriceFiles();
     void updateYieldClassLabel();
     void buildGrowthCells(TableRow &row, int rowIndex) const;
     bool continuesFromRow(int row) const;
