@@ -1,5 +1,6 @@
 #include "rotation/rotation.hpp"
 
+#include "engine/vectorstate.hpp"
 #include "rotation/optimiser.hpp"
 #include "rotation/yieldclass.hpp"
 #include "valuation/discounting.hpp"
@@ -202,6 +203,7 @@ std::optional<std::string> rotationProblem(const GrowthPath &path, const Regime 
 std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const Regime &regime,
                                    GrowthFailure &failure, const ThinningLimits *limits,
                                    std::optional<int> finalCut) {
+    engine::clearUpperVectorState();
     const unsigned faultsBefore = grow.faultCount();
     auto engineFailed = [&](std::string text) {
         failure = {false, std::move(text)};
@@ -307,6 +309,7 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
 }
 
 void divideThinnings(GrowthPath &path) {
+    engine::clearUpperVectorState();
     for (Harvest &t : path.thinnings) {
         t.assortments = divideHarvest(t.volume, t.basalArea, t.stocking, path.volumeRatio);
     }
@@ -315,6 +318,7 @@ void divideThinnings(GrowthPath &path) {
 
 RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics,
                             Appraisal appraisal) {
+    engine::clearUpperVectorState();
     RotationValue v;
     v.rotation = rotation;
     std::vector<Harvest> all = harvests(path, rotation, economics, v.finalCut);
@@ -356,6 +360,7 @@ int firstRotation(const GrowthPath &path, const Regime &regime) {
 
 RotationExplorer exploreRotations(const GrowthPath &path, const Regime &regime,
                                   const Economics &economics) {
+    engine::clearUpperVectorState();
     RotationExplorer e;
     double bestMai = -std::numeric_limits<double>::infinity();
     double bestLev = -std::numeric_limits<double>::infinity();
@@ -390,6 +395,7 @@ RotationChoice chooseRotation(const GrowthPath &path, const Regime &regime,
 
 Candidate scoreRotation(const GrowthPath &path, const Regime &regime, int rotation,
                         const Economics &economics, Objective objective) {
+    engine::clearUpperVectorState();
     Candidate c;
     c.rotation = rotation;
     Harvest finalCut;

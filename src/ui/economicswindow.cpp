@@ -3,6 +3,7 @@
 #include "economics/economicsformat.hpp"
 #include "economics/economicsmessages.hpp"
 #include "economics/economicswindowlogic.hpp"
+#include "engine/vectorstate.hpp"
 #include "ui/economicscharts.hpp"
 #include "ui/fieldinput.hpp"
 #include "ui/stringgridmodel.hpp"
@@ -435,7 +436,12 @@ void EconomicsWindow::setProgress(double fraction) {
 }
 
 void EconomicsWindow::runInBackground(std::function<void()> work, std::function<void()> done) {
-    m_worker = QThread::create(std::move(work));
+    // The thread starts with the window thread's vector state, which Qt
+    // leaves dirty (engine/vectorstate.hpp).
+    m_worker = QThread::create([work = std::move(work)] {
+        engine::clearUpperVectorState();
+        work();
+    });
     connect(m_worker, &QThread::finished, this, [this, done = std::move(done)] {
         m_worker->deleteLater();
         m_worker = nullptr;

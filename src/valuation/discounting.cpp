@@ -1,5 +1,7 @@
 #include "valuation/discounting.hpp"
 
+#include "engine/vectorstate.hpp"
+
 #include <cmath>
 
 namespace arbolex::valuation {
@@ -18,6 +20,7 @@ std::optional<double> discountFactor(double ratePercent, int years) {
 }
 
 std::optional<double> discountedCashFlow(double cashFlow, double ratePercent, int years) {
+    engine::clearUpperVectorState();
     const std::optional<double> factor = discountFactor(ratePercent, years);
     if (!factor) {
         return std::nullopt;
@@ -26,6 +29,7 @@ std::optional<double> discountedCashFlow(double cashFlow, double ratePercent, in
 }
 
 std::optional<double> netPresentValue(const std::vector<double> &cashFlows, double ratePercent) {
+    engine::clearUpperVectorState();
     double sum = 0.0;
     for (std::size_t i = 0; i < cashFlows.size(); ++i) {
         const std::optional<double> discounted =

@@ -2,6 +2,8 @@
 
 #include "valuation/discounting.hpp"
 
+#include "engine/vectorstate.hpp"
+
 #include <cmath>
 
 namespace arbolex::valuation {
@@ -28,6 +30,7 @@ constexpr double kIrrTolerancePercent = 1e-10;
 
 std::optional<double> landExpectationValue(const std::vector<double> &cashFlowByAge,
                                            double ratePercent) {
+    engine::clearUpperVectorState();
     if (cashFlowByAge.size() < 2 || !(ratePercent > 0.0)) {
         return std::nullopt;
     }
@@ -62,6 +65,7 @@ std::optional<double> forestValue(const std::vector<double> &cashFlowFromPresent
 }
 
 InternalRate internalRateOfReturn(const std::vector<double> &cashFlowByAge) {
+    engine::clearUpperVectorState();
     bool positive = false;
     bool negative = false;
     for (const double cf : cashFlowByAge) {
