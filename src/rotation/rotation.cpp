@@ -99,7 +99,10 @@ Figures figures(const Flows &f, int presentAge, double ratePercent) {
     out.npv = valuation::netPresentValue(fromPresent, ratePercent);
     out.lev = valuation::landExpectationValue(f.net, ratePercent);
     if (out.lev) {
-        out.forestValue = valuation::forestValue(fromPresent, *out.lev, ratePercent);
+        // The forest value adds the LEV to the same net present value.
+        const int yearsToFinalCut =
+            fromPresent.empty() ? 0 : static_cast<int>(fromPresent.size()) - 1;
+        out.forestValue = valuation::forestValue(out.npv, yearsToFinalCut, *out.lev, ratePercent);
     }
     return out;
 }

@@ -54,14 +54,19 @@ double equivalentAnnualAnnuity(double landExpectationValue, double ratePercent) 
 
 std::optional<double> forestValue(const std::vector<double> &cashFlowFromPresent,
                                   double landExpectationValue, double ratePercent) {
-    const std::optional<double> npv = netPresentValue(cashFlowFromPresent, ratePercent);
     const int yearsToFinalCut =
         cashFlowFromPresent.empty() ? 0 : static_cast<int>(cashFlowFromPresent.size()) - 1;
+    return forestValue(netPresentValue(cashFlowFromPresent, ratePercent), yearsToFinalCut,
+                       landExpectationValue, ratePercent);
+}
+
+std::optional<double> forestValue(std::optional<double> netPresentValue, int yearsToFinalCut,
+                                  double landExpectationValue, double ratePercent) {
     const std::optional<double> factor = discountFactor(ratePercent, yearsToFinalCut);
-    if (!npv || !factor) {
+    if (!netPresentValue || !factor) {
         return std::nullopt;
     }
-    return *npv + landExpectationValue / *factor;
+    return *netPresentValue + landExpectationValue / *factor;
 }
 
 InternalRate internalRateOfReturn(const std::vector<double> &cashFlowByAge) {

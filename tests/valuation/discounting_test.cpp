@@ -6,6 +6,8 @@
 
 #include <cmath>
 #include <limits>
+#include <thread>
+#include <vector>
 
 namespace arbolex::valuation {
 namespace {
@@ -40,6 +42,42 @@ TEST(DiscountingTest, FactorsThatCannotBeComputedAreRefused) {
     EXPECT_FALSE(discountFactor(-100.0, 3).has_value());
     EXPECT_FALSE(discountedCashFlow(1.0, std::numeric_limits<double>::infinity(), 1));
     EXPECT_FALSE(netPresentValue({1.0, 1.0, 1.0}, 1.0e200).has_value());
+}
+
+/// The factor as computed without any table, or std::nullopt where refused.
+std::optional<double> untabled(double ratePercent, int years) {
+    const double f = std::pow(1.0 + ratePercent / 100.0, static_cast<double>(years));
+    return std::isfinite(f) && f > 0.0 ? std::optional<double>(f) : std::nullopt;
+}
+
+/// Every factor of `rates` over ages past either end of a table, asked in an
+/// order that switches the rate often and comes back to earlier ones.
+void expectSameAsUntabled(const std::vector<double> &rates) {
+    for (const int years : {0, 1, 2, 37, 50, 1, 255, 256, 300, -1, -40, 50}) {
+        for (const double r : rates) {
+            SCOPED_TRACE(testing::Message() << r << " % over " << years << " years");
+            EXPECT_EQ(discountFactor(r, years), untabled(r, years));
+        }
+    }
+}
+
+TEST(DiscountingTest, FactorsAreThePowersWhateverWasAskedBefore) {
+    expectSameAsUntabled({3.0, 3.5, 3.0, -2.0, 0.0, -0.0, 1e-9, 250.0, 1.0e9, -100.0, -150.0,
+                          std::numeric_limits<double>::quiet_NaN(), 3.0});
+}
+
+TEST(DiscountingTest, ThreadsAtDifferentRatesGetTheirOwnFactors) {
+    std::vector<std::thread> threads;
+    for (const double r : {2.0, 4.0}) {
+        threads.emplace_back([r] {
+            for (int pass = 0; pass < 200; ++pass) {
+                expectSameAsUntabled({r, r + 0.5});
+            }
+        });
+    }
+    for (std::thread &t : threads) {
+        t.join();
+    }
 }
 
 } // namespace
