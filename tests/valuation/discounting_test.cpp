@@ -6,6 +6,7 @@
 
 #include <cmath>
 #include <limits>
+#include <random>
 #include <thread>
 #include <vector>
 
@@ -77,6 +78,46 @@ TEST(DiscountingTest, ThreadsAtDifferentRatesGetTheirOwnFactors) {
     }
     for (std::thread &t : threads) {
         t.join();
+    }
+}
+
+/// The net present value as its definition reads: every year's cash flow over
+/// std::pow's factor, rounded to cents, summed from the first year.
+std::optional<double> byPowers(const std::vector<double> &cashFlows, double ratePercent) {
+    double sum = 0.0;
+    for (std::size_t i = 0; i < cashFlows.size(); ++i) {
+        const auto factor = untabled(ratePercent, static_cast<int>(i));
+        if (!factor) {
+            return std::nullopt;
+        }
+        sum += roundToCents(cashFlows[i] / *factor);
+    }
+    return sum;
+}
+
+TEST(DiscountingTest, NetPresentValueIsTheSumOfPowersToTheBit) {
+    std::mt19937_64 draw(20260101);
+    std::uniform_real_distribution<double> rate(-20.0, 30.0);
+    std::uniform_real_distribution<double> money(-5000.0, 50000.0);
+    std::uniform_int_distribution<int> years(1, 120);
+    std::uniform_int_distribution<int> cents(-500000, 5000000);
+    for (int c = 0; c < 3000; ++c) {
+        const double r = c % 7 == 0 ? std::nearbyint(rate(draw)) : rate(draw);
+        std::vector<double> flows(static_cast<std::size_t>(years(draw)));
+        for (std::size_t i = 0; i < flows.size(); ++i) {
+            // One flow in three lands on half a cent once discounted: its
+            // cents are decided by the last bits of the factor.
+            const double q = 1.0 + r / 100.0;
+            flows[i] =
+                i % 3 == 1 ? (cents(draw) + 0.5) / 100.0 * std::pow(q, double(i)) : money(draw);
+        }
+        SCOPED_TRACE(testing::Message() << "rate " << r << ", " << flows.size() << " years");
+        EXPECT_EQ(netPresentValue(flows, r), byPowers(flows, r));
+    }
+    for (const double r : {-100.0, -150.0, 1.0e9, 1.0e200, 0.0}) {
+        EXPECT_EQ(netPresentValue({1.0, -2.5, 1e300, 0.125}, r),
+                  byPowers({1.0, -2.5, 1e300, 0.125}, r))
+            << r;
     }
 }
 
