@@ -2,6 +2,8 @@
 // row of a 50-year projection table.
 #include "engine_stands.hpp"
 
+#include "dirtystate.hpp"
+
 #include <benchmark/benchmark.h>
 
 #include <vector>
@@ -27,7 +29,7 @@ void BM_AssortmentReport(benchmark::State &state) {
         benchmark::DoNotOptimize(a);
     }
 }
-BENCHMARK(BM_AssortmentReport)->Unit(benchmark::kMicrosecond);
+ARBOLEX_BENCHMARK(BM_AssortmentReport, ->Unit(benchmark::kMicrosecond));
 
 void BM_AssortmentUserCategories(benchmark::State &state) {
     Grow grow;
@@ -41,7 +43,7 @@ void BM_AssortmentUserCategories(benchmark::State &state) {
         benchmark::DoNotOptimize(a);
     }
 }
-BENCHMARK(BM_AssortmentUserCategories)->Unit(benchmark::kMicrosecond);
+ARBOLEX_BENCHMARK(BM_AssortmentUserCategories, ->Unit(benchmark::kMicrosecond));
 
 void BM_AssortmentTable50Years(benchmark::State &state) {
     Grow grow;
@@ -59,7 +61,7 @@ void BM_AssortmentTable50Years(benchmark::State &state) {
     }
     state.counters["rows"] = static_cast<double>(rows.size());
 }
-BENCHMARK(BM_AssortmentTable50Years)->Unit(benchmark::kMicrosecond);
+ARBOLEX_BENCHMARK(BM_AssortmentTable50Years, ->Unit(benchmark::kMicrosecond));
 
 } // namespace
 } // namespace arbolex::bench

@@ -1,6 +1,8 @@
 // Thinning response: the Newton solve for a prescribed residual volume.
 #include "engine_stands.hpp"
 
+#include "dirtystate.hpp"
+
 #include <benchmark/benchmark.h>
 
 namespace arbolex::bench {
@@ -23,7 +25,7 @@ void BM_NewtonVolumeThinning(benchmark::State &state) {
         benchmark::DoNotOptimize(gr);
     }
 }
-BENCHMARK(BM_NewtonVolumeThinning);
+ARBOLEX_BENCHMARK(BM_NewtonVolumeThinning);
 
 } // namespace
 } // namespace arbolex::bench

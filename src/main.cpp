@@ -40,6 +40,7 @@
 #include <QApplication>
 #include <QCommandLineParser>
 #include <QDir>
+#include <QElapsedTimer>
 #include <QFile>
 #include <QMenu>
 #include <QPushButton>
@@ -48,6 +49,8 @@
 #include <QTabWidget>
 #include <QTimer>
 
+#include <cstdio>
+
 namespace {
 
 using arbolex::thinning::ThinControl;
@@ -55,18 +58,33 @@ using arbolex::thinning::ThinWindowLogic;
 using arbolex::workflow::MainControl;
 using arbolex::workflow::MainWindowLogic;
 
+/// A Sitka spruce stand with model 0 and 2500 stems/ha, of `age`, top height
+/// `height` (m) and basal area `basalArea` (m²/ha), to be grown to `to` by
+/// `by` years, typed as a user would type it.
+struct TypedStand {
+    const char *age;
+    const char *height;
+    const char *basalArea;
+    QString to;
+    const char *by;
+};
+
+void typeStand(MainWindowLogic &logic, const TypedStand &stand) {
+    logic.mnuModel_Click(0);
+    logic.typeText(MainControl::txtFromA, QLatin1String(stand.age));
+    logic.typeText(MainControl::txtFromN, QStringLiteral("2500"));
+    logic.typeText(MainControl::txtFromH, QLatin1String(stand.height));
+    logic.typeText(MainControl::txtFromB, QLatin1String(stand.basalArea));
+    logic.typeText(MainControl::txtFromD, QString());
+    logic.typeText(MainControl::txtToA, stand.to);
+    logic.typeText(MainControl::txtByA, QLatin1String(stand.by));
+}
+
 /// Grows a young Sitka spruce stand with model 0 (age 15, 2500 stems/ha, 7 m,
 /// 20 m²/ha) to `to` by 5 years, as a user would type it: a way to look at a
 /// filled main window without a keyboard.
 void demoGrow(MainWindowLogic &logic, const QString &to = QStringLiteral("50")) {
-    logic.mnuModel_Click(0);
-    logic.typeText(MainControl::txtFromA, QStringLiteral("15"));
-    logic.typeText(MainControl::txtFromN, QStringLiteral("2500"));
-    logic.typeText(MainControl::txtFromH, QStringLiteral("7"));
-    logic.typeText(MainControl::txtFromB, QStringLiteral("20"));
-    logic.typeText(MainControl::txtFromD, QString());
-    logic.typeText(MainControl::txtToA, to);
-    logic.typeText(MainControl::txtByA, QStringLiteral("5"));
+    typeStand(logic, {"15", "7", "20", to, "5"});
     logic.cmdGrow_Click();
 }
 
@@ -104,15 +122,8 @@ bool demoThin(MainWindowLogic &logic, ThinWindowLogic &thin, const QString &stag
 /// Grows the stand of the rotation demonstrations (Sitka spruce, age 15, 2500
 /// stems/ha, 9 m, 22 m²/ha, 10 ha) to `to` by 5 years.
 void growRotationStand(MainWindowLogic &logic, const QString &to) {
-    logic.mnuModel_Click(0);
-    logic.typeText(MainControl::txtFromA, QStringLiteral("15"));
-    logic.typeText(MainControl::txtFromN, QStringLiteral("2500"));
-    logic.typeText(MainControl::txtFromH, QStringLiteral("9"));
-    logic.typeText(MainControl::txtFromB, QStringLiteral("22"));
-    logic.typeText(MainControl::txtFromD, QString());
+    typeStand(logic, {"15", "9", "22", to, "5"});
     logic.typeText(MainControl::txtNetArea, QStringLiteral("10"));
-    logic.typeText(MainControl::txtToA, to);
-    logic.typeText(MainControl::txtByA, QStringLiteral("5"));
     logic.cmdGrow_Click();
 }
 
@@ -326,6 +337,49 @@ bool demoEconomics(MainWindowLogic &logic, ThinWindowLogic &thin,
     return true;
 }
 
+/// Milliseconds since `timer` started, to the tenth.
+double milliseconds(const QElapsedTimer &timer) {
+    return static_cast<double>(timer.nsecsElapsed()) / 1e6;
+}
+
+/// The timing runs (--time-windows STAGE): what a user waits for once the
+/// main window is on screen, from the command to its figures drawn, printed in
+/// milliseconds on stdout; then the program ends. `sinceStart` runs from the
+/// start of main, before the application object.
+///   grow       the grow command 10 -> 60 by 1 year;
+///   economics  the economics window over a thinned rotation with its final
+///              cut, to its first figures.
+/// False for an unknown stage.
+bool timeWindows(const QElapsedTimer &sinceStart, MainWindowLogic &logic, ThinWindowLogic &thin,
+                 arbolex::economics::NpvWindowLogic &npv,
+                 arbolex::economics::EconomicsWindowLogic &economics, const QString &stage) {
+    using arbolex::economics::EconomicsControl;
+    if (stage != QLatin1String("grow") && stage != QLatin1String("economics")) {
+        return false;
+    }
+    std::printf("main window shown %.1f ms after main began\n", milliseconds(sinceStart));
+    QElapsedTimer timer;
+    if (stage == QLatin1String("grow")) {
+        typeStand(logic, {"10", "5", "20", QStringLiteral("60"), "1"});
+        timer.start();
+        logic.cmdGrow_Click();
+        QCoreApplication::processEvents();
+        std::printf("grow 10 to 60 by 1 year %.1f ms\n", milliseconds(timer));
+    } else {
+        demoRotation(logic, thin, npv, QStringLiteral("finalcut"));
+        economics.typeText(EconomicsControl::txtEstablishmentCost, QStringLiteral("1800"));
+        economics.typeText(EconomicsControl::txtAnnualCost, QStringLiteral("15"));
+        logic.cashFlow().setInterestRate(3.0);
+        QCoreApplication::processEvents();
+        timer.start();
+        economics.cmdEconomics_Click();
+        QCoreApplication::processEvents();
+        std::printf("economics window, first figures %.1f ms\n", milliseconds(timer));
+    }
+    std::fflush(stdout);
+    return true;
+}
+
 /// The estate demonstrations, on the example estate (examples/estate.csv of
 /// the data folder or of the current folder's data):
 ///   table   the sub-compartments;
@@ -400,6 +454,8 @@ struct Options {
         parser.addOption(demoEstate);
         quitWhenShown.setFlags(QCommandLineOption::HiddenFromHelp);
         parser.addOption(quitWhenShown);
+        timeWindows.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.addOption(timeWindows);
     }
 
     QCommandLineOption dataDir{QStringLiteral("data-dir"),
@@ -434,6 +490,10 @@ struct Options {
                                   QStringLiteral("STAGE")};
     /// Ends the program once the main window is on screen: start-up is timed with it.
     QCommandLineOption quitWhenShown{QStringLiteral("quit-when-shown")};
+    /// Times the grow command or the economics window once the main window is
+    /// shown, prints the time and ends the program.
+    QCommandLineOption timeWindows{QStringLiteral("time-windows"), QString(),
+                                   QStringLiteral("STAGE")};
 };
 
 /// True when the command line asks only for the usage or the version, which
@@ -452,6 +512,8 @@ bool asksForTextOnly(int argc, char *argv[]) {
 } // namespace
 
 int main(int argc, char *argv[]) {
+    QElapsedTimer sinceStart;
+    sinceStart.start();
     if (asksForTextOnly(argc, argv)) {
         QCoreApplication core(argc, argv);
         arbolex::shell::nameProgram();
@@ -625,7 +687,18 @@ int main(int argc, char *argv[]) {
     }
     if (parser.isSet(options.noIntro)) {
         window.show();
-        if (parser.isSet(options.quitWhenShown)) {
+        if (parser.isSet(options.timeWindows)) {
+            interactive.queueAnswer(false); // the final cut's offer of the net present value
+            const QString stage = parser.value(options.timeWindows);
+            QTimer::singleShot(0, &window, [&, stage] {
+                if (!timeWindows(sinceStart, logic, thinLogic, npvLogic, economicsLogic, stage)) {
+                    qWarning("unknown timing: %s", qPrintable(stage));
+                }
+                // The work grown for the timing is not the user's: no question.
+                window.setCloseCheck([] { return true; });
+                QCoreApplication::quit();
+            });
+        } else if (parser.isSet(options.quitWhenShown)) {
             QTimer::singleShot(0, &app, &QCoreApplication::quit);
         }
     } else {
