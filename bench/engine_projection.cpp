@@ -38,6 +38,7 @@ void projectRotations(benchmark::State &state) {
     std::vector<StandState> states;
     states.reserve(kRotationYears + 1);
     for (auto _ : state) {
+        dirtyIfAsked();
         states.clear();
         grow.PROJ(s.age, s.basalArea, s.stocking, s.height, s.age + kRotationYears, 1.0f, states);
         benchmark::DoNotOptimize(states.data());
@@ -115,6 +116,7 @@ RotationCalls rotationCalls() {
 void BM_ProjectionStepBaseline(benchmark::State &state) {
     RotationCalls c = rotationCalls();
     for (auto _ : state) {
+        dirtyIfAsked();
         // Make the compiler read the arguments afresh on every pass.
         benchmark::DoNotOptimize(c.base.data());
         benchmark::DoNotOptimize(c.exponent.data());
@@ -149,6 +151,7 @@ void BM_Estate100kStands50Years(benchmark::State &state) {
     std::size_t projected = 0;
     std::size_t failed = 0;
     for (auto _ : state) {
+        dirtyIfAsked();
         projected = 0;
         failed = 0;
         float checksum = 0.0f;

@@ -20,6 +20,7 @@ void BM_NewtonVolumeThinning(benchmark::State &state) {
     float nr = 0.0f;
     float gr = 0.0f;
     for (auto _ : state) {
+        dirtyIfAsked();
         grow.NEWTON(s.stocking, s.basalArea, s.height, residualVolume, nr, gr);
         benchmark::DoNotOptimize(nr);
         benchmark::DoNotOptimize(gr);

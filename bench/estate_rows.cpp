@@ -55,6 +55,7 @@ void BM_EstateRowGrown(benchmark::State &state) {
     estate::RowEvaluator evaluator(l, d);
     std::size_t i = 0;
     for (auto _ : state) {
+        dirtyIfAsked();
         benchmark::DoNotOptimize(evaluator.evaluate(input[i]));
         i = (i + 1) % input.size();
     }
@@ -71,6 +72,7 @@ void BM_EstateRow(benchmark::State &state) {
     std::vector<std::string> values;
     std::size_t i = 0;
     for (auto _ : state) {
+        dirtyIfAsked();
         const estate::RowResult result = evaluator.evaluate(input[i]);
         estate::resultValues(l, static_cast<long long>(i) + 2, input[i], result, values);
         benchmark::DoNotOptimize(estate::csvLine(values));
@@ -92,6 +94,7 @@ void BM_EstateRowGrowth(benchmark::State &state) {
     engine::Grow grow;
     std::size_t i = 0;
     for (auto _ : state) {
+        dirtyIfAsked();
         const estate::RowPlan &plan = plans[i];
         rotation::GrowthFailure failure;
         benchmark::DoNotOptimize(

@@ -32,6 +32,7 @@ void optimiseOneStand(benchmark::State &state, const rotation::Economics &e) {
     const rotation::OptimiserSettings settings;
     int grown = 0;
     for (auto _ : state) {
+        dirtyIfAsked();
         rotation::GrowthFailure failure;
         const auto result = rotation::optimise(grow, kStand, e, settings, failure);
         benchmark::DoNotOptimize(result);
@@ -64,6 +65,7 @@ void BM_MonteCarlo10000(benchmark::State &state) {
     settings.draws = 10000;
     settings.costSpread = 0.1;
     for (auto _ : state) {
+        dirtyIfAsked();
         benchmark::DoNotOptimize(rotation::monteCarlo(path, 48, e, settings));
     }
 }
