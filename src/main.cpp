@@ -614,7 +614,7 @@ int main(int argc, char *argv[]) {
     estateWindow.attach(estateLogic);
     estateWindow.addOpenEntry(*window.fileMenu(), documentMenu.recentMenu()->menuAction());
     if (const QStringList files = parser.positionalArguments(); !files.isEmpty()) {
-        const QString file = files.first();
+        const QString &file = files.first();
         QTimer::singleShot(0, &window, [&documents, file] { documents.open(file); });
     }
 

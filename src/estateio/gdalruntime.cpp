@@ -61,13 +61,16 @@ template <typename F> F gdalFunction(const char *name) {
 } // namespace arbolex::estateio
 
 /// Defines GDAL's function `name` (returning `Result`, taking `Parameters`) as
-/// a call of the loaded library's, passing `Arguments`.
+/// a call of the loaded library's, passing `Arguments`. `Parameters` is a
+/// parameter list, which no parentheses may enclose.
+// NOLINTBEGIN(bugprone-macro-parentheses)
 #define ARBOLEX_GDAL_FUNCTION(Result, name, Parameters, Arguments)                                 \
     extern "C" Result name Parameters {                                                            \
         using Function = Result(*) Parameters;                                                     \
         static const Function f = arbolex::estateio::gdalFunction<Function>(#name);                \
         return f Arguments;                                                                        \
     }
+// NOLINTEND(bugprone-macro-parentheses)
 
 ARBOLEX_GDAL_FUNCTION(void, CPLErrorReset, (), ())
 ARBOLEX_GDAL_FUNCTION(const char *, CPLGetBasename, (const char *path), (path))

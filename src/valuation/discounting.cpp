@@ -2,9 +2,10 @@
 
 #include "engine/vectorstate.hpp"
 
+#include <bit>
 #include <bitset>
 #include <cmath>
-#include <cstring>
+#include <cstdint>
 #include <limits>
 
 namespace arbolex::valuation {
@@ -44,7 +45,7 @@ public:
 private:
     /// The same rate, to the bit (−0 is not 0 for a table).
     bool sameRate(double ratePercent) const {
-        return std::memcmp(&ratePercent, &m_rate, sizeof ratePercent) == 0;
+        return std::bit_cast<std::uint64_t>(ratePercent) == std::bit_cast<std::uint64_t>(m_rate);
     }
 
     double m_rate = std::numeric_limits<double>::quiet_NaN();
