@@ -12,7 +12,7 @@ namespace {
 estate::ResultFile resultFile(const EstateJob &job, const char *table,
                               std::vector<estate::ResultColumn> columns) {
     const std::string members = job.format == estate::TableFormat::kJson && job.jsonMembers
-                                    ? job.jsonMembers(table, columns)
+                                    ? job.jsonMembers(columns)
                                     : std::string();
     return {job.outFolder + "/" + resultFileName(table, job.format), job.format, std::move(columns),
             members};

@@ -34,10 +34,9 @@ struct EstateJob {
     estate::RunSettings settings;
     /// Format of the result tables.
     estate::TableFormat format = estate::TableFormat::kCsv;
-    /// For JSON, the members that open the document of the table `table`
-    /// with `columns` (its run record and units), rendered by the caller.
-    std::function<std::string(const char *table, const std::vector<estate::ResultColumn> &columns)>
-        jsonMembers;
+    /// For JSON, the members that open the document of a table with
+    /// `columns` (its run record and units), rendered by the caller.
+    std::function<std::string(const std::vector<estate::ResultColumn> &columns)> jsonMembers;
 };
 
 /// What a run tells its caller besides the result files.
