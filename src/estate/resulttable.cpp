@@ -117,8 +117,9 @@ void resultValues(const Layout &layout, long long line, const RowValues &input,
     figureValues(row, values);
 }
 
-std::vector<std::string> errorColumns() {
-    return {"line", "id", "message"};
+std::vector<ResultColumn> errorColumns() {
+    return {
+        {"line", ColumnType::kInteger}, {"id", ColumnType::kText}, {"message", ColumnType::kText}};
 }
 
 } // namespace arbolex::estate
