@@ -13,6 +13,8 @@
 #include "estateio/gdallayer.hpp"
 
 #include <cpl_conv.h>
+#include <cpl_csv.h>
+#include <cpl_string.h>
 #include <cpl_error.h>
 #include <cpl_vsi.h>
 #include <gdal.h>
@@ -72,6 +74,8 @@ template <typename F> F gdalFunction(const char *name) {
     }
 // NOLINTEND(bugprone-macro-parentheses)
 
+ARBOLEX_GDAL_FUNCTION(char, CSVDetectSeperator, (const char *line), (line))
+ARBOLEX_GDAL_FUNCTION(void, CSLDestroy, (char **list), (list))
 ARBOLEX_GDAL_FUNCTION(void, CPLErrorReset, (), ())
 ARBOLEX_GDAL_FUNCTION(const char *, CPLGetBasename, (const char *path), (path))
 ARBOLEX_GDAL_FUNCTION(const char *, CPLGetLastErrorMsg, (), ())
@@ -100,6 +104,7 @@ ARBOLEX_GDAL_FUNCTION(OGRErr, GDALDatasetStartTransaction, (GDALDatasetH dataset
 ARBOLEX_GDAL_FUNCTION(GDALDriverH, GDALGetDatasetDriver, (GDALDatasetH dataset), (dataset))
 ARBOLEX_GDAL_FUNCTION(GDALDriverH, GDALGetDriverByName, (const char *name), (name))
 ARBOLEX_GDAL_FUNCTION(const char *, GDALGetDriverShortName, (GDALDriverH driver), (driver))
+ARBOLEX_GDAL_FUNCTION(char **, GDALGetFileList, (GDALDatasetH dataset), (dataset))
 ARBOLEX_GDAL_FUNCTION(GDALDatasetH, GDALOpenEx,
                       (const char *path, unsigned int flags, const char *const *drivers,
                        const char *const *options, const char *const *siblings),
@@ -136,3 +141,6 @@ ARBOLEX_GDAL_FUNCTION(OGRFeatureDefnH, OGR_L_GetLayerDefn, (OGRLayerH layer), (l
 ARBOLEX_GDAL_FUNCTION(OGRFeatureH, OGR_L_GetNextFeature, (OGRLayerH layer), (layer))
 ARBOLEX_GDAL_FUNCTION(OGRSpatialReferenceH, OGR_L_GetSpatialRef, (OGRLayerH layer), (layer))
 ARBOLEX_GDAL_FUNCTION(int, VSIUnlink, (const char *path), (path))
+ARBOLEX_GDAL_FUNCTION(VSILFILE *, VSIFOpenL, (const char *path, const char *mode), (path, mode))
+ARBOLEX_GDAL_FUNCTION(int, VSIFCloseL, (VSILFILE * file), (file))
+ARBOLEX_GDAL_FUNCTION(const char *, CPLReadLineL, (VSILFILE * file), (file))
