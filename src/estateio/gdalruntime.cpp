@@ -14,8 +14,8 @@
 
 #include <cpl_conv.h>
 #include <cpl_csv.h>
-#include <cpl_string.h>
 #include <cpl_error.h>
+#include <cpl_string.h>
 #include <cpl_vsi.h>
 #include <gdal.h>
 #include <ogr_api.h>
