@@ -1,7 +1,7 @@
 #pragma once
 
 #include "economics/pricedata.hpp"
-#include "shell/runtimeerror.hpp"
+#include "rotation/priceclasses.hpp"
 
 #include <QLatin1String>
 #include <QLocale>
@@ -28,23 +28,9 @@ inline constexpr std::array<QLatin1String, kPriceClassCount> kTimberCategoryCapt
     return captions;
 }();
 
-/// Outcome of walking the class captions for one mean tree volume.
-struct PriceClassWalk {
-    /// Class 0 to 12 that holds the volume; 0 after a failure.
-    int priceClass = 0;
-    /// 13 "Type mismatch" when a caption bound does not convert under the locale.
-    shell::RuntimeError error;
-    /// Statement number of the failing conversion.
-    int line = 0;
-};
-
-/// Finds the class of `meanTreeVolume` (m³ per tree) from the captions, in
-/// ascending order: class 0 when its upper bound is ≥ the volume (so zero and
-/// negative volumes too), class 1 to 11 when lower bound ≤ volume ≤ upper
-/// bound, class 12 for everything else, including volumes that fall in the
-/// 0.001 gaps between two classes (0.0745 is class 12, the top price). The
-/// bounds are read from the captions each time, converted with `locale`.
-PriceClassWalk walkPriceClasses(double meanTreeVolume, const QLocale &locale);
+/// The price-class lookup of the windows: rotation::walkPriceClasses with the
+/// bounds converted under `locale`, as the user's own number conversion does.
+rotation::PriceClassWalk walkPriceClasses(double meanTreeVolume, const QLocale &locale);
 
 /// Standing price, euro per m³, of a mean tree volume (m³ per tree), always
 /// from the current prices and with its sign, whichever list is in use. When a

@@ -1,5 +1,6 @@
 #include "rotation/rotation.hpp"
 
+#include "format/displayformat.hpp"
 #include "rotation/optimiser.hpp"
 #include "rotation/yieldclass.hpp"
 #include "valuation/discounting.hpp"
@@ -40,12 +41,6 @@ std::optional<int> lastThinningAge(const Regime &regime, int ageLimit) {
 double meanTree(float volume, float stocking) {
     const double trees = std::nearbyint(double{stocking});
     return trees > 0.0 ? double{volume} / trees : 0.0;
-}
-
-/// The final cut's mean tree as the projection table shows it, to the litre:
-/// its price class is read from that figure.
-double shownMeanTree(float volume, float stocking) {
-    return std::round(meanTree(volume, stocking) * 1000.0) / 1000.0;
 }
 
 /// Stand volume removed by the thinnings before `age`, m³/ha.
@@ -128,7 +123,7 @@ std::vector<Harvest> harvests(const GrowthPath &path, int rotation, const Econom
     finalCut.volume = s.volume;
     finalCut.stocking = s.stocking;
     finalCut.basalArea = s.basalArea;
-    finalCut.meanTreeVolume = shownMeanTree(s.volume, s.stocking);
+    finalCut.meanTreeVolume = felledMeanTree(s.volume, s.stocking);
     finalCut.priceClass = priceClassOf(finalCut.meanTreeVolume);
     price(finalCut, path, economics, false);
     all.push_back(finalCut);
@@ -136,6 +131,14 @@ std::vector<Harvest> harvests(const GrowthPath &path, int rotation, const Econom
 }
 
 } // namespace
+
+double removedMeanTree(float removedVolume, float removedStocking) {
+    return removedVolume > 0.0f ? meanTree(removedVolume, std::fabs(removedStocking)) : 0.0;
+}
+
+double felledMeanTree(float volume, float stocking) {
+    return volume > 0.0f ? format::shownValue(meanTree(volume, stocking), kMeanTreeCell) : 0.0;
+}
 
 double harvestRevenue(const Harvest &harvest, const Economics &economics, double volumeFactor) {
     if (economics.valuation == Valuation::kAssortments) {
@@ -296,7 +299,7 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
         t.volume = current.volume - residualVolume;
         t.stocking = current.stocking - residualStocking;
         t.basalArea = current.basalArea - residualBasalArea;
-        t.meanTreeVolume = meanTree(t.volume, t.stocking);
+        t.meanTreeVolume = removedMeanTree(t.volume, t.stocking);
         t.priceClass = priceClassOf(t.meanTreeVolume);
         path.thinnings.push_back(t);
         current = {current.age, residualBasalArea, residualStocking, current.topHeight,

@@ -14,6 +14,7 @@
 #include <cstdint>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace arbolex::rotation {
@@ -94,6 +95,18 @@ struct Harvest {
     /// the sum of the classes' volumes × their prices.
     double revenue = 0.0;
 };
+
+/// Pattern of a mean tree volume in the projection table, m³.
+inline constexpr std::string_view kMeanTreeCell = "#0.000";
+
+/// Mean tree of a thinning's removal, m³: the volume removed over the whole
+/// number of stems removed; 0 without stems or without volume.
+double removedMeanTree(float removedVolume, float removedStocking);
+
+/// Mean tree of a felled crop as the table shows it (its volume over its whole
+/// number of stems, in kMeanTreeCell), read back: the final cut's price class
+/// is read from that figure. 0 without stems or without volume.
+double felledMeanTree(float volume, float stocking);
 
 /// Revenue of `harvest`, euro/ha, valued as `economics` says, with its volume
 /// and mean tree times `volumeFactor` (at the same stems, so the mean tree may

@@ -3,6 +3,7 @@
 #include "assortments/assortwindowlogic.hpp"
 #include "economics/pricelookup.hpp"
 #include "economics/prices.hpp"
+#include "rotation/rotation.hpp"
 #include "shell/apperror.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/interactive.hpp"
@@ -128,19 +129,17 @@ void ThinWindowLogic::WriteThinLine(const QString &label, int row) {
         // The removal and its value at the price of its mean tree.
         const float removedTrees = std::fabs(rec.removedStocking);
         const float removedBasalArea = std::fabs(rec.removedBasalArea);
-        const double roundedTrees = std::nearbyint(double{removedTrees});
         cells[workflow::kColThinStocking] = formatNumber(removedTrees, u"###0");
         float b = removedBasalArea;
         float n = removedTrees;
         cells[workflow::kColThinDbh] =
             formatNumber(workflow::truncateToTenth(workflow::dbhFromBasalArea(b, n)), u"##0.0");
         cells[workflow::kColThinBasalArea] = formatNumber(removedBasalArea, u"##0.0");
-        double meanTree = 0.0;
+        const double meanTree = rotation::removedMeanTree(rec.removedVolume, rec.removedStocking);
         if (rec.removedVolume <= 0.0f) {
             cells[workflow::kColThinVolumePerTree] = workflow::text::outOfRange();
             cells[workflow::kColThinVolumePerHa] = workflow::text::outOfRange();
         } else {
-            meanTree = roundedTrees > 0.0 ? rec.removedVolume / roundedTrees : 0.0;
             cells[workflow::kColThinVolumePerTree] = formatNumber(meanTree, u"#0.000");
             cells[workflow::kColThinVolumePerHa] = formatNumber(rec.removedVolume, u"###0");
         }

@@ -221,7 +221,7 @@ void ThinWindowLogic::cmdThin_Click() {
             return;
         }
         engine::Grow &grow = m_main.grow();
-        if (method != kBasalAreaAndStocking && grow.T(1) == 0.0) {
+        if (method != kBasalAreaAndStocking && method != kVolume && grow.T(1) == 0.0) {
             // Without a thinning response basal area and stocking are not
             // tied: both must be given.
             message(workflow::text::titleOstran(), text::noThinningResponse());
@@ -255,12 +255,22 @@ void ThinWindowLogic::cmdThin_Click() {
             postB = static_cast<float>(grow.BRES(h, preN, preB, postN));
             postV = grow.GetV7(postB, postN, h);
             break;
-        default:
-            postV = postValue(ThinControl::txtRemV, ThinControl::txtPostV, preV);
-            if (!grow.NEWTON(preN, preB, h, postV, postN, postB)) {
+        default: {
+            // The volume method every rotation thins by.
+            const engine::VolumeThinning t = grow.thinToVolume(
+                preN, preB, h, postValue(ThinControl::txtRemV, ThinControl::txtPostV, preV));
+            if (t.outcome == engine::VolumeThinningOutcome::kNoThinningResponse) {
+                message(workflow::text::titleOstran(), text::noThinningResponse());
                 return;
             }
+            if (t.outcome == engine::VolumeThinningOutcome::kSolverFailed) {
+                return;
+            }
+            postB = t.basalArea;
+            postN = t.stocking;
+            postV = t.volume;
             break;
+        }
         }
         if (grow.faultCount() != faultsBefore) {
             return;

@@ -3,6 +3,7 @@
 #include "economics/npvwindowlogic.hpp"
 #include "economics/pricelookup.hpp"
 #include "economics/prices.hpp"
+#include "rotation/rotation.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
@@ -94,8 +95,10 @@ void MainWindowLogic::cmdFinalCut_Click() {
             }
             cells[c + 6] = cells[c];
         }
+        // The trees and the mean tree as the row shows them (format, then read).
         const double trees = std::nearbyint(shell::val(cells[kColStocking]));
-        const double volumePerTree = shell::val(cells[kColVolumePerTree]);
+        const double volumePerTree =
+            rotation::felledMeanTree(row.record.volume, row.record.stocking);
         const auto index =
             static_cast<std::size_t>(economics::priceClassOf(volumePerTree, m_interactive));
         const double price = m_prices.pricesInUse().at(index);

@@ -48,11 +48,12 @@ void MainWindowLogic::leaveField(MainControl control) {
 }
 
 void MainWindowLogic::showSiteIndex(float age, float topHeight) {
-    if (m_grow.SiteIndex(age, topHeight)) {
-        m_view.setText(MainControl::lblSI, formatNumber(m_grow.siteIndex(), u"#.0"));
-    } else {
-        m_view.setText(MainControl::lblSI, QString());
-    }
+    showSiteIndex(m_grow.SiteIndex(age, topHeight));
+}
+
+void MainWindowLogic::showSiteIndex(bool known) {
+    m_view.setText(MainControl::lblSI,
+                   known ? formatNumber(m_grow.siteIndex(), u"#.0") : QString());
 }
 
 void MainWindowLogic::txtFromA_LostFocus() {
@@ -128,36 +129,27 @@ int MainWindowLogic::maxTargetAge() const {
 }
 
 bool MainWindowLogic::ChkGrowFromBnds() {
-    const QString title = text::titleArbolex();
-    const int style = shell::kExclamationOkCancel;
-    const float hMax = maxTopHeight();
-    const int maxTarget = maxTargetAge();
-
-    const float age = valF(field(MainControl::txtFromA));
-    if (age < rotation::kMinAge || age > rotation::kMaxAge) {
-        return refuse(title, text::rangeAge(), style, MainControl::txtFromA);
-    }
-    const float stocking = valF(field(MainControl::txtFromN));
-    if (stocking < rotation::kMinStocking || stocking > rotation::kMaxStocking) {
-        return refuse(title, text::rangeStocking(), style, MainControl::txtFromN);
-    }
-    const float height = valF(field(MainControl::txtFromH));
-    if (height < rotation::kMinHeight || height > hMax) {
-        return refuse(title,
-                      text::rangeHeightLead() + formatNumber(hMax, u"##0.00") + QLatin1Char(']'),
-                      style, MainControl::txtFromH);
+    // The ranges, their order and their messages are the grow command's own,
+    // shared with every rotation grown without the window.
+    const auto refused = [&](const rotation::GrowFromFault &fault) {
+        static constexpr MainControl kFocus[] = {MainControl::txtFromA, MainControl::txtFromN,
+                                                 MainControl::txtFromH, MainControl::txtFromB,
+                                                 MainControl::txtToA};
+        return refuse(text::titleArbolex(), text::stand(fault.text), shell::kExclamationOkCancel,
+                      kFocus[static_cast<int>(fault.field)]);
+    };
+    if (const auto fault = rotation::standRangeFault(
+            valF(field(MainControl::txtFromA)), valF(field(MainControl::txtFromN)),
+            valF(field(MainControl::txtFromH)), maxTopHeight())) {
+        return refused(*fault);
     }
     if (!ChkGrowFromBD()) {
-        return refuse(title, text::incompatibleBasalAreaDbh(), style, MainControl::txtFromD);
+        return refuse(text::titleArbolex(), text::incompatibleBasalAreaDbh(),
+                      shell::kExclamationOkCancel, MainControl::txtFromD);
     }
-    const float basalArea = valF(field(MainControl::txtFromB));
-    if (basalArea < rotation::kMinBasalArea || basalArea > rotation::kMaxBasalArea) {
-        return refuse(title, text::rangeBasalArea(), style, MainControl::txtFromB);
-    }
-    const float target = valF(field(MainControl::txtToA));
-    if (target < 10.0f || target > static_cast<float>(maxTarget)) {
-        return refuse(title, text::rangeToAgeLead() + QString::number(maxTarget) + QLatin1Char(']'),
-                      style, MainControl::txtToA);
+    if (const auto fault = rotation::basalAreaAndTargetFault(
+            valF(field(MainControl::txtFromB)), valF(field(MainControl::txtToA)), maxTargetAge())) {
+        return refused(*fault);
     }
     return true;
 }

@@ -65,7 +65,7 @@ inline QString rangeBasalArea() {
     return stand(rotation::standtext::kRangeBasalArea);
 }
 inline QString rangeToAgeLead() {
-    return QStringLiteral("FAULT - Grow To AGE not in acceptable range [10,");
+    return stand(rotation::standtext::kRangeToAgeLead);
 }
 inline QString maximumHeight() {
     return stand(rotation::standtext::kMaximumHeight);

@@ -2,6 +2,7 @@
 #include "workflow/mainwindowlogic.hpp"
 
 #include "economics/npvwindowlogic.hpp"
+#include "rotation/growcommand.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
@@ -123,15 +124,13 @@ void MainWindowLogic::cmdGrow_Click() {
             g.stocking = rec.stocking;
             g.basalArea = rec.basalArea;
         }
-        showSiteIndex(g.age, g.topHeight);
-        m_grow.TM(m_grow.siteIndex());
-        float siteIndex = m_grow.siteIndex();
-        m_grow.STATEYR(g.age, g.basalArea, g.stocking, g.topHeight, g.targetAge, siteIndex);
-        SetGrowFrom(g.age, g.basalArea, g.stocking, g.topHeight, g.targetAge, g.step);
-
-        m_states.clear();
-        const bool projected =
-            m_grow.PROJ(g.age, g.basalArea, g.stocking, g.topHeight, g.targetAge, g.step, m_states);
+        rotation::Growth growth = rotation::growStand(m_grow, g.age, g.basalArea, g.stocking,
+                                                      g.topHeight, g.targetAge, g.step);
+        showSiteIndex(growth.siteIndexKnown);
+        SetGrowFrom(growth.age, growth.basalArea, growth.stocking, growth.topHeight,
+                    growth.targetAge, g.step);
+        m_states = std::move(growth.states);
+        const bool projected = growth.projected;
         // A projection that continues from the table's last row does not
         // repeat that row.
         m_firstNew = 0;

@@ -225,6 +225,8 @@ private:
     /// Shows a range fault, moves the focus to `control` and returns false.
     bool refuse(const QString &title, const QString &text, int style, MainControl control);
     void showSiteIndex(float age, float topHeight);
+    /// Shows the engine's site index in `lblSI`, or nothing when it is not `known`.
+    void showSiteIndex(bool known);
     bool changeCheck() const;
     void restoreFromRow();
     void copyRowToFields(int row);
