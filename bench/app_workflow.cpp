@@ -2,9 +2,9 @@
 // preview, a whole thinning loop; and the headless runner as a whole process.
 #include "economics/inpvview.hpp"
 #include "economics/npvwindowlogic.hpp"
-#include "economics/pricedata.hpp"
-#include "economics/prices.hpp"
 #include "engine/grow.hpp"
+#include "prices/pricedata.hpp"
+#include "prices/prices.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/iclipboard.hpp"
@@ -37,7 +37,7 @@ struct Windows {
     SilentInteractive interactive;
     arbolex::shell::EngineReport report{interactive, log};
     arbolex::engine::Grow grow{&report};
-    arbolex::economics::Prices prices;
+    arbolex::prices::Prices prices;
     arbolex::workflow::HeadlessMainView view;
     arbolex::workflow::MainWindowLogic main{grow, prices, log, dir.path(), view, interactive};
     arbolex::thinning::HeadlessThinView thinView;
@@ -183,9 +183,9 @@ void BM_FinalCutAndCashFlow(benchmark::State &state) {
     for (auto _ : state) {
         state.PauseTiming();
         auto w = std::make_unique<Windows>();
-        arbolex::economics::GetPricesFromFiles(QStringLiteral(ARBOLEX_BIN_DIR), w->prices.data(),
-                                               w->log);
-        w->prices.selectPriceSet(arbolex::economics::kCurrentPrices);
+        arbolex::prices::GetPricesFromFiles(QStringLiteral(ARBOLEX_BIN_DIR), w->prices.data(),
+                                            w->log);
+        w->prices.selectPriceSet(arbolex::prices::kCurrentPrices);
         w->typeStand("10", "60", "1");
         w->main.typeText(MainControl::txtFromH, QStringLiteral("5"));
         w->main.cmdGrow_Click();

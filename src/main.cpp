@@ -7,10 +7,10 @@
 #include "economics/assortpriceswindowlogic.hpp"
 #include "economics/economicswindowlogic.hpp"
 #include "economics/npvwindowlogic.hpp"
-#include "economics/prices.hpp"
 #include "economics/timberpriceswindowlogic.hpp"
 #include "engine/grow.hpp"
 #include "estatewindow/estatewindowlogic.hpp"
+#include "prices/prices.hpp"
 #include "shell/datafolder.hpp"
 #include "shell/datahistory.hpp"
 #include "shell/enginereport.hpp"
@@ -473,7 +473,7 @@ int main(int argc, char *argv[]) {
     arbolex::ui::QtInteractive interactive;
     arbolex::shell::EngineReport report(interactive, log);
     arbolex::engine::Grow grow(&report);
-    arbolex::economics::Prices prices;
+    arbolex::prices::Prices prices;
     QSettings settings;
 
     arbolex::ui::MainWindow window;

@@ -1,8 +1,8 @@
 #include "assortments/assortwindowlogic.hpp"
 
 #include "assortments/assortmessages.hpp"
-#include "economics/prices.hpp"
 #include "engine/grow.hpp"
+#include "prices/prices.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
@@ -61,7 +61,7 @@ bool isRackThinning(float preBasalArea, float preStocking, float postBasalArea,
     return std::fabs(rB - rN) < 0.001f;
 }
 
-QString bounds(const economics::UserCategory &c) {
+QString bounds(const prices::UserCategory &c) {
     const QString small = shell::singleText(c.smallEnd);
     return c.bigEnd == 0.0f ? small + text::openEnded()
                             : small + QStringLiteral(" - ") + shell::singleText(c.bigEnd);
@@ -168,7 +168,7 @@ ReportStand AssortWindowLogic::standOf(int kind, const thinning::ThinningWork &w
 
 bool AssortWindowLogic::categoriesInUse(std::vector<engine::AssortmentCategory> &bounds,
                                         QStringList &names) {
-    for (const economics::UserCategory &c : m_main.prices().data().categories) {
+    for (const prices::UserCategory &c : m_main.prices().data().categories) {
         if (c.inUse) {
             bounds.push_back({c.smallEnd, c.bigEnd});
             names << c.name;
@@ -269,7 +269,7 @@ bool AssortWindowLogic::frmAssortLoadMod(float preBasalArea, float preStocking, 
             }
         }
         QStringList names;
-        for (const economics::UserCategory &c : m_main.prices().data().categories) {
+        for (const prices::UserCategory &c : m_main.prices().data().categories) {
             if (!c.inUse) {
                 continue;
             }

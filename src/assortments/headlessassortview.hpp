@@ -1,7 +1,7 @@
 #pragma once
 
 #include "assortments/iassortview.hpp"
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 
 #include <array>
 #include <optional>

@@ -13,9 +13,9 @@
 #include "economics/headlesstimberpricesview.hpp"
 #include "economics/inpvview.hpp"
 #include "economics/npvwindowlogic.hpp"
-#include "economics/prices.hpp"
 #include "economics/timberpriceswindowlogic.hpp"
 #include "engine/grow.hpp"
+#include "prices/prices.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/iclipboard.hpp"
@@ -86,7 +86,7 @@ private:
     PrintingInteractive m_interactive;
     shell::EngineReport m_report;
     engine::Grow m_grow;
-    economics::Prices m_prices;
+    prices::Prices m_prices;
     workflow::HeadlessMainView m_mainView;
     workflow::MainWindowLogic m_main;
     thinning::HeadlessThinView m_thinView;

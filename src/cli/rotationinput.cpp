@@ -1,8 +1,8 @@
 #include "cli/rotationinput.hpp"
 
 #include "cli/command.hpp"
-#include "economics/assortmentpricefile.hpp"
-#include "economics/prices.hpp"
+#include "prices/assortmentpricefile.hpp"
+#include "prices/prices.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/settings.hpp"
 #include "valuation/discounting.hpp"
@@ -21,13 +21,13 @@ constexpr int kLongestAge = 200;
 
 struct PriceChoice {
     const char *word;
-    economics::PriceSet set;
+    prices::PriceSet set;
 };
 
-constexpr PriceChoice kPriceChoices[] = {{"current", economics::kCurrentPrices},
-                                         {"user", economics::kUserPrices},
-                                         {"longterm", economics::kLongTermPrices},
-                                         {"private", economics::kPrivatePrices}};
+constexpr PriceChoice kPriceChoices[] = {{"current", prices::kCurrentPrices},
+                                         {"user", prices::kUserPrices},
+                                         {"longterm", prices::kLongTermPrices},
+                                         {"private", prices::kPrivatePrices}};
 
 double cost(const Options &options, const char *name) {
     if (!options.has(name)) {
@@ -59,8 +59,8 @@ void readValuation(const Options &options, const QString &dataFolder,
     const QString path =
         options.has("assortment-prices")
             ? options.text("assortment-prices")
-            : QDir(dataFolder).filePath(QLatin1String(economics::kAssortmentPricesFile));
-    const economics::AssortmentPricesReading read = economics::readAssortmentPrices(path);
+            : QDir(dataFolder).filePath(QLatin1String(prices::kAssortmentPricesFile));
+    const prices::AssortmentPricesReading read = prices::readAssortmentPrices(path);
     if (!read.prices) {
         throw UsageError{QStringLiteral("assortment prices ") + read.fault};
     }
@@ -136,7 +136,7 @@ rotation::Economics readEconomics(const Options &options, const QString &dataFol
     }
     economics.establishmentCost = cost(options, "establishment-cost");
     economics.annualCost = cost(options, "annual-cost");
-    economics::PriceSet set = economics::kLongTermPrices;
+    prices::PriceSet set = prices::kLongTermPrices;
     if (options.has("prices")) {
         const QString word = options.text("prices");
         const auto found =
@@ -147,9 +147,9 @@ rotation::Economics readEconomics(const Options &options, const QString &dataFol
         }
         set = found->set;
     }
-    economics::Prices prices;
+    prices::Prices prices;
     shell::ErrorLog log(dataFolder);
-    economics::GetPricesFromFiles(dataFolder, prices.data(), log);
+    prices::GetPricesFromFiles(dataFolder, prices.data(), log);
     prices.selectPriceSet(set);
     economics.prices = prices.pricesInUse();
     readValuation(options, dataFolder, economics);

@@ -1,7 +1,7 @@
 #include "document/documentreader.hpp"
 
-#include "economics/prices.hpp"
 #include "engine/catalogue.hpp"
+#include "prices/prices.hpp"
 
 #include <QFile>
 #include <QFileInfo>
@@ -321,7 +321,7 @@ void readCashFlow(const ObjectReader &top, Document &d) {
 void readPrices(const ObjectReader &top, Document &d) {
     const ObjectReader r(top.object(key::prices), QStringLiteral("the prices in use"));
     d.priceSetInUse = static_cast<std::int16_t>(
-        r.integer(key::setInUse, economics::kCurrentPrices, economics::kPrivatePrices));
+        r.integer(key::setInUse, prices::kCurrentPrices, prices::kPrivatePrices));
     const QJsonArray prices =
         r.array(key::inUse, rotation::kPriceClassCount, rotation::kPriceClassCount);
     for (std::size_t i = 0; i < d.pricesInUse.size(); ++i) {

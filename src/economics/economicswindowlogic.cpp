@@ -5,7 +5,7 @@
 
 #include "economics/economicsformat.hpp"
 #include "economics/economicsmessages.hpp"
-#include "economics/prices.hpp"
+#include "prices/prices.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
@@ -144,9 +144,9 @@ bool EconomicsWindowLogic::readEconomics() {
         (c == C::txtEstablishmentCost ? e.establishmentCost : e.annualCost) = shell::val(typed);
     }
     // The cash flow's own prices: the long-term averages, as their absolute values.
-    Prices longTerm;
+    prices::Prices longTerm;
     longTerm.data() = m_main.prices().data();
-    longTerm.selectPriceSet(kLongTermPrices);
+    longTerm.selectPriceSet(prices::kLongTermPrices);
     e.prices = longTerm.pricesInUse();
     // Or every harvest divided into the assortment report's classes and sold
     // at the assortment prices.

@@ -2,11 +2,11 @@
 
 #include "document/documentcontroller.hpp"
 #include "document/opendocument.hpp"
-#include "economics/prices.hpp"
 #include "economics/regimereplay.hpp"
 #include "estate/resulttable.hpp"
 #include "estateio/gdallayer.hpp"
 #include "estatewindow/estatemessages.hpp"
+#include "prices/prices.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "workflow/mainwindowlogic.hpp"
@@ -112,9 +112,9 @@ estate::EstateDefaults EstateWindowLogic::defaults() const {
     estate::EstateDefaults d;
     d.year = QDate::currentDate().year();
     d.economics.ratePercent = m_main.cashFlow().interestRate();
-    economics::Prices longTerm;
+    prices::Prices longTerm;
     longTerm.data() = m_main.prices().data();
-    longTerm.selectPriceSet(economics::kLongTermPrices);
+    longTerm.selectPriceSet(prices::kLongTermPrices);
     d.economics.prices = longTerm.pricesInUse();
     return d;
 }

@@ -1,8 +1,8 @@
 // Accepting a thinning: the thinning record, the thinning row of the
 // projection table, its value, and the thinned stand as the new grow-from.
 #include "assortments/assortwindowlogic.hpp"
-#include "economics/pricelookup.hpp"
-#include "economics/prices.hpp"
+#include "prices/pricelookup.hpp"
+#include "prices/prices.hpp"
 #include "rotation/rotation.hpp"
 #include "shell/apperror.hpp"
 #include "shell/errorlog.hpp"
@@ -143,9 +143,9 @@ void ThinWindowLogic::WriteThinLine(const QString &label, int row) {
             cells[workflow::kColThinVolumePerTree] = formatNumber(meanTree, u"#0.000");
             cells[workflow::kColThinVolumePerHa] = formatNumber(rec.removedVolume, u"###0");
         }
-        economics::Prices &prices = m_main.prices();
+        prices::Prices &prices = m_main.prices();
         const double price =
-            economics::TrouveIndicePrix(meanTree, prices.data().current, m_interactive);
+            prices::TrouveIndicePrix(meanTree, prices.data().current, m_interactive);
         const double valuePerHa = rec.removedVolume * price;
         cells[workflow::kColValuePerHa] = formatNumber(valuePerHa, u"####0");
 
@@ -176,7 +176,7 @@ void ThinWindowLogic::WriteThinLine(const QString &label, int row) {
 
         // The cash flow values thinnings at long-term average prices, in the
         // class the lookup above found (a failed lookup has already said so).
-        const int priceClass = economics::walkPriceClasses(meanTree, QLocale::system()).priceClass;
+        const int priceClass = prices::walkPriceClasses(meanTree, QLocale::system()).priceClass;
         r.timberRevenue = rec.removedVolume *
                           prices.data().longTermAverage.at(static_cast<std::size_t>(priceClass));
         m_main.timberRevenueChanged();

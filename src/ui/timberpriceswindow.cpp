@@ -19,10 +19,10 @@
 namespace arbolex::ui {
 
 using economics::kPriceBlockCount;
-using economics::kPriceClassCount;
 using economics::TimberPricesControl;
 using economics::TimberPricesItem;
 using economics::TimberPricesWindowLogic;
+using prices::kPriceClassCount;
 
 namespace {
 
@@ -290,7 +290,7 @@ void TimberPricesWindow::setChecked(TimberPricesControl option, bool checked) {
 }
 
 void TimberPricesWindow::setUserPricesEditable(bool editable) {
-    const int first = economics::kUserPrices * kPriceClassCount;
+    const int first = prices::kUserPrices * kPriceClassCount;
     for (int k = 0; k < kPriceClassCount; ++k) {
         m_fields.at(at(first + k))->setReadOnly(!editable);
     }

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "economics/itimberpricesview.hpp"
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 
 #include <QDialog>
 
@@ -70,7 +70,7 @@ private:
 
     economics::TimberPricesWindowLogic *m_logic = nullptr;
     std::array<QLineEdit *, economics::kPriceFieldCount> m_fields{};
-    std::array<QLabel *, economics::kPriceClassCount> m_categories{};
+    std::array<QLabel *, prices::kPriceClassCount> m_categories{};
     std::array<QGroupBox *, economics::kPriceBlockCount> m_frames{};
     std::array<QWidget *, economics::kTimberPricesControlCount> m_controls{};
     /// Width of the text of a list's option button and description, pixels.

@@ -1,8 +1,8 @@
 // Closing the rotation: the final cut, its value and yield class, and the
 // cash flow of the rotation that the net present value window opens on.
 #include "economics/npvwindowlogic.hpp"
-#include "economics/pricelookup.hpp"
-#include "economics/prices.hpp"
+#include "prices/pricelookup.hpp"
+#include "prices/prices.hpp"
 #include "rotation/rotation.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
@@ -100,7 +100,7 @@ void MainWindowLogic::cmdFinalCut_Click() {
         const double volumePerTree =
             rotation::felledMeanTree(row.record.volume, row.record.stocking);
         const auto index =
-            static_cast<std::size_t>(economics::priceClassOf(volumePerTree, m_interactive));
+            static_cast<std::size_t>(prices::priceClassOf(volumePerTree, m_interactive));
         const double price = m_prices.pricesInUse().at(index);
         cells[kColValuePerHa] = formatNumber(m_standingVolume * price, u"0");
         row.removedValue = m_standingVolume * price;

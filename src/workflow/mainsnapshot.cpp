@@ -3,7 +3,7 @@
 // flow and the prices the rows were valued with.
 #include "workflow/mainsnapshot.hpp"
 
-#include "economics/prices.hpp"
+#include "prices/prices.hpp"
 #include "shell/apperror.hpp"
 #include "thinning/thinwindowlogic.hpp"
 #include "workflow/mainmessages.hpp"

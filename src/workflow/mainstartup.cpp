@@ -1,8 +1,8 @@
 // The main window's load and unload, the model menu and its information boxes.
 #include "document/documentmessages.hpp"
-#include "economics/assortmentpricefile.hpp"
-#include "economics/pricedata.hpp"
-#include "economics/prices.hpp"
+#include "prices/assortmentpricefile.hpp"
+#include "prices/pricedata.hpp"
+#include "prices/prices.hpp"
 #include "shell/apperror.hpp"
 #include "shell/datahistory.hpp"
 #include "shell/interactive.hpp"
@@ -57,7 +57,7 @@ void MainWindowLogic::Form_Load(QSettings &settings, const QRect &screen) {
         ChkGrowFromBD();
         showSiteIndex(stored.age, stored.topHeight);
         readPriceFiles();
-        m_prices.selectPriceSet(economics::kCurrentPrices);
+        m_prices.selectPriceSet(prices::kCurrentPrices);
         showSummary(false);
         m_view.setText(MainControl::cmdShowTimberPrice, text::showTimberPrices());
     });
@@ -84,7 +84,7 @@ void MainWindowLogic::Form_Unload(QSettings &settings) {
         shell::writeStartupFile(m_dataFolder, values, m_log);
     });
     if (m_dataHistory != nullptr) {
-        for (const char *name : economics::kFilesWrittenAtExit) {
+        for (const char *name : prices::kFilesWrittenAtExit) {
             shell::guard(m_log, label, [&] {
                 if (!m_dataHistory->keep(QDir(m_dataFolder).filePath(QLatin1String(name)))) {
                     shell::raiseAppFault(shell::RuntimeError::pathFileAccessError());
@@ -92,20 +92,20 @@ void MainWindowLogic::Form_Unload(QSettings &settings) {
             });
         }
     }
-    economics::WritePricesInFiles(3, m_dataFolder, m_prices.data(), m_log);
-    economics::WriteUserDefinedAssortmentsInFile(m_dataFolder, m_prices.data(), m_log);
-    economics::WriteAssortmentPricesInFile(m_dataFolder, m_prices.data(), m_log);
+    prices::WritePricesInFiles(3, m_dataFolder, m_prices.data(), m_log);
+    prices::WriteUserDefinedAssortmentsInFile(m_dataFolder, m_prices.data(), m_log);
+    prices::WriteAssortmentPricesInFile(m_dataFolder, m_prices.data(), m_log);
 }
 
 void MainWindowLogic::readPriceFiles() {
-    economics::GetPricesFromFiles(m_dataFolder, m_prices.data(), m_log);
-    economics::GetAssortmentPricesFromFile(m_dataFolder, m_prices.data(), m_log);
+    prices::GetPricesFromFiles(m_dataFolder, m_prices.data(), m_log);
+    prices::GetAssortmentPricesFromFile(m_dataFolder, m_prices.data(), m_log);
 }
 
 void MainWindowLogic::reloadDataFiles() {
     shell::guard(m_log, QStringLiteral(" in frmMain.reloadDataFiles()"), [&] {
         const std::int16_t inUse = m_prices.priceSetInUse();
-        m_prices.data() = economics::PriceData{};
+        m_prices.data() = prices::PriceData{};
         readPriceFiles();
         m_prices.selectPriceSet(inUse);
     });

@@ -30,8 +30,8 @@ private:
 
 } // namespace
 
-MainWindowLogic::MainWindowLogic(engine::Grow &grow, economics::Prices &prices,
-                                 shell::ErrorLog &log, QString dataFolder, IMainView &view,
+MainWindowLogic::MainWindowLogic(engine::Grow &grow, prices::Prices &prices, shell::ErrorLog &log,
+                                 QString dataFolder, IMainView &view,
                                  shell::IInteractive &interactive)
     : m_grow(grow), m_prices(prices), m_log(log), m_dataFolder(std::move(dataFolder)), m_view(view),
       m_interactive(interactive) {}

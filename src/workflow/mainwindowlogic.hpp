@@ -27,9 +27,12 @@ class IClipboard;
 class IInteractive;
 } // namespace arbolex::shell
 
+namespace arbolex::prices {
+class Prices;
+}
+
 namespace arbolex::economics {
 class NpvWindowLogic;
-class Prices;
 class TimberPricesWindowLogic;
 } // namespace arbolex::economics
 
@@ -56,7 +59,7 @@ struct GrowFrom {
 
 class MainWindowLogic {
 public:
-    MainWindowLogic(engine::Grow &grow, economics::Prices &prices, shell::ErrorLog &log,
+    MainWindowLogic(engine::Grow &grow, prices::Prices &prices, shell::ErrorLog &log,
                     QString dataFolder, IMainView &view, shell::IInteractive &interactive);
 
     // ---- Start-up and exit --------------------------------------------------
@@ -214,7 +217,7 @@ public:
     void setIdentification(const document::SubCompartment &id) { m_identification = id; }
 
     engine::Grow &grow() { return m_grow; }
-    economics::Prices &prices() { return m_prices; }
+    prices::Prices &prices() { return m_prices; }
     IMainView &view() { return m_view; }
     shell::IInteractive &interactive() { return m_interactive; }
     shell::ErrorLog &errorLog() { return m_log; }
@@ -247,7 +250,7 @@ private:
     void restoreCashFlow(const MainSnapshot &snapshot);
 
     engine::Grow &m_grow;
-    economics::Prices &m_prices;
+    prices::Prices &m_prices;
     shell::ErrorLog &m_log;
     QString m_dataFolder;
     IMainView &m_view;

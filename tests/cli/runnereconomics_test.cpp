@@ -2,7 +2,7 @@
 // apply the best regime and print the figures.
 #include "cli/runnerfixture.hpp"
 
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 
 namespace arbolex::testing {
 namespace {
@@ -11,8 +11,8 @@ class RunnerEconomicsTest : public RunnerTest {
 protected:
     RunnerEconomicsTest() {
         workflow::MainWindowLogic &main = session.main();
-        economics::GetPricesFromFiles(QStringLiteral(ARBOLEX_DATA_SOURCE), main.prices().data(),
-                                      main.errorLog());
+        prices::GetPricesFromFiles(QStringLiteral(ARBOLEX_DATA_SOURCE), main.prices().data(),
+                                   main.errorLog());
     }
 };
 

@@ -3,8 +3,8 @@
 #include "cli/runnerfixture.hpp"
 
 #include "economics/npvmessages.hpp"
-#include "economics/pricedata.hpp"
-#include "economics/prices.hpp"
+#include "prices/pricedata.hpp"
+#include "prices/prices.hpp"
 #include "shell/vbformat.hpp"
 #include "shell/vbtext.hpp"
 
@@ -36,9 +36,9 @@ class RunnerRotationTest : public RunnerTest {
 protected:
     RunnerRotationTest() {
         workflow::MainWindowLogic &main = session.main();
-        economics::GetPricesFromFiles(QStringLiteral(ARBOLEX_DATA_SOURCE), main.prices().data(),
-                                      main.errorLog());
-        main.prices().selectPriceSet(economics::kCurrentPrices);
+        prices::GetPricesFromFiles(QStringLiteral(ARBOLEX_DATA_SOURCE), main.prices().data(),
+                                   main.errorLog());
+        main.prices().selectPriceSet(prices::kCurrentPrices);
     }
 
     /// What the script printed after the rotation, without its question line.

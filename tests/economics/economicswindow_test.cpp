@@ -6,7 +6,7 @@
 #include "economics/economicsformat.hpp"
 #include "economics/economicsmessages.hpp"
 #include "economics/economicswindowlogic.hpp"
-#include "economics/prices.hpp"
+#include "prices/prices.hpp"
 
 namespace arbolex::testing {
 namespace {
@@ -71,9 +71,9 @@ TEST_F(EconomicsWindowTest, FiguresAreTheRotationLibrarysForTheTablesRotation) {
     money.ratePercent = 3.0;
     money.establishmentCost = 1800.0;
     money.annualCost = 15.0;
-    economics::Prices longTerm;
+    prices::Prices longTerm;
     longTerm.data() = prices.data();
-    longTerm.selectPriceSet(economics::kLongTermPrices);
+    longTerm.selectPriceSet(prices::kLongTermPrices);
     money.prices = longTerm.pricesInUse();
     const rotation::Regime regime{20, 5, 40.0f, 30};
     engine::Grow own;

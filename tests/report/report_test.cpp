@@ -5,7 +5,7 @@
 
 #include "charts/reportcontent.hpp"
 #include "document/documentwriter.hpp"
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 #include "report/chartexport.hpp"
 #include "report/reportwriter.hpp"
 
@@ -35,7 +35,7 @@ int pdfPages(const QString &path) {
 class ReportTest : public MainWindowTest {
 protected:
     ReportTest() {
-        economics::GetPricesFromFiles(QStringLiteral(ARBOLEX_DATA_SOURCE), prices.data(), log);
+        prices::GetPricesFromFiles(QStringLiteral(ARBOLEX_DATA_SOURCE), prices.data(), log);
     }
 
     void closeRotation() {

@@ -2,7 +2,7 @@
 
 #include "workflow/mainwindowfixture.hpp"
 
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 #include "shell/vbformat.hpp"
 #include "thinning/headlessthinview.hpp"
 #include "thinning/thinwindowlogic.hpp"
@@ -19,7 +19,7 @@ class ThinningTest : public MainWindowTest {
 protected:
     ThinningTest() {
         const QDir source(QStringLiteral(ARBOLEX_DATA_SOURCE));
-        economics::GetPricesFromFiles(source.path(), prices.data(), log);
+        prices::GetPricesFromFiles(source.path(), prices.data(), log);
         logic.attachThinning(&thin);
     }
 

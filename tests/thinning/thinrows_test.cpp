@@ -2,7 +2,7 @@
 // re-opening one, and the thinning loop.
 #include "thinningfixture.hpp"
 
-#include "economics/pricelookup.hpp"
+#include "prices/pricelookup.hpp"
 #include "thinning/thinmessages.hpp"
 #include "workflow/mainmessages.hpp"
 
@@ -41,7 +41,7 @@ TEST_F(ThinningTest, AcceptedThinningRowShowsTheThinnedStandAndItsValue) {
     EXPECT_EQ(row.cells[kColBasalArea], shell::formatNumber(w.postBasalArea, u"##0.0"));
     EXPECT_EQ(row.cells[kColThinVolumePerHa], QStringLiteral("60"));
     const double meanTree = row.record.removedVolume / std::nearbyint(row.record.removedStocking);
-    const double price = economics::TrouveIndicePrix(meanTree, prices.data().current, interactive);
+    const double price = prices::TrouveIndicePrix(meanTree, prices.data().current, interactive);
     EXPECT_EQ(row.cells[kColValuePerHa],
               shell::formatNumber(row.record.removedVolume * price, u"####0"));
     EXPECT_GT(logic.timberRevenue().at(30), 0.0);

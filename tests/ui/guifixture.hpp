@@ -2,8 +2,8 @@
 
 #include "mocks/programservices.hpp"
 
-#include "economics/prices.hpp"
 #include "engine/grow.hpp"
+#include "prices/prices.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
 #include "ui/mainwindow.hpp"

@@ -67,7 +67,7 @@ TEST_F(MainStartupTest, UnloadAndLoadRoundTrip) {
     logic.Form_Unload(settings);
 
     HeadlessMainView nextView;
-    economics::Prices nextPrices;
+    prices::Prices nextPrices;
     MainWindowLogic next(grow, nextPrices, log, dir.path(), nextView, interactive);
     next.Form_Load(settings, kScreen);
     EXPECT_EQ(grow.modelId(), 4);

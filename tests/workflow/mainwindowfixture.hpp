@@ -3,8 +3,8 @@
 #include "mocks/programservices.hpp"
 #include "mocks/qtprinters.hpp"
 
-#include "economics/prices.hpp"
 #include "engine/grow.hpp"
+#include "prices/prices.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/vbtext.hpp"

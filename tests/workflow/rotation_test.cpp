@@ -3,7 +3,7 @@
 #include "thinning/thinningfixture.hpp"
 
 #include "economics/npvwindowlogic.hpp"
-#include "economics/pricelookup.hpp"
+#include "prices/pricelookup.hpp"
 #include "shell/iclipboard.hpp"
 #include "workflow/mainmessages.hpp"
 #include "workflow/yieldclass.hpp"
@@ -20,7 +20,7 @@ protected:
     RotationTest() {
         logic.attachNpv(&npv);
         logic.attachClipboard(&clipboard);
-        prices.selectPriceSet(economics::kCurrentPrices);
+        prices.selectPriceSet(prices::kCurrentPrices);
     }
 
     void growThinAndGrow(const QString &netArea = QStringLiteral("10")) {
@@ -73,7 +73,7 @@ TEST_F(RotationTest, FinalCutFellsTheStandingCropAndValuesIt) {
     }
     const double trees = std::nearbyint(shell::val(felled.cells[kColStocking]));
     const double meanTree = shell::val(felled.cells[kColVolumePerTree]);
-    const auto k = static_cast<std::size_t>(economics::priceClassOf(meanTree, interactive));
+    const auto k = static_cast<std::size_t>(prices::priceClassOf(meanTree, interactive));
     const double price = prices.pricesInUse()[k];
     EXPECT_EQ(felled.cells[kColValuePerHa], shell::formatNumber(standing * price, u"0"));
     EXPECT_EQ(felled.cells[kColThinTotalVolume],

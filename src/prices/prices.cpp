@@ -1,8 +1,8 @@
-#include "economics/prices.hpp"
+#include "prices/prices.hpp"
 
 #include <cmath>
 
-namespace arbolex::economics {
+namespace arbolex::prices {
 
 const PriceList *Prices::priceSet(std::int16_t set) const {
     switch (set) {
@@ -30,4 +30,4 @@ void Prices::selectPriceSet(std::int16_t set) {
     m_priceSetInUse = set;
 }
 
-} // namespace arbolex::economics
+} // namespace arbolex::prices

@@ -1,4 +1,4 @@
-#include "economics/assortmentpricefile.hpp"
+#include "prices/assortmentpricefile.hpp"
 
 #include "shell/errorlog.hpp"
 #include "shell/runtimeerror.hpp"
@@ -9,7 +9,7 @@
 
 #include <cmath>
 
-namespace arbolex::economics {
+namespace arbolex::prices {
 
 namespace {
 
@@ -80,4 +80,4 @@ void WriteAssortmentPricesInFile(const QString &dataFolder, const PriceData &dat
     check(out.close(), 30);
 }
 
-} // namespace arbolex::economics
+} // namespace arbolex::prices

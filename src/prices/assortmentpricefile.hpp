@@ -5,7 +5,7 @@
 // in the format of the other price files. Read at start-up and written at
 // exit beside them.
 
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 
 #include <QString>
 
@@ -15,7 +15,7 @@ namespace arbolex::shell {
 class ErrorLog;
 }
 
-namespace arbolex::economics {
+namespace arbolex::prices {
 
 /// Highest price of a class, euro per m³: what a price field shows ("#0.00").
 inline constexpr double kMaxAssortmentPrice = 9999.99;
@@ -42,4 +42,4 @@ void GetAssortmentPricesFromFile(const QString &dataFolder, PriceData &data, she
 void WriteAssortmentPricesInFile(const QString &dataFolder, const PriceData &data,
                                  shell::ErrorLog &log);
 
-} // namespace arbolex::economics
+} // namespace arbolex::prices

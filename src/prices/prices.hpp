@@ -1,10 +1,10 @@
 #pragma once
 
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 
 #include <cstdint>
 
-namespace arbolex::economics {
+namespace arbolex::prices {
 
 /// Price set in use, as numbered by the option buttons of the timber prices
 /// window (`OptCurentPrices` … `OptOvraPrices`). Not the selector of
@@ -51,4 +51,4 @@ private:
     bool m_priceChanges = false;
 };
 
-} // namespace arbolex::economics
+} // namespace arbolex::prices

@@ -12,7 +12,7 @@ namespace arbolex::shell {
 class ErrorLog;
 }
 
-namespace arbolex::economics {
+namespace arbolex::prices {
 
 using rotation::kPriceClassCount;
 /// Thirteen standing timber prices, euro per m³, indexed 0 to 12 by mean tree
@@ -92,4 +92,4 @@ void WritePricesInFiles(std::int16_t selector, const QString &dataFolder, const 
 void WriteUserDefinedAssortmentsInFile(const QString &dataFolder, const PriceData &data,
                                        shell::ErrorLog &log);
 
-} // namespace arbolex::economics
+} // namespace arbolex::prices

@@ -1,9 +1,9 @@
-#include "economics/pricelookup.hpp"
+#include "prices/pricelookup.hpp"
 
 #include "shell/interactive.hpp"
 #include "shell/runtimeerror.hpp"
 
-namespace arbolex::economics {
+namespace arbolex::prices {
 
 namespace {
 
@@ -50,4 +50,4 @@ int priceClassOf(double meanTreeVolume, shell::IInteractive &interactive, const 
     return walk.priceClass;
 }
 
-} // namespace arbolex::economics
+} // namespace arbolex::prices

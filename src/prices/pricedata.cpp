@@ -1,4 +1,4 @@
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 
 #include "shell/errorlog.hpp"
 #include "shell/runtimeerror.hpp"
@@ -6,7 +6,7 @@
 
 #include <QDir>
 
-namespace arbolex::economics {
+namespace arbolex::prices {
 
 using shell::RuntimeError;
 using shell::SequentialReader;
@@ -158,4 +158,4 @@ void WriteUserDefinedAssortmentsInFile(const QString &dataFolder, const PriceDat
     writeLog.check(out.close(), 50);
 }
 
-} // namespace arbolex::economics
+} // namespace arbolex::prices

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 #include "rotation/priceclasses.hpp"
 
 #include <QLatin1String>
@@ -12,7 +12,7 @@ namespace arbolex::shell {
 class IInteractive;
 }
 
-namespace arbolex::economics {
+namespace arbolex::prices {
 
 /// Captions of the 13 mean-tree-volume classes (m³ per tree), shown by the
 /// timber prices window as `lblTimbCat`(0 to 12): the texts of
@@ -46,4 +46,4 @@ double TrouveIndicePrix(double meanTreeVolume, const PriceList &current,
 int priceClassOf(double meanTreeVolume, shell::IInteractive &interactive,
                  const QLocale &locale = QLocale::system());
 
-} // namespace arbolex::economics
+} // namespace arbolex::prices
