@@ -209,12 +209,12 @@ BENCHMARK(BM_FinalCutAndCashFlow)->Unit(benchmark::kMicrosecond);
 void BM_ComputeCashFlow60Years(benchmark::State &state) {
     QTemporaryDir dir;
     arbolex::shell::ErrorLog log(dir.path());
-    arbolex::economics::CashFlow flow;
+    arbolex::work::CashFlow flow;
     flow.SetRotationLength(0, 60);
     flow.DimNPVArrays();
     for (int i = 0; i < flow.years(); ++i) {
-        flow.setMatrix(arbolex::economics::kCfCost, i, 25.0 * i);
-        flow.setMatrix(arbolex::economics::kCfTimberRevenue, i, i % 5 == 0 ? 900.0 : 0.0);
+        flow.setMatrix(arbolex::work::kCfCost, i, 25.0 * i);
+        flow.setMatrix(arbolex::work::kCfTimberRevenue, i, i % 5 == 0 ? 900.0 : 0.0);
     }
     for (auto _ : state) {
         benchmark::DoNotOptimize(flow.ComputeCashFlow(log));
@@ -231,12 +231,12 @@ void BM_OpenNpvWindow60Years(benchmark::State &state) {
     SilentInteractive interactive;
     arbolex::shell::HeadlessClipboard clipboard;
     arbolex::economics::HeadlessNpvView view;
-    arbolex::economics::TimberRevenue revenue;
+    arbolex::work::TimberRevenue revenue;
     for (int age = 20; age < 60; age += 5) {
         revenue.add(age, 700.0);
     }
     revenue.add(60, 40000.0);
-    arbolex::economics::CashFlow flow;
+    arbolex::work::CashFlow flow;
     flow.SetRotationLength(0, 60);
     flow.DimNPVArrays();
     arbolex::economics::NpvWindowLogic npv(flow, revenue, log, view, interactive, clipboard);

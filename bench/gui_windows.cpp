@@ -1,12 +1,12 @@
 // The windows as a user opens them, drawn off screen: the net present value
 // window on a 60-year cash flow, from the command to the window laid out.
-#include "economics/mdlnpv.hpp"
 #include "economics/npvwindowlogic.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/iclipboard.hpp"
 #include "shell/interactive.hpp"
 #include "silentinteractive.hpp"
 #include "ui/npvwindow.hpp"
+#include "work/mdlnpv.hpp"
 
 #include <QApplication>
 #include <QTemporaryDir>
@@ -22,11 +22,11 @@ void BM_ShowNpvWindow60Years(benchmark::State &state) {
     arbolex::shell::ErrorLog log(dir.path());
     SilentInteractive interactive;
     arbolex::shell::HeadlessClipboard clipboard;
-    arbolex::economics::TimberRevenue revenue;
+    arbolex::work::TimberRevenue revenue;
     for (int age = 20; age <= 60; age += 5) {
         revenue.add(age, 800.0);
     }
-    arbolex::economics::CashFlow flow;
+    arbolex::work::CashFlow flow;
     flow.SetRotationLength(0, 60);
     flow.DimNPVArrays();
     for (auto _ : state) {

@@ -141,10 +141,10 @@ bool demoRotation(MainWindowLogic &logic, ThinWindowLogic &thin,
         logic.cmdSummary_Click();
     } else if (stage == QLatin1String("npv")) {
         logic.cmdNPV_Click();
-        npv.typeInCell(1, arbolex::economics::kCfOperation, QStringLiteral("Planting"));
-        npv.typeInCell(1, arbolex::economics::kCfCost, QStringLiteral("2500"));
-        npv.typeInCell(6, arbolex::economics::kCfOperation, QStringLiteral("Cleaning"));
-        npv.typeInCell(6, arbolex::economics::kCfCost, QStringLiteral("300"));
+        npv.typeInCell(1, arbolex::work::kCfOperation, QStringLiteral("Planting"));
+        npv.typeInCell(1, arbolex::work::kCfCost, QStringLiteral("2500"));
+        npv.typeInCell(6, arbolex::work::kCfOperation, QStringLiteral("Cleaning"));
+        npv.typeInCell(6, arbolex::work::kCfCost, QStringLiteral("300"));
         npv.cmdNPV_Click();
     }
     return true;
@@ -177,8 +177,8 @@ bool demoCharts(MainWindowLogic &logic, ThinWindowLogic &thin,
     logic.cmdGrow_Click();
     logic.cmdFinalCut_Click();
     logic.cmdNPV_Click();
-    using arbolex::economics::kCfCost;
-    using arbolex::economics::kCfOperation;
+    using arbolex::work::kCfCost;
+    using arbolex::work::kCfOperation;
     npv.typeInCell(1, kCfOperation, QStringLiteral("Planting"));
     npv.typeInCell(1, kCfCost, QStringLiteral("2500"));
     npv.typeInCell(3, kCfOperation, QStringLiteral("Cleaning"));

@@ -22,11 +22,11 @@ constexpr char16_t kPercentFormat[] = u"##0.0";
 
 /// The columns of `flxMain` that an assortment row fills, in order: two per
 /// class (share, then volume), the separator column left out.
-constexpr std::array<int, 10> kRowColumns = {
-    workflow::kColTopHeight,        workflow::kColStocking,      workflow::kColDbh,
-    workflow::kColBasalArea,        workflow::kColVolumePerTree, workflow::kColVolumePerHa,
-    workflow::kColThinStocking,     workflow::kColThinDbh,       workflow::kColThinBasalArea,
-    workflow::kColThinVolumePerTree};
+constexpr std::array<int, 10> kRowColumns = {work::kColTopHeight,     work::kColStocking,
+                                             work::kColDbh,           work::kColBasalArea,
+                                             work::kColVolumePerTree, work::kColVolumePerHa,
+                                             work::kColThinStocking,  work::kColThinDbh,
+                                             work::kColThinBasalArea, work::kColThinVolumePerTree};
 
 /// A thinning is a rack thinning when it removes the same share of basal
 /// area as of stems: the mean tree stays.
@@ -78,7 +78,7 @@ void AssortWindowLogic::message(const QString &text) {
 }
 
 void AssortWindowLogic::reportOnGrowthRow(int row) {
-    const workflow::RowRecord &r = m_main.table().row(row).record;
+    const work::RowRecord &r = m_main.table().row(row).record;
     m_fromMain = true;
     m_actualThinning = false;
     m_volumes = {};
@@ -345,15 +345,15 @@ QString AssortWindowLogic::rowLabel(const QString &description) {
 
 void AssortWindowLogic::appendRow(const QString &description, float age,
                                   const engine::Assortment &result, const QStringList &names) {
-    workflow::TableRow row;
-    row.kind = workflow::RowKind::Text;
+    work::TableRow row;
+    row.kind = work::RowKind::Text;
     row.label = rowLabel(description);
     row.record.age = age;
-    row.numbers[workflow::kNumAge] = age;
-    for (int c = 0; c < workflow::kColumnCount; ++c) {
+    row.numbers[work::kNumAge] = age;
+    for (int c = 0; c < work::kColumnCount; ++c) {
         row.cells.append(QString());
     }
-    row.cells[workflow::kColAge] = shell::singleText(age);
+    row.cells[work::kColAge] = shell::singleText(age);
     for (std::size_t i = 0; i < result.count && 2 * i + 1 < kRowColumns.size(); ++i) {
         const QString cls = names.isEmpty() ? text::rowClass(static_cast<int>(i))
                                             : names.at(static_cast<qsizetype>(i));
@@ -362,7 +362,7 @@ void AssortWindowLogic::appendRow(const QString &description, float age,
         row.cells[kRowColumns[2 * i + 1]] = text::rowCaptionVolume(cls) + QLatin1Char(' ') +
                                             formatNumber(result.classVolume[i], kVolumeFormat);
     }
-    workflow::ProjectionTable &table = m_main.tableForThinning();
+    work::ProjectionTable &table = m_main.tableForThinning();
     const int index = table.append(std::move(row));
     m_main.view().tableChanged(index);
 }

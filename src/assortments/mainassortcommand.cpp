@@ -27,7 +27,7 @@ void MainWindowLogic::cmdAssort_Click() {
             return;
         }
         // A growth row carries a thinning when a thinning row of its age follows it.
-        const TableRow &row = m_table.row(current);
+        const work::TableRow &row = m_table.row(current);
         bool thinned = row.isThinning() || row.record.isThinned();
         for (int r = current + 1; !thinned && r <= m_table.lastRow(); ++r) {
             thinned = m_table.row(r).isThinning() && m_table.row(r).record.age == row.record.age;

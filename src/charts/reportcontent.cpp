@@ -2,10 +2,10 @@
 
 #include "charts/reportmessages.hpp"
 #include "charts/standcharts.hpp"
-#include "document/subcompartment.hpp"
-#include "economics/mdlnpv.hpp"
 #include "economics/npvmessages.hpp"
 #include "shell/vbformat.hpp"
+#include "work/mdlnpv.hpp"
+#include "work/subcompartment.hpp"
 #include "workflow/mainwindowlogic.hpp"
 
 namespace arbolex::charts {
@@ -39,7 +39,7 @@ ReportTable fromGrid(std::vector<QStringList> grid, QStringList groups) {
 /// The cash flow with the costs and revenues typed so far, computed; the
 /// program's own cash flow keeps what its window last computed.
 struct ComputedCashFlow {
-    economics::CashFlow flow;
+    work::CashFlow flow;
     int years = 0;
 };
 
@@ -61,15 +61,15 @@ ReportTable cashFlowTable(const ComputedCashFlow &computed) {
     for (int i = 0; i < computed.years; ++i) {
         // Years without an operation, a cost or a revenue are left out.
         const bool quiet = computed.flow.operation(i).trimmed().isEmpty() &&
-                           computed.flow.matrix(economics::kCfCost, i) == 0.0 &&
-                           computed.flow.matrix(economics::kCfTotalRevenues, i) == 0.0;
+                           computed.flow.matrix(work::kCfCost, i) == 0.0 &&
+                           computed.flow.matrix(work::kCfTotalRevenues, i) == 0.0;
         if (quiet) {
             continue;
         }
         QStringList row;
-        row << QString::number(static_cast<int>(computed.flow.matrix(economics::kCfYear, i)))
+        row << QString::number(static_cast<int>(computed.flow.matrix(work::kCfYear, i)))
             << computed.flow.operation(i);
-        for (int c = economics::kCfCost; c < economics::kCashFlowColumnCount; ++c) {
+        for (int c = work::kCfCost; c < work::kCashFlowColumnCount; ++c) {
             row << formatNumber(computed.flow.matrix(c, i), u"#0");
         }
         table.rows.push_back(std::move(row));
@@ -80,16 +80,16 @@ ReportTable cashFlowTable(const ComputedCashFlow &computed) {
 /// The stand the projection started from: the table's first row, else the
 /// grow-from fields as typed.
 std::vector<std::pair<QString, QString>> inputs(workflow::MainWindowLogic &logic) {
-    const workflow::ProjectionTable &table = logic.table();
+    const work::ProjectionTable &table = logic.table();
     const auto value = [&](int column, MainControl field) {
         return table.empty() ? logic.view().text(field) : table.row(1).cells.value(column);
     };
     return {
-        {text::inputAge(), value(workflow::kColAge, MainControl::txtFromA)},
-        {text::inputStocking(), value(workflow::kColStocking, MainControl::txtFromN)},
-        {text::inputTopHeight(), value(workflow::kColTopHeight, MainControl::txtFromH)},
-        {text::inputBasalArea(), value(workflow::kColBasalArea, MainControl::txtFromB)},
-        {text::inputDbh(), value(workflow::kColDbh, MainControl::txtFromD)},
+        {text::inputAge(), value(work::kColAge, MainControl::txtFromA)},
+        {text::inputStocking(), value(work::kColStocking, MainControl::txtFromN)},
+        {text::inputTopHeight(), value(work::kColTopHeight, MainControl::txtFromH)},
+        {text::inputBasalArea(), value(work::kColBasalArea, MainControl::txtFromB)},
+        {text::inputDbh(), value(work::kColDbh, MainControl::txtFromD)},
         {text::inputNetArea(), logic.view().text(MainControl::txtNetArea)},
     };
 }
@@ -104,7 +104,7 @@ RotationCharts rotationCharts(workflow::MainWindowLogic &logic) {
 
 ReportContent reportContent(workflow::MainWindowLogic &logic) {
     ReportContent content;
-    const document::SubCompartment &id = logic.identification();
+    const work::SubCompartment &id = logic.identification();
     content.forest = id.forest;
     content.compartment = id.compartment;
     content.subCompartment = id.subCompartment;

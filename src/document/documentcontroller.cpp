@@ -183,7 +183,7 @@ bool DocumentController::saveAs() {
     }
     QString suggested = m_path;
     if (suggested.isEmpty()) {
-        const SubCompartment &id = m_main.identification();
+        const work::SubCompartment &id = m_main.identification();
         QString stem = QStringList{id.forest, id.compartment, id.subCompartment}.join(u' ');
         stem = stem.simplified();
         suggested = QDir(lastFolder())
@@ -219,13 +219,13 @@ void DocumentController::editIdentification() {
     if (m_dialogs == nullptr) {
         return;
     }
-    SubCompartment id = m_main.identification();
+    work::SubCompartment id = m_main.identification();
     if (m_dialogs->editIdentification(id)) {
         setIdentification(id);
     }
 }
 
-void DocumentController::setIdentification(const SubCompartment &id) {
+void DocumentController::setIdentification(const work::SubCompartment &id) {
     m_main.setIdentification(id);
     refreshCaption();
 }

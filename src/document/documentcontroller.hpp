@@ -56,7 +56,7 @@ public:
     void fileClose();
     /// Sub-compartment identification: edited in its dialog.
     void editIdentification();
-    void setIdentification(const SubCompartment &id);
+    void setIdentification(const work::SubCompartment &id);
 
     /// The work now in the window becomes a new document, never saved and
     /// named `name` until it is: everything in it counts as unsaved. The

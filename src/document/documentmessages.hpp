@@ -2,19 +2,21 @@
 
 // Every text of the documents: captions, questions, faults and menu entries.
 
+#include "work/subcompartment.hpp"
+
 #include <QString>
 
 namespace arbolex::document::text {
 
 // ---- The identification -------------------------------------------------------
 inline QString captionForest() {
-    return QStringLiteral("Forest");
+    return work::SubCompartment::forestCaption();
 }
 inline QString captionCompartment() {
-    return QStringLiteral("Compartment");
+    return work::SubCompartment::compartmentCaption();
 }
 inline QString captionSubCompartment() {
-    return QStringLiteral("Sub-compartment");
+    return work::SubCompartment::subCompartmentCaption();
 }
 inline QString captionNotes() {
     return QStringLiteral("Notes");

@@ -21,7 +21,7 @@ bool openDocumentInto(const QString &path, workflow::MainWindowLogic &main, QStr
 }
 
 Document documentForStand(const workflow::MainWindowLogic &main, const rotation::Stand &stand,
-                          const SubCompartment &id, int targetAge, int step, double netArea) {
+                          const work::SubCompartment &id, int targetAge, int step, double netArea) {
     Document d = main.snapshot();
     d.identification = id;
     d.modelId = stand.model;

@@ -31,6 +31,6 @@ bool openDocumentInto(const QString &path, workflow::MainWindowLogic &main, QStr
 /// through the window's handlers, then take MainWindowLogic::snapshot() to
 /// have the grown document.
 Document documentForStand(const workflow::MainWindowLogic &main, const rotation::Stand &stand,
-                          const SubCompartment &id, int targetAge, int step, double netArea);
+                          const work::SubCompartment &id, int targetAge, int step, double netArea);
 
 } // namespace arbolex::document

@@ -27,7 +27,7 @@ double valueOrZero(const QString &text) {
 
 } // namespace
 
-NpvWindowLogic::NpvWindowLogic(CashFlow &cashFlow, const TimberRevenue &revenue,
+NpvWindowLogic::NpvWindowLogic(work::CashFlow &cashFlow, const work::TimberRevenue &revenue,
                                shell::ErrorLog &log, INpvView &view,
                                shell::IInteractive &interactive, shell::IClipboard &clipboard)
     : m_cashFlow(cashFlow), m_revenue(revenue), m_log(log), m_view(view),
@@ -40,10 +40,10 @@ void NpvWindowLogic::Form_Load() {
         m_grid[0] = text::npvHeaders();
         for (int i = 0; i < years; ++i) {
             QStringList &row = m_grid[static_cast<std::size_t>(i) + 1];
-            for (int c = 0; c < kCashFlowColumnCount; ++c) {
+            for (int c = 0; c < work::kCashFlowColumnCount; ++c) {
                 row << QString();
             }
-            row[kCfYear] = QString::number(m_cashFlow.firstYear() + i);
+            row[work::kCfYear] = QString::number(m_cashFlow.firstYear() + i);
         }
         m_cashFlow.LoadTimberRevenues(m_revenue);
         LoadNPV_GridWithArray();
@@ -52,7 +52,7 @@ void NpvWindowLogic::Form_Load() {
         showNetPresentValue();
         m_view.setGridWidened(years >= kScrollingYears);
         m_row = years > 0 ? 1 : 0;
-        m_column = kCfCost;
+        m_column = work::kCfCost;
         m_view.setCurrentCell(m_row, m_column);
         m_view.gridChanged();
     });
@@ -62,8 +62,8 @@ void NpvWindowLogic::LoadNPV_GridWithArray() {
     shell::guard(m_log, QStringLiteral(" in frmNPV.LoadNPV_GridWithArray()"), [&] {
         for (int i = 0; i < m_cashFlow.years(); ++i) {
             QStringList &row = m_grid.at(static_cast<std::size_t>(i) + 1);
-            row[kCfOperation] = m_cashFlow.operation(i);
-            for (int c = kCfCost; c < kCashFlowColumnCount; ++c) {
+            row[work::kCfOperation] = m_cashFlow.operation(i);
+            for (int c = work::kCfCost; c < work::kCashFlowColumnCount; ++c) {
                 row[c] = formatNumber(m_cashFlow.matrix(c, i), u"#0");
             }
         }
@@ -72,9 +72,10 @@ void NpvWindowLogic::LoadNPV_GridWithArray() {
 
 void NpvWindowLogic::writeComputedRow(int i) {
     QStringList &row = m_grid.at(static_cast<std::size_t>(i) + 1);
-    row[kCfTotalRevenues] = formatNumber(m_cashFlow.matrix(kCfTotalRevenues, i), u"#0");
-    row[kCfCashFlow] = formatNumber(m_cashFlow.matrix(kCfCashFlow, i), u"0");
-    row[kCfDiscountedCashFlow] = formatNumber(m_cashFlow.matrix(kCfDiscountedCashFlow, i), u"#0");
+    row[work::kCfTotalRevenues] = formatNumber(m_cashFlow.matrix(work::kCfTotalRevenues, i), u"#0");
+    row[work::kCfCashFlow] = formatNumber(m_cashFlow.matrix(work::kCfCashFlow, i), u"0");
+    row[work::kCfDiscountedCashFlow] =
+        formatNumber(m_cashFlow.matrix(work::kCfDiscountedCashFlow, i), u"#0");
 }
 
 void NpvWindowLogic::showNetPresentValue() {
@@ -95,7 +96,8 @@ void NpvWindowLogic::cmdNPV_Click() {
 }
 
 bool NpvWindowLogic::editable(int column) const {
-    return column == kCfOperation || column == kCfCost || column == kCfOtherRevenues;
+    return column == work::kCfOperation || column == work::kCfCost ||
+           column == work::kCfOtherRevenues;
 }
 
 void NpvWindowLogic::NPV_Grid_KeyPress(QChar key) {
@@ -116,7 +118,7 @@ void NpvWindowLogic::NPV_Grid_KeyPress(QChar key) {
         }
         const int i = m_row - 1;
         QString &cell = m_grid.at(static_cast<std::size_t>(m_row))[m_column];
-        if (m_column == kCfOperation) {
+        if (m_column == work::kCfOperation) {
             if (key == kBackspace) {
                 cell.chop(1);
             } else {
@@ -144,7 +146,7 @@ void NpvWindowLogic::NPV_Grid_KeyPress(QChar key) {
 
 void NpvWindowLogic::selectCell(int row, int column) {
     m_row = std::clamp(row, 0, m_cashFlow.years());
-    m_column = std::clamp(column, 0, kCashFlowColumnCount - 1);
+    m_column = std::clamp(column, 0, work::kCashFlowColumnCount - 1);
     m_view.setCurrentCell(m_row, m_column);
 }
 

@@ -60,7 +60,7 @@ std::optional<QString> replayRegime(workflow::MainWindowLogic &main,
         main.typeText(MainControl::txtByA,
                       shell::generalNumber(std::min(step, static_cast<double>(age - grownTo))));
         main.cmdGrow_Click();
-        const workflow::ProjectionTable &table = main.table();
+        const work::ProjectionTable &table = main.table();
         if (table.empty() || !table.row(table.lastRow()).isGrowth() ||
             static_cast<int>(std::nearbyint(table.row(table.lastRow()).record.age)) != age) {
             return QStringLiteral("the stand could not be grown to ") + QString::number(age) +

@@ -1,6 +1,6 @@
 #include "economics/tableregime.hpp"
 
-#include "workflow/projectiontable.hpp"
+#include "work/projectiontable.hpp"
 
 #include <QLocale>
 
@@ -38,13 +38,13 @@ QString ageList(const std::vector<int> &ages) {
 
 } // namespace
 
-std::optional<rotation::Stand> standFromTable(const workflow::ProjectionTable &table,
+std::optional<rotation::Stand> standFromTable(const work::ProjectionTable &table,
                                               std::int16_t model) {
     for (int r = 1; r <= table.lastRow(); ++r) {
-        const workflow::TableRow &row = table.row(r);
+        const work::TableRow &row = table.row(r);
         if (row.isGrowth()) {
             // The stand before any thinning of that age.
-            const workflow::RowRecord &s = row.record;
+            const work::RowRecord &s = row.record;
             return rotation::Stand{model, s.age, s.stocking + s.removedStocking, s.topHeight,
                                    s.basalArea + s.removedBasalArea};
         }
@@ -52,10 +52,10 @@ std::optional<rotation::Stand> standFromTable(const workflow::ProjectionTable &t
     return std::nullopt;
 }
 
-TableRegime regimeFromTable(const workflow::ProjectionTable &table) {
+TableRegime regimeFromTable(const work::ProjectionTable &table) {
     TableRegime t;
     for (int r = 1; r <= table.lastRow(); ++r) {
-        const workflow::TableRow &row = table.row(r);
+        const work::TableRow &row = table.row(r);
         if (row.finalCut) {
             t.finalCut = wholeAge(row.record.age);
         } else if (row.isThinning()) {

@@ -11,7 +11,7 @@
 #include <optional>
 #include <vector>
 
-namespace arbolex::workflow {
+namespace arbolex::work {
 class ProjectionTable;
 }
 
@@ -33,11 +33,11 @@ struct TableRegime {
 
 /// The stand of the table's first growth row, of model `model`; std::nullopt
 /// for a table without one.
-std::optional<rotation::Stand> standFromTable(const workflow::ProjectionTable &table,
+std::optional<rotation::Stand> standFromTable(const work::ProjectionTable &table,
                                               std::int16_t model);
 
 /// The regime of the table's thinning rows before its final cut.
-TableRegime regimeFromTable(const workflow::ProjectionTable &table);
+TableRegime regimeFromTable(const work::ProjectionTable &table);
 
 /// "40 m³/ha at 20, 25 and 30 years", or "no thinning".
 QString describeRegime(const rotation::Regime &regime, int rotation);

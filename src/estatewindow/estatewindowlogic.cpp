@@ -228,7 +228,7 @@ void EstateWindowLogic::openSubCompartment(int row) {
             return;
         }
         const auto &plan = std::get<estate::RowPlan>(planned);
-        document::SubCompartment id;
+        work::SubCompartment id;
         id.subCompartment = r.id;
         id.notes =
             QFileInfo(m_file).fileName() + QStringLiteral(", line ") + QString::number(r.line);

@@ -48,7 +48,7 @@ void MainWindowLogic::cmdThin_Click() {
             m_interactive.message(title, tt::singleRowRequired(), shell::kExclamation);
             return;
         }
-        const TableRow &row = m_table.row(last);
+        const work::TableRow &row = m_table.row(last);
         // A thinning row stands for its thinned stand: opening it again lets
         // the user change that thinning.
         if (!row.isGrowth() && !row.isThinning()) {

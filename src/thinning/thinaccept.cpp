@@ -22,7 +22,7 @@
 namespace arbolex::thinning {
 
 using shell::formatNumber;
-using workflow::Column;
+using work::Column;
 using workflow::MainControl;
 
 namespace {
@@ -35,12 +35,12 @@ QString wholeText(double value) {
 
 void ThinWindowLogic::cmdAccept_Click() {
     try {
-        workflow::ProjectionTable &table = m_main.tableForThinning();
+        work::ProjectionTable &table = m_main.tableForThinning();
         const int row = table.currentRow();
         if (row < 1) {
             return;
         }
-        const workflow::TableRow &current = table.row(row);
+        const work::TableRow &current = table.row(row);
         const ThinningWork &w = m_work;
         const bool nothingRemoved = !w.previewed || w.preBasalArea == w.postBasalArea;
         if (current.isGrowth() && !m_flags.editingExisting && nothingRemoved) {
@@ -53,7 +53,7 @@ void ThinWindowLogic::cmdAccept_Click() {
         }
         m_main.SetGrowFrom(0.0f, w.postBasalArea, w.postStocking, w.topHeight, 0.0f, -1.0f);
 
-        workflow::RowRecord record;
+        work::RowRecord record;
         record.age = current.record.age;
         record.topHeight = w.topHeight;
         record.basalArea = w.postBasalArea;
@@ -76,8 +76,8 @@ void ThinWindowLogic::cmdAccept_Click() {
             // A second Accept at the same age replaces the old thinning.
             table.row(row).record = record;
         } else {
-            workflow::TableRow thinning;
-            thinning.kind = workflow::RowKind::Thinning;
+            work::TableRow thinning;
+            thinning.kind = work::RowKind::Thinning;
             thinning.label = workflow::text::rowLabelThinning();
             thinning.record = record;
             thinRow = table.append(std::move(thinning));
@@ -101,75 +101,75 @@ void ThinWindowLogic::cmdAccept_Click() {
 
 void ThinWindowLogic::WriteThinLine(const QString &label, int row) {
     shell::guard(m_main.errorLog(), QStringLiteral(" in Misc.WriteThinLine()"), [&] {
-        workflow::ProjectionTable &table = m_main.tableForThinning();
-        workflow::TableRow &r = table.row(row);
-        const workflow::RowRecord &rec = r.record;
-        r.kind = workflow::RowKind::Thinning;
+        work::ProjectionTable &table = m_main.tableForThinning();
+        work::TableRow &r = table.row(row);
+        const work::RowRecord &rec = r.record;
+        r.kind = work::RowKind::Thinning;
         r.label = label;
         r.cells = QStringList();
-        for (int c = 0; c < workflow::kColumnCount; ++c) {
+        for (int c = 0; c < work::kColumnCount; ++c) {
             r.cells.append(QString());
         }
         QStringList &cells = r.cells;
 
         // The summary carries every thinning: its marker cell is not empty.
-        cells[workflow::kColSeparator1] = workflow::text::summaryMarker();
+        cells[work::kColSeparator1] = workflow::text::summaryMarker();
 
         // Main crop: the stand after the thinning.
-        cells[workflow::kColAge] = shell::singleText(rec.age);
-        cells[workflow::kColTopHeight] = formatNumber(rec.topHeight, u"#0.0");
-        cells[workflow::kColStocking] = wholeText(rec.stocking);
-        cells[workflow::kColDbh] = formatNumber(rec.dbh, u"##0.0");
-        cells[workflow::kColBasalArea] = formatNumber(rec.basalArea, u"##0.0");
+        cells[work::kColAge] = shell::singleText(rec.age);
+        cells[work::kColTopHeight] = formatNumber(rec.topHeight, u"#0.0");
+        cells[work::kColStocking] = wholeText(rec.stocking);
+        cells[work::kColDbh] = formatNumber(rec.dbh, u"##0.0");
+        cells[work::kColBasalArea] = formatNumber(rec.basalArea, u"##0.0");
         const double postTrees = std::nearbyint(double{rec.stocking});
-        cells[workflow::kColVolumePerTree] =
+        cells[work::kColVolumePerTree] =
             postTrees > 0.0 ? formatNumber(rec.volume / postTrees, u"#0.000") : QString();
-        cells[workflow::kColVolumePerHa] = formatNumber(rec.volume, u"###0");
+        cells[work::kColVolumePerHa] = formatNumber(rec.volume, u"###0");
 
         // The removal and its value at the price of its mean tree.
         const float removedTrees = std::fabs(rec.removedStocking);
         const float removedBasalArea = std::fabs(rec.removedBasalArea);
-        cells[workflow::kColThinStocking] = formatNumber(removedTrees, u"###0");
+        cells[work::kColThinStocking] = formatNumber(removedTrees, u"###0");
         float b = removedBasalArea;
         float n = removedTrees;
-        cells[workflow::kColThinDbh] =
+        cells[work::kColThinDbh] =
             formatNumber(workflow::truncateToTenth(workflow::dbhFromBasalArea(b, n)), u"##0.0");
-        cells[workflow::kColThinBasalArea] = formatNumber(removedBasalArea, u"##0.0");
+        cells[work::kColThinBasalArea] = formatNumber(removedBasalArea, u"##0.0");
         const double meanTree = rotation::removedMeanTree(rec.removedVolume, rec.removedStocking);
         if (rec.removedVolume <= 0.0f) {
-            cells[workflow::kColThinVolumePerTree] = workflow::text::outOfRange();
-            cells[workflow::kColThinVolumePerHa] = workflow::text::outOfRange();
+            cells[work::kColThinVolumePerTree] = workflow::text::outOfRange();
+            cells[work::kColThinVolumePerHa] = workflow::text::outOfRange();
         } else {
-            cells[workflow::kColThinVolumePerTree] = formatNumber(meanTree, u"#0.000");
-            cells[workflow::kColThinVolumePerHa] = formatNumber(rec.removedVolume, u"###0");
+            cells[work::kColThinVolumePerTree] = formatNumber(meanTree, u"#0.000");
+            cells[work::kColThinVolumePerHa] = formatNumber(rec.removedVolume, u"###0");
         }
         prices::Prices &prices = m_main.prices();
         const double price =
             prices::TrouveIndicePrix(meanTree, prices.data().current, m_interactive);
         const double valuePerHa = rec.removedVolume * price;
-        cells[workflow::kColValuePerHa] = formatNumber(valuePerHa, u"####0");
+        cells[work::kColValuePerHa] = formatNumber(valuePerHa, u"####0");
 
         // Cumulative thinning volume and value of the sub-compartment: this
         // removal and every earlier one, over the net area.
         double cumulativeVolume = 0.0;
         double cumulativeValue = 0.0;
         for (int i = 1; i <= row; ++i) {
-            const workflow::TableRow &earlier = table.row(i);
+            const work::TableRow &earlier = table.row(i);
             if (earlier.isThinning()) {
                 cumulativeVolume += earlier.record.removedVolume;
                 cumulativeValue += i == row ? valuePerHa : earlier.removedValue;
             }
         }
         const double area = m_main.netArea();
-        cells[workflow::kColThinTotalVolume] = formatNumber(cumulativeVolume * area, u"####0");
-        cells[workflow::kColThinTotalValue] = formatNumber(cumulativeValue * area, u"####0");
+        cells[work::kColThinTotalVolume] = formatNumber(cumulativeVolume * area, u"####0");
+        cells[work::kColThinTotalValue] = formatNumber(cumulativeValue * area, u"####0");
 
         // Numbers: the volume before the thinning, so the next growth row's
         // increment counts the growth since the thinning; the removal.
         r.numbers = {};
-        r.numbers[workflow::kNumAge] = rec.age;
-        r.numbers[workflow::kNumVolume] = rec.volume + rec.removedVolume;
-        r.numbers[workflow::kNumRemovedVolume] = rec.removedVolume;
+        r.numbers[work::kNumAge] = rec.age;
+        r.numbers[work::kNumVolume] = rec.volume + rec.removedVolume;
+        r.numbers[work::kNumRemovedVolume] = rec.removedVolume;
         r.removedValue = valuePerHa;
         m_main.fillTotalProduction(r, row);
         m_main.writeIncrements(row, false);
@@ -188,23 +188,23 @@ void ThinWindowLogic::WriteThinLine(const QString &label, int row) {
 
 void ThinWindowLogic::SetGrowFromAfterThin() {
     shell::guard(m_main.errorLog(), QStringLiteral(" in Misc.SetGrowFromAfterThin()"), [&] {
-        const workflow::ProjectionTable &table = m_main.table();
+        const work::ProjectionTable &table = m_main.table();
         const int row = table.currentRow();
         if (row < 1) {
             return;
         }
         const QStringList &cells = table.row(row).cells;
         workflow::IMainView &main = m_main.view();
-        main.setText(MainControl::txtFromA, cells.value(workflow::kColAge));
-        main.setText(MainControl::txtFromH, cells.value(workflow::kColTopHeight));
-        main.setText(MainControl::txtFromN, cells.value(workflow::kColStocking));
-        main.setText(MainControl::txtFromB, cells.value(workflow::kColBasalArea));
-        main.setText(MainControl::txtFromD, cells.value(workflow::kColDbh));
+        main.setText(MainControl::txtFromA, cells.value(work::kColAge));
+        main.setText(MainControl::txtFromH, cells.value(work::kColTopHeight));
+        main.setText(MainControl::txtFromN, cells.value(work::kColStocking));
+        main.setText(MainControl::txtFromB, cells.value(work::kColBasalArea));
+        main.setText(MainControl::txtFromD, cells.value(work::kColDbh));
         if (m_flags.loopUnderWay) {
             // The next grow of the loop reaches the next thinning age.
             const double frequency =
                 std::nearbyint(shell::val(m_view.text(ThinControl::txtThinFreq)));
-            const double age = shell::val(cells.value(workflow::kColAge));
+            const double age = shell::val(cells.value(work::kColAge));
             main.setText(MainControl::txtToA, formatNumber(age + frequency, u"##0"));
             main.setText(MainControl::txtByA, formatNumber(frequency, u"##0"));
         }

@@ -89,7 +89,7 @@ void ThinWindowLogic::frmThinLoad() {
         if (row < 1) {
             return;
         }
-        const workflow::RowRecord &rec = m_main.table().row(row).record;
+        const work::RowRecord &rec = m_main.table().row(row).record;
         m_view.setCaption(workflow::text::titleArbolexYeld() + QStringLiteral("      ") +
                           text::thinningAtAge() + shell::singleText(rec.age));
         // The stand before the thinning is always standing + removed, so an
@@ -112,7 +112,7 @@ void ThinWindowLogic::frmThinLoad() {
     });
 }
 
-void ThinWindowLogic::fillFromRecord(const workflow::RowRecord &rec) {
+void ThinWindowLogic::fillFromRecord(const work::RowRecord &rec) {
     m_work.postBasalArea = rec.basalArea;
     m_work.postStocking = rec.stocking;
     m_work.postVolume = rec.volume;

@@ -20,8 +20,11 @@ class AssortWindowLogic;
 
 namespace arbolex::workflow {
 class MainWindowLogic;
+}
+
+namespace arbolex::work {
 struct RowRecord;
-} // namespace arbolex::workflow
+}
 
 namespace arbolex::thinning {
 
@@ -107,7 +110,7 @@ private:
     /// removal wins), else the post field.
     float postValue(ThinControl removal, ThinControl post, float pre) const;
     void emptyResultColumns();
-    void fillFromRecord(const workflow::RowRecord &record);
+    void fillFromRecord(const work::RowRecord &record);
 
     workflow::MainWindowLogic &m_main;
     IThinView &m_view;

@@ -87,7 +87,7 @@ QString DocumentMenu::chooseFileToSave(const QString &suggestedPath) {
                                         document::text::fileFilter());
 }
 
-bool DocumentMenu::editIdentification(document::SubCompartment &id) {
+bool DocumentMenu::editIdentification(work::SubCompartment &id) {
     IdentificationDialog dialog(id, m_window);
     if (dialog.exec() != QDialog::Accepted) {
         return false;

@@ -28,7 +28,7 @@ public:
     // IDocumentDialogs
     QString chooseFileToOpen(const QString &folder) override;
     QString chooseFileToSave(const QString &suggestedPath) override;
-    bool editIdentification(document::SubCompartment &id) override;
+    bool editIdentification(work::SubCompartment &id) override;
     void recentFilesChanged(const QStringList &files) override;
 
     QMenu *recentMenu() const { return m_recent; }

@@ -656,7 +656,7 @@ void MainWindow::selectionFromLogic() {
     if (m_logic == nullptr || m_model == nullptr) {
         return;
     }
-    const workflow::ProjectionTable &table = m_logic->table();
+    const work::ProjectionTable &table = m_logic->table();
     m_followingLogic = true;
     QItemSelectionModel *selection = m_grid->selectionModel();
     const int current = table.currentRow();

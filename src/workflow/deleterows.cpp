@@ -28,11 +28,11 @@ void MainWindowLogic::cmdDeleteRows_Click() {
 
 void MainWindowLogic::AjustArraysAfterDelete(int firstDeleted) {
     if (firstDeleted <= 1) {
-        afterClear(HeaderLayout::WithMoney);
+        afterClear(work::HeaderLayout::WithMoney);
         return;
     }
     m_table.removeFrom(firstDeleted);
-    m_table.setHeaderLayout(HeaderLayout::WithMoney);
+    m_table.setHeaderLayout(work::HeaderLayout::WithMoney);
     m_states.clear();
     m_firstNew = 0;
     timberRevenueChanged();

@@ -20,7 +20,7 @@ using shell::formatNumber;
 
 int MainWindowLogic::lastStandRow() const {
     for (int r = m_table.lastRow(); r >= 1; --r) {
-        const TableRow &row = m_table.row(r);
+        const work::TableRow &row = m_table.row(r);
         if (row.isGrowth() || row.isThinning()) {
             return r;
         }
@@ -31,7 +31,7 @@ int MainWindowLogic::lastStandRow() const {
 void MainWindowLogic::timberRevenueChanged() {
     m_timberRevenue.clear();
     for (int r = 1; r <= m_table.lastRow(); ++r) {
-        const TableRow &row = m_table.row(r);
+        const work::TableRow &row = m_table.row(r);
         if (row.timberRevenue != 0.0) {
             m_timberRevenue.add(static_cast<int>(std::nearbyint(row.record.age)),
                                 row.timberRevenue);
@@ -50,7 +50,7 @@ void MainWindowLogic::cmdFinalCut_Click() {
             return;
         }
         for (int r = standRow + 1; r <= m_table.lastRow(); ++r) {
-            if (m_table.row(r).kind == RowKind::Failed) {
+            if (m_table.row(r).kind == work::RowKind::Failed) {
                 message(text::titleArbolex(), text::failedRowsBeforeFinalCut(),
                         shell::kExclamation);
                 return;
@@ -61,19 +61,19 @@ void MainWindowLogic::cmdFinalCut_Click() {
             // A thinning (or reports after it) ends the table: the final cut
             // fells the stand left by the thinning, in a row of its own at the
             // same age, so the thinning keeps its row and its revenue.
-            TableRow felled;
-            felled.kind = RowKind::Growth;
+            work::TableRow felled;
+            felled.kind = work::RowKind::Growth;
             // A copy: the append below may move every row of the table.
-            const RowRecord stand = m_table.row(standRow).record;
+            const work::RowRecord stand = m_table.row(standRow).record;
             felled.record.age = stand.age;
             felled.record.topHeight = stand.topHeight;
             felled.record.basalArea = stand.basalArea;
             felled.record.stocking = stand.stocking;
             felled.record.volume = stand.volume;
             felled.record.dbh = stand.dbh;
-            felled.numbers[kNumAge] = stand.age;
-            felled.numbers[kNumVolume] = stand.volume;
-            for (int c = 0; c < kColumnCount; ++c) {
+            felled.numbers[work::kNumAge] = stand.age;
+            felled.numbers[work::kNumVolume] = stand.volume;
+            for (int c = 0; c < work::kColumnCount; ++c) {
                 felled.cells.append(QString());
             }
             R = m_table.append(std::move(felled));
@@ -82,37 +82,38 @@ void MainWindowLogic::cmdFinalCut_Click() {
             m_standingVolume = stand.volume;
         }
 
-        TableRow &row = m_table.row(R);
+        work::TableRow &row = m_table.row(R);
         QStringList &cells = row.cells;
         row.finalCut = true;
         row.label = text::rowLabelFinalCut();
         const double area = netArea();
-        cells[kColSeparator1] = text::summaryMarker();
+        cells[work::kColSeparator1] = text::summaryMarker();
         // The standing crop becomes the removal.
-        for (int c = kColStocking; c <= kColVolumePerHa; ++c) {
-            if (c == kColVolumePerHa) {
+        for (int c = work::kColStocking; c <= work::kColVolumePerHa; ++c) {
+            if (c == work::kColVolumePerHa) {
                 cells[c] = formatNumber(m_standingVolume, u"0.0");
             }
             cells[c + 6] = cells[c];
         }
         // The trees and the mean tree as the row shows them (format, then read).
-        const double trees = std::nearbyint(shell::val(cells[kColStocking]));
+        const double trees = std::nearbyint(shell::val(cells[work::kColStocking]));
         const double volumePerTree =
             rotation::felledMeanTree(row.record.volume, row.record.stocking);
         const auto index =
             static_cast<std::size_t>(prices::priceClassOf(volumePerTree, m_interactive));
         const double price = m_prices.pricesInUse().at(index);
-        cells[kColValuePerHa] = formatNumber(m_standingVolume * price, u"0");
+        cells[work::kColValuePerHa] = formatNumber(m_standingVolume * price, u"0");
         row.removedValue = m_standingVolume * price;
-        row.numbers[kNumRemovedVolume] = m_standingVolume;
+        row.numbers[work::kNumRemovedVolume] = m_standingVolume;
         row.timberRevenue = m_standingVolume * m_prices.data().longTermAverage.at(index);
         timberRevenueChanged();
-        cells[kColThinTotalVolume] = formatNumber(trees * volumePerTree * area, u"##0");
-        cells[kColThinTotalValue] = formatNumber(trees * volumePerTree * price * area, u"##0");
-        cells[kColSeparator2].clear();
+        cells[work::kColThinTotalVolume] = formatNumber(trees * volumePerTree * area, u"##0");
+        cells[work::kColThinTotalValue] =
+            formatNumber(trees * volumePerTree * price * area, u"##0");
+        cells[work::kColSeparator2].clear();
         // The crop is gone: its total-production cells read 0; the summary
         // keeps the rotation's totals.
-        for (int c = kColTotStocking; c <= kColTotVolume; ++c) {
+        for (int c = work::kColTotStocking; c <= work::kColTotVolume; ++c) {
             cells[c] = QStringLiteral("0");
         }
 
@@ -132,8 +133,8 @@ void MainWindowLogic::cmdFinalCut_Click() {
         if (m_interactive.askYesNo(text::titleNpv(), text::npvOffer())) {
             m_view.setEnabled(MainControl::cmdNPV, true);
             m_cashFlow.SetRotationLength(
-                static_cast<int>(std::nearbyint(m_table.row(1).numbers[kNumAge])),
-                static_cast<int>(std::nearbyint(row.numbers[kNumAge])));
+                static_cast<int>(std::nearbyint(m_table.row(1).numbers[work::kNumAge])),
+                static_cast<int>(std::nearbyint(row.numbers[work::kNumAge])));
             m_cashFlow.DimNPVArrays();
         }
     });

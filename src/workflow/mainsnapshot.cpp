@@ -60,15 +60,15 @@ void MainWindowLogic::restoreCashFlow(const MainSnapshot &s) {
     m_cashFlow.SetRotationLength(s.cashFlowFirstYear, s.cashFlowFirstYear + years - 1);
     m_cashFlow.DimNPVArrays();
     for (int i = 0; i < years; ++i) {
-        const economics::CashFlowRecord &r = s.cashFlow.at(static_cast<std::size_t>(i));
+        const work::CashFlowRecord &r = s.cashFlow.at(static_cast<std::size_t>(i));
         m_cashFlow.setOperation(i, r.operation);
-        m_cashFlow.setMatrix(economics::kCfYear, i, r.year);
-        m_cashFlow.setMatrix(economics::kCfCost, i, r.cost);
-        m_cashFlow.setMatrix(economics::kCfTimberRevenue, i, r.timberRevenue);
-        m_cashFlow.setMatrix(economics::kCfOtherRevenues, i, r.otherRevenues);
-        m_cashFlow.setMatrix(economics::kCfTotalRevenues, i, r.totalRevenues);
-        m_cashFlow.setMatrix(economics::kCfCashFlow, i, r.cashFlow);
-        m_cashFlow.setMatrix(economics::kCfDiscountedCashFlow, i, r.discountedCashFlow);
+        m_cashFlow.setMatrix(work::kCfYear, i, r.year);
+        m_cashFlow.setMatrix(work::kCfCost, i, r.cost);
+        m_cashFlow.setMatrix(work::kCfTimberRevenue, i, r.timberRevenue);
+        m_cashFlow.setMatrix(work::kCfOtherRevenues, i, r.otherRevenues);
+        m_cashFlow.setMatrix(work::kCfTotalRevenues, i, r.totalRevenues);
+        m_cashFlow.setMatrix(work::kCfCashFlow, i, r.cashFlow);
+        m_cashFlow.setMatrix(work::kCfDiscountedCashFlow, i, r.discountedCashFlow);
     }
 }
 
@@ -78,7 +78,7 @@ void MainWindowLogic::restore(const MainSnapshot &s) {
         mnuModel_Click(s.modelId);
         afterClear(s.layout);
         m_identification = s.identification;
-        for (const TableRow &row : s.rows) {
+        for (const work::TableRow &row : s.rows) {
             m_table.append(row);
         }
         m_table.select(s.currentRow, s.selectionEnd);
@@ -98,7 +98,7 @@ void MainWindowLogic::restore(const MainSnapshot &s) {
         m_prices.restoreInUse(s.priceSetInUse, s.pricesInUse);
 
         bool thinned = false;
-        for (const TableRow &row : s.rows) {
+        for (const work::TableRow &row : s.rows) {
             thinned = thinned || row.isThinning();
         }
         if (m_thinning != nullptr) {

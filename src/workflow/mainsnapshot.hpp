@@ -1,10 +1,10 @@
 #pragma once
 
-#include "document/subcompartment.hpp"
-#include "economics/mdlnpv.hpp"
 #include "rotation/priceclasses.hpp"
+#include "work/mdlnpv.hpp"
+#include "work/projectiontable.hpp"
+#include "work/subcompartment.hpp"
 #include "workflow/maincontrols.hpp"
-#include "workflow/projectiontable.hpp"
 
 #include <QString>
 
@@ -23,7 +23,7 @@ inline constexpr std::array<MainControl, 8> kSnapshotFields{
 /// exactly where it stood: taken by MainWindowLogic::snapshot(), put back by
 /// MainWindowLogic::restore() without recomputing anything.
 struct MainSnapshot {
-    document::SubCompartment identification;
+    work::SubCompartment identification;
     /// Model identifier 0 to 21.
     int modelId = 0;
     /// Texts of kSnapshotFields, in that order.
@@ -32,8 +32,8 @@ struct MainSnapshot {
     QString siteIndexText;
     float siteIndex = 0.0f;
 
-    HeaderLayout layout = HeaderLayout::WithMoney;
-    std::vector<TableRow> rows;
+    work::HeaderLayout layout = work::HeaderLayout::WithMoney;
+    std::vector<work::TableRow> rows;
     int currentRow = 0;
     int selectionEnd = 0;
     /// Volume per ha of the last growth row, m³/ha.
@@ -42,7 +42,7 @@ struct MainSnapshot {
 
     /// The cash flow year by year (empty when none is laid out) and its first year.
     int cashFlowFirstYear = 0;
-    std::vector<economics::CashFlowRecord> cashFlow;
+    std::vector<work::CashFlowRecord> cashFlow;
     /// Interest rate, percent.
     double interestRate = 0.0;
 

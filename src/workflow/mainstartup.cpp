@@ -44,7 +44,7 @@ void MainWindowLogic::Form_Load(QSettings &settings, const QRect &screen) {
     shell::guard(m_log, QStringLiteral(" in frmMain.Load()"), [&] {
         m_view.setPlacement(shell::readMainPlacement(settings, screen));
         m_cashFlow.setInterestRate(shell::readInterestRate(settings));
-        afterClear(HeaderLayout::WithMoney);
+        afterClear(work::HeaderLayout::WithMoney);
         shell::StartupValues stored;
         shell::readStartupFile(m_dataFolder, stored, m_log);
         mnuModel_Click(stored.modelIndex);
@@ -134,7 +134,7 @@ void MainWindowLogic::mnuModel_Click(int index) {
         m_grow.GetVCF();
         m_cashFlow.reset();
         m_view.setEnabled(MainControl::cmdNPV, false);
-        m_table.setHeaderLayout(HeaderLayout::WithMoney);
+        m_table.setHeaderLayout(work::HeaderLayout::WithMoney);
         m_view.tableChanged(1);
         updateCaption();
         m_view.setActiveModel(m_grow.modelId());

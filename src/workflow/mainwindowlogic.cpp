@@ -62,21 +62,21 @@ bool MainWindowLogic::changeCheck() const {
     if (m_table.rowCount() <= 1) {
         return false;
     }
-    const TableRow &row = m_table.row(std::max(m_table.currentRow(), 1));
-    return field(MainControl::txtFromA) != row.cells.value(kColAge) ||
-           field(MainControl::txtFromH) != row.cells.value(kColTopHeight) ||
-           field(MainControl::txtFromN) != row.cells.value(kColStocking) ||
-           field(MainControl::txtFromB) != row.cells.value(kColBasalArea);
+    const work::TableRow &row = m_table.row(std::max(m_table.currentRow(), 1));
+    return field(MainControl::txtFromA) != row.cells.value(work::kColAge) ||
+           field(MainControl::txtFromH) != row.cells.value(work::kColTopHeight) ||
+           field(MainControl::txtFromN) != row.cells.value(work::kColStocking) ||
+           field(MainControl::txtFromB) != row.cells.value(work::kColBasalArea);
 }
 
 void MainWindowLogic::copyRowToFields(int row) {
-    const TableRow &r = m_table.row(row);
-    m_view.setText(MainControl::txtFromA, r.cells.value(kColAge));
-    m_view.setText(MainControl::txtFromH, r.cells.value(kColTopHeight));
-    m_view.setText(MainControl::txtFromN, r.cells.value(kColStocking));
-    m_view.setText(MainControl::txtFromB, r.cells.value(kColBasalArea));
+    const work::TableRow &r = m_table.row(row);
+    m_view.setText(MainControl::txtFromA, r.cells.value(work::kColAge));
+    m_view.setText(MainControl::txtFromH, r.cells.value(work::kColTopHeight));
+    m_view.setText(MainControl::txtFromN, r.cells.value(work::kColStocking));
+    m_view.setText(MainControl::txtFromB, r.cells.value(work::kColBasalArea));
     // The diameter follows the row too, so the pair never disagrees.
-    m_view.setText(MainControl::txtFromD, r.cells.value(kColDbh));
+    m_view.setText(MainControl::txtFromD, r.cells.value(work::kColDbh));
 }
 
 void MainWindowLogic::restoreFromRow() {
@@ -91,7 +91,7 @@ bool MainWindowLogic::continuesFromRow(int row) const {
     if (row < 1 || row > m_table.lastRow()) {
         return false;
     }
-    const TableRow &r = m_table.row(row);
+    const work::TableRow &r = m_table.row(row);
     return (r.isGrowth() || r.isThinning()) && !changeCheck();
 }
 
@@ -118,7 +118,7 @@ void MainWindowLogic::cmdGrow_Click() {
         GrowFrom g = GetGrowFrom();
         const int fromRow = std::max(m_table.currentRow(), 1);
         if (continuesFromRow(fromRow)) {
-            const RowRecord &rec = m_table.row(fromRow).record;
+            const work::RowRecord &rec = m_table.row(fromRow).record;
             g.age = rec.age;
             g.topHeight = rec.topHeight;
             g.stocking = rec.stocking;
@@ -138,7 +138,8 @@ void MainWindowLogic::cmdGrow_Click() {
             m_table.row(m_table.lastRow()).record.age == m_states.front().age) {
             m_firstNew = 1;
         }
-        AppendGrid(projected ? RowKind::Growth : RowKind::Failed, text::rowLabelGrowth());
+        AppendGrid(projected ? work::RowKind::Growth : work::RowKind::Failed,
+                   text::rowLabelGrowth());
         if (!projected) {
             message(text::titleOstran(), text::projectionFailed(), shell::kExclamationOkCancel);
         }
@@ -160,7 +161,7 @@ void MainWindowLogic::cmdGrow_Click() {
     });
 }
 
-void MainWindowLogic::afterClear(HeaderLayout layout) {
+void MainWindowLogic::afterClear(work::HeaderLayout layout) {
     m_table.clear(layout);
     m_states.clear();
     m_firstNew = 0;
@@ -191,7 +192,7 @@ void MainWindowLogic::afterClear(HeaderLayout layout) {
 
 void MainWindowLogic::cmdClear_Click() {
     try {
-        afterClear(HeaderLayout::WithMoney);
+        afterClear(work::HeaderLayout::WithMoney);
     } catch (const shell::AppFault &fault) {
         m_log.append(QStringLiteral("Error ") + fault.error.description +
                      QStringLiteral(" in procedure cmdClear_Click of Feuille frmMain"));
@@ -200,13 +201,13 @@ void MainWindowLogic::cmdClear_Click() {
 
 void MainWindowLogic::ClearAll() {
     shell::guard(m_log, QStringLiteral(" in frmMain.ClearAll()"),
-                 [&] { afterClear(HeaderLayout::WithoutMoney); });
+                 [&] { afterClear(work::HeaderLayout::WithoutMoney); });
 }
 
 void MainWindowLogic::UseFlxRow() {
     const int row = m_table.currentRow();
     if (row < 1 || row > m_table.lastRow() || m_table.row(row).isText() ||
-        m_table.row(row).kind == RowKind::Failed) {
+        m_table.row(row).kind == work::RowKind::Failed) {
         message(text::titleArbolex(), text::transferFailed(), shell::kExclamation);
         return;
     }

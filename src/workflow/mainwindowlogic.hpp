@@ -6,12 +6,12 @@
 // IMainView and asks the user only through IInteractive, so its handlers can
 // call one another with no person at the keyboard.
 
-#include "economics/mdlnpv.hpp"
-#include "economics/timberrevenue.hpp"
 #include "engine/grow.hpp"
+#include "work/mdlnpv.hpp"
+#include "work/projectiontable.hpp"
+#include "work/timberrevenue.hpp"
 #include "workflow/imainview.hpp"
 #include "workflow/mainsnapshot.hpp"
-#include "workflow/projectiontable.hpp"
 
 #include <QString>
 
@@ -114,7 +114,7 @@ public:
     /// True once the final cut has ended the rotation.
     bool felled() const { return m_felled; }
     /// The summary as last filled: its rows, in the projection table's shape.
-    const std::vector<TableRow> &summaryRows() const { return m_summary; }
+    const std::vector<work::TableRow> &summaryRows() const { return m_summary; }
     /// Index in summaryRows() of the first row of the rotation's totals.
     int summaryTotalsFrom() const { return m_summaryTotalsFrom; }
     /// The summary as shown: captions first, then its rows.
@@ -152,11 +152,11 @@ public:
 
     /// Appends one row per newly projected state (m_states[m_firstNew..]) of
     /// `kind`, then refreshes the yield class.
-    void AppendGrid(RowKind kind, const QString &label);
-    const ProjectionTable &table() const { return m_table; }
+    void AppendGrid(work::RowKind kind, const QString &label);
+    const work::ProjectionTable &table() const { return m_table; }
     /// Writes the total-production cells of row `rowIndex`: its stand plus
     /// every removal so far (growth and thinning rows alike).
-    void fillTotalProduction(TableRow &row, int rowIndex) const;
+    void fillTotalProduction(work::TableRow &row, int rowIndex) const;
     /// Writes the increments of row `rowIndex`: the mean annual increment,
     /// and the current one from the row before when `currentIncrement`.
     void writeIncrements(int rowIndex, bool currentIncrement);
@@ -189,15 +189,15 @@ public:
     void reloadDataFiles();
 
     /// The table as the thinning rows change it.
-    ProjectionTable &tableForThinning() { return m_table; }
+    work::ProjectionTable &tableForThinning() { return m_table; }
     /// Tells the window that rows from `firstRow` on changed, and makes the
     /// thinned stand the standing crop.
     void thinningWritten(int firstRow, double standingVolume);
-    const economics::TimberRevenue &timberRevenue() const { return m_timberRevenue; }
+    const work::TimberRevenue &timberRevenue() const { return m_timberRevenue; }
     /// Rebuilds the timber revenue by year from the rows' own revenues.
     void timberRevenueChanged();
     /// The cash flow of the rotation (module `mdlNPV`).
-    economics::CashFlow &cashFlow() { return m_cashFlow; }
+    work::CashFlow &cashFlow() { return m_cashFlow; }
     /// The net area of the sub-compartment, ha (0 when empty).
     double netArea() const;
 
@@ -213,8 +213,8 @@ public:
     const QString &documentName() const { return m_documentName; }
     bool documentModified() const { return m_modified; }
     /// The identification that heads every report of the sub-compartment.
-    const document::SubCompartment &identification() const { return m_identification; }
-    void setIdentification(const document::SubCompartment &id) { m_identification = id; }
+    const work::SubCompartment &identification() const { return m_identification; }
+    void setIdentification(const work::SubCompartment &id) { m_identification = id; }
 
     engine::Grow &grow() { return m_grow; }
     prices::Prices &prices() { return m_prices; }
@@ -233,12 +233,12 @@ private:
     bool changeCheck() const;
     void restoreFromRow();
     void copyRowToFields(int row);
-    void afterClear(HeaderLayout layout);
+    void afterClear(work::HeaderLayout layout);
     void updateCaption();
     /// The price lists, categories and assortment prices from the data folder.
     void readPriceFiles();
     void updateYieldClassLabel();
-    void buildGrowthCells(TableRow &row, int rowIndex) const;
+    void buildGrowthCells(work::TableRow &row, int rowIndex) const;
     bool continuesFromRow(int row) const;
     float thresholdBasalArea();
     /// The last row that holds a stand (growth or thinning), 0 when none.
@@ -256,7 +256,7 @@ private:
     IMainView &m_view;
     shell::IInteractive &m_interactive;
 
-    ProjectionTable m_table;
+    work::ProjectionTable m_table;
     /// The states of the last projection and the first of them to append.
     std::vector<engine::StandState> m_states;
     std::size_t m_firstNew = 0;
@@ -268,15 +268,15 @@ private:
     economics::TimberPricesWindowLogic *m_timberPrices = nullptr;
     assortments::AssortWindowLogic *m_assort = nullptr;
     const shell::DataHistory *m_dataHistory = nullptr;
-    economics::TimberRevenue m_timberRevenue;
-    economics::CashFlow m_cashFlow;
+    work::TimberRevenue m_timberRevenue;
+    work::CashFlow m_cashFlow;
     /// Set by the final cut; no growing or thinning until rows are cleared or deleted.
     bool m_felled = false;
-    std::vector<TableRow> m_summary;
+    std::vector<work::TableRow> m_summary;
     /// Index in m_summary of the first row of the rotation's totals.
     int m_summaryTotalsFrom = 0;
     bool m_showingSummary = false;
-    document::SubCompartment m_identification;
+    work::SubCompartment m_identification;
     /// Name of the open document ("" before any) and its unsaved changes.
     QString m_documentName;
     bool m_modified = false;

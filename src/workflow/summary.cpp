@@ -13,11 +13,11 @@ using shell::formatNumber;
 namespace {
 
 /// A summary row with `label` and no cell filled yet.
-TableRow totalsRow(const QString &label) {
-    TableRow row;
-    row.kind = RowKind::Text;
+work::TableRow totalsRow(const QString &label) {
+    work::TableRow row;
+    row.kind = work::RowKind::Text;
     row.label = label;
-    for (int c = 0; c < kColumnCount; ++c) {
+    for (int c = 0; c < work::kColumnCount; ++c) {
         row.cells.append(QString());
     }
     return row;
@@ -42,7 +42,7 @@ bool MainWindowLogic::FillSummary() {
         // Assortment rows go with the stand row they follow.
         bool standCopied = false;
         for (int r = 1; r <= m_table.lastRow(); ++r) {
-            const TableRow &source = m_table.row(r);
+            const work::TableRow &source = m_table.row(r);
             if (source.isThinning()) {
                 thinnedVolume += source.record.removedVolume;
                 thinnedValue += source.removedValue;
@@ -53,11 +53,11 @@ bool MainWindowLogic::FillSummary() {
                 }
                 continue;
             }
-            standCopied = !source.cells.value(kColSeparator1).isEmpty();
+            standCopied = !source.cells.value(work::kColSeparator1).isEmpty();
             if (!standCopied) {
                 continue;
             }
-            TableRow copy = source;
+            work::TableRow copy = source;
             copy.label = source.finalCut       ? text::summaryFinalCut()
                          : source.isThinning() ? text::summaryThinning()
                                                : text::summaryStart();
@@ -73,39 +73,41 @@ bool MainWindowLogic::FillSummary() {
         const int last = lastStandRow();
         const double area = netArea();
         if (last > 0) {
-            const TableRow &end = m_table.row(last);
-            const double finalVolume = end.finalCut ? end.numbers[kNumRemovedVolume] : 0.0;
+            const work::TableRow &end = m_table.row(last);
+            const double finalVolume = end.finalCut ? end.numbers[work::kNumRemovedVolume] : 0.0;
             const double standing = end.finalCut ? 0.0 : end.record.volume;
             const double production = thinnedVolume + finalVolume + standing;
-            TableRow total = totalsRow(text::summaryTotalProduction());
-            total.cells[kColAge] = end.cells.value(kColAge);
-            total.cells[kColTotVolumePerHa] = formatNumber(production, u"###0");
-            total.cells[kColTotVolume] = formatNumber(production * area, u"##0");
+            work::TableRow total = totalsRow(text::summaryTotalProduction());
+            total.cells[work::kColAge] = end.cells.value(work::kColAge);
+            total.cells[work::kColTotVolumePerHa] = formatNumber(production, u"###0");
+            total.cells[work::kColTotVolume] = formatNumber(production * area, u"##0");
             m_summary.push_back(std::move(total));
         }
-        TableRow thinned = totalsRow(text::summaryTotalThinned());
-        thinned.cells[kColThinVolumePerHa] = formatNumber(thinnedVolume, u"###0");
-        thinned.cells[kColValuePerHa] = formatNumber(thinnedValue, u"0");
-        thinned.cells[kColThinTotalVolume] = formatNumber(thinnedVolume * area, u"##0");
-        thinned.cells[kColThinTotalValue] = formatNumber(thinnedValue * area, u"##0");
+        work::TableRow thinned = totalsRow(text::summaryTotalThinned());
+        thinned.cells[work::kColThinVolumePerHa] = formatNumber(thinnedVolume, u"###0");
+        thinned.cells[work::kColValuePerHa] = formatNumber(thinnedValue, u"0");
+        thinned.cells[work::kColThinTotalVolume] = formatNumber(thinnedVolume * area, u"##0");
+        thinned.cells[work::kColThinTotalValue] = formatNumber(thinnedValue * area, u"##0");
         m_summary.push_back(std::move(thinned));
 
         int maiRow = 0;
         for (int r = 1; r <= m_table.lastRow(); ++r) {
-            const TableRow &row = m_table.row(r);
+            const work::TableRow &row = m_table.row(r);
             if ((row.isGrowth() || row.isThinning()) &&
-                (maiRow == 0 || row.numbers[kNumMai] > m_table.row(maiRow).numbers[kNumMai])) {
+                (maiRow == 0 ||
+                 row.numbers[work::kNumMai] > m_table.row(maiRow).numbers[work::kNumMai])) {
                 maiRow = r;
             }
         }
         if (maiRow > 0) {
-            TableRow mai = totalsRow(text::summaryMaximumMai());
-            mai.cells[kColAge] = m_table.row(maiRow).cells.value(kColAge);
-            mai.cells[kColMai] = formatNumber(m_table.row(maiRow).numbers[kNumMai], u"#0.0");
+            work::TableRow mai = totalsRow(text::summaryMaximumMai());
+            mai.cells[work::kColAge] = m_table.row(maiRow).cells.value(work::kColAge);
+            mai.cells[work::kColMai] =
+                formatNumber(m_table.row(maiRow).numbers[work::kNumMai], u"#0.0");
             m_summary.push_back(std::move(mai));
         }
-        TableRow yc = totalsRow(text::summaryYieldClass());
-        yc.cells[kColMai] = QString::number(yieldClass());
+        work::TableRow yc = totalsRow(text::summaryYieldClass());
+        yc.cells[work::kColMai] = QString::number(yieldClass());
         m_summary.push_back(std::move(yc));
         filled = true;
     });
@@ -117,24 +119,24 @@ namespace {
 /// What a rotation is read by: the stand, the removals and their value, total
 /// production and the mean annual increment.
 const std::vector<int> &summaryColumns() {
-    static const std::vector<int> columns = {kColAge,
-                                             kColTopHeight,
-                                             kColStocking,
-                                             kColDbh,
-                                             kColBasalArea,
-                                             kColVolumePerTree,
-                                             kColVolumePerHa,
-                                             kColThinStocking,
-                                             kColThinDbh,
-                                             kColThinBasalArea,
-                                             kColThinVolumePerTree,
-                                             kColThinVolumePerHa,
-                                             kColValuePerHa,
-                                             kColThinTotalVolume,
-                                             kColThinTotalValue,
-                                             kColTotVolumePerHa,
-                                             kColTotVolume,
-                                             kColMai};
+    static const std::vector<int> columns = {work::kColAge,
+                                             work::kColTopHeight,
+                                             work::kColStocking,
+                                             work::kColDbh,
+                                             work::kColBasalArea,
+                                             work::kColVolumePerTree,
+                                             work::kColVolumePerHa,
+                                             work::kColThinStocking,
+                                             work::kColThinDbh,
+                                             work::kColThinBasalArea,
+                                             work::kColThinVolumePerTree,
+                                             work::kColThinVolumePerHa,
+                                             work::kColValuePerHa,
+                                             work::kColThinTotalVolume,
+                                             work::kColThinTotalValue,
+                                             work::kColTotVolumePerHa,
+                                             work::kColTotVolume,
+                                             work::kColMai};
     return columns;
 }
 } // namespace

@@ -32,7 +32,7 @@ protected:
         QStringList labels;
         bool after = false;
         for (int r = 1; r <= logic.table().lastRow(); ++r) {
-            const workflow::TableRow &row = logic.table().row(r);
+            const work::TableRow &row = logic.table().row(r);
             if (after) {
                 labels << row.label;
             }

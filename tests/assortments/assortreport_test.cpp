@@ -11,6 +11,7 @@ namespace arbolex::testing {
 namespace {
 
 using namespace workflow;
+using namespace work;
 namespace at = assortments::text;
 
 double shown(const assortments::HeadlessAssortView &v, AssortControl c) {

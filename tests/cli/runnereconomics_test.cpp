@@ -42,9 +42,9 @@ TEST_F(RunnerEconomicsTest, OptimiseApplyTheBestAndPrintTheFigures) {
     ASSERT_NE(best, lines.end()) << output.toStdString();
     const QString rotation = best->split(QLatin1Char('\t')).value(5);
     // The table now ends with the best regime's final cut.
-    const workflow::ProjectionTable &table = session.main().table();
+    const work::ProjectionTable &table = session.main().table();
     EXPECT_TRUE(session.main().felled());
-    EXPECT_EQ(table.row(table.lastRow()).cells.value(workflow::kColAge), rotation);
+    EXPECT_EQ(table.row(table.lastRow()).cells.value(work::kColAge), rotation);
     EXPECT_TRUE(lines.contains(QStringLiteral("lblRotation\t") + rotation +
                                QStringLiteral(" years (the final cut of the table)")))
         << output.toStdString();

@@ -58,11 +58,11 @@ TEST_F(RunnerRotationTest, NetPresentValueAtTwoRatesAndWithAFirstYearCost) {
          QStringLiteral("print frmNPV.txtNPV"), QStringLiteral("set frmNPV.NPV_Grid(1,2) 1000"),
          QStringLiteral("press frmNPV.cmdNPV"), QStringLiteral("print frmNPV.txtNPV")});
     ASSERT_EQ(shown.size(), 3) << output.toStdString();
-    const economics::CashFlow &flow = session.main().cashFlow();
+    const work::CashFlow &flow = session.main().cashFlow();
     // At 0 % the net present value is the sum of the timber revenues.
     double revenue = 0.0;
     for (int i = 0; i < flow.years(); ++i) {
-        revenue += flow.matrix(economics::kCfTimberRevenue, i);
+        revenue += flow.matrix(work::kCfTimberRevenue, i);
     }
     EXPECT_EQ(shown[1], shell::formatNumber(revenue, u"#0"));
     EXPECT_EQ(shell::val(shown[1]) - shell::val(shown[2]), 1000.0);

@@ -50,7 +50,7 @@ TEST_F(DocumentTest, OpeningContinuesExactlyAsWithoutTheSave) {
     first->run(QLatin1String(kGrownAndThinned));
     const document::Document saved = first->work();
     bool kinds[3] = {false, false, false};
-    for (const workflow::TableRow &row : saved.rows) {
+    for (const work::TableRow &row : saved.rows) {
         kinds[static_cast<int>(row.kind)] = true;
     }
     ASSERT_TRUE(kinds[0] && kinds[1] && kinds[2]) << "growth, thinning and assortment rows";
@@ -96,17 +96,17 @@ TEST_F(DocumentTest, FileOpensWithItsFormatAndVersion) {
 TEST_F(DocumentTest, ANumberJsonCannotHoldComesBack) {
     // A failed projection's row may hold what no JSON number can.
     document::Document d;
-    workflow::TableRow row;
-    row.kind = workflow::RowKind::Failed;
-    row.cells = QStringList(workflow::kColumnCount, QString());
+    work::TableRow row;
+    row.kind = work::RowKind::Failed;
+    row.cells = QStringList(work::kColumnCount, QString());
     row.record.volume = std::numeric_limits<float>::infinity();
-    row.numbers[workflow::kNumCai] = std::numeric_limits<double>::quiet_NaN();
+    row.numbers[work::kNumCai] = std::numeric_limits<double>::quiet_NaN();
     d.rows.push_back(row);
     QString reason;
     const auto read = document::documentFromJson(document::documentToJson(d), reason);
     ASSERT_TRUE(read) << reason.toStdString();
     EXPECT_TRUE(std::isinf(read->rows.at(0).record.volume));
-    EXPECT_TRUE(std::isnan(read->rows.at(0).numbers[workflow::kNumCai]));
+    EXPECT_TRUE(std::isnan(read->rows.at(0).numbers[work::kNumCai]));
 }
 
 TEST_F(DocumentTest, DocumentForAStandGrowsLikeTypedFields) {

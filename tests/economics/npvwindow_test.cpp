@@ -6,10 +6,10 @@
 
 #include "shell/vbformat.hpp"
 
-#include "economics/mdlnpv.hpp"
 #include "economics/npvmessages.hpp"
 #include "economics/npvwindowlogic.hpp"
 #include "shell/iclipboard.hpp"
+#include "work/mdlnpv.hpp"
 
 #include <QFile>
 
@@ -20,6 +20,7 @@ namespace {
 
 using economics::NpvControl;
 using namespace economics;
+using namespace work;
 
 /// A clipboard that refuses everything.
 class RefusingClipboard : public shell::IClipboard {

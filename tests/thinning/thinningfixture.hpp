@@ -37,7 +37,7 @@ protected:
     void typeThin(ThinControl c, const QString &text) { thin.typeText(c, text); }
     float number(ThinControl c) const { return static_cast<float>(shell::val(thinView.text(c))); }
 
-    const workflow::TableRow &lastRow() const { return logic.table().row(logic.table().lastRow()); }
+    const work::TableRow &lastRow() const { return logic.table().row(logic.table().lastRow()); }
 
     thinning::HeadlessThinView thinView;
     thinning::ThinWindowLogic thin{logic, thinView, interactive};

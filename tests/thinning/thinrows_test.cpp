@@ -10,6 +10,7 @@ namespace arbolex::testing {
 namespace {
 
 using namespace workflow;
+using namespace work;
 
 TEST_F(ThinningTest, AcceptWithNothingRemovedStoresNothing) {
     openThinning();

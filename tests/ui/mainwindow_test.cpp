@@ -18,7 +18,7 @@
 namespace arbolex::testing {
 namespace {
 
-using workflow::ProjectionTable;
+using work::ProjectionTable;
 
 void click(QWidget *button) {
     qobject_cast<QPushButton *>(button)->click();
@@ -123,16 +123,16 @@ TEST_F(MainWindowGuiTest, GridSelectionGoesToTheLogicAndUseRowContinuesFromIt) {
 TEST_F(MainWindowGuiTest, ClearAllAndClearSwitchTheHeaderLayout) {
     click(window.control(MainControl::cmdGrow));
     const ui::ProjectionModel &model = *window.gridModel();
-    ASSERT_EQ(model.columnCount(), workflow::kColumnCount);
+    ASSERT_EQ(model.columnCount(), work::kColumnCount);
 
     click(window.control(MainControl::cmdClearAll));
     EXPECT_EQ(model.rowCount(), 0);
-    EXPECT_EQ(model.columnCount(), workflow::kColumnCount - 1); // no money column
+    EXPECT_EQ(model.columnCount(), work::kColumnCount - 1); // no money column
     EXPECT_EQ(model.headerData(13, Qt::Horizontal).toString(), QStringLiteral("Tot Vol "));
     EXPECT_EQ(model.headerData(14, Qt::Horizontal).toString(), QStringLiteral("Tot Val"));
 
     click(window.control(MainControl::cmdClear));
-    EXPECT_EQ(model.columnCount(), workflow::kColumnCount);
+    EXPECT_EQ(model.columnCount(), work::kColumnCount);
     EXPECT_EQ(model.headerData(13, Qt::Horizontal).toString(), QStringLiteral(" \u20ac / ha"));
 }
 

@@ -102,8 +102,8 @@ TEST_F(ThinWindowGuiTest, OpensCentredOverTheMainWindowWithTheStandBeforeThinnin
     const QPoint offset = thinWindow.frameGeometry().center() - window.frameGeometry().center();
     EXPECT_LE(offset.manhattanLength(), 2);
 
-    const workflow::TableRow &last = logic.table().row(logic.table().lastRow());
-    EXPECT_EQ(thinWindow.text(ThinControl::lblPreN), last.cells[workflow::kColStocking]);
+    const work::TableRow &last = logic.table().row(logic.table().lastRow());
+    EXPECT_EQ(thinWindow.text(ThinControl::lblPreN), last.cells[work::kColStocking]);
     EXPECT_NEAR(number(ThinControl::lblPreV), last.record.volume, 0.01);
     EXPECT_TRUE(thinWindow.text(ThinControl::txtRemV).isEmpty());
     EXPECT_FALSE(thinControl(ThinControl::cmdAccept)->isEnabled()); // nothing previewed yet

@@ -11,6 +11,7 @@ namespace arbolex::testing {
 namespace {
 
 using namespace workflow;
+using namespace work;
 
 TEST_F(MainWindowTest, GrowAppendsOneGrowthRowPerStep) {
     typeStand();

@@ -14,6 +14,7 @@ namespace arbolex::testing {
 namespace {
 
 using namespace workflow;
+using namespace work;
 
 const QRect kScreen(0, 0, 1920, 1080);
 

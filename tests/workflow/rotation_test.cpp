@@ -12,6 +12,7 @@ namespace arbolex::testing {
 namespace {
 
 using namespace workflow;
+using namespace work;
 
 /// A Sitka spruce stand (age 15, 2500 stems/ha, 9 m, 22 m²/ha, 10 ha)
 /// grown to 30, thinned by 50 m³/ha and grown on to 60 by 5.

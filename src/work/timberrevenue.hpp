@@ -2,7 +2,7 @@
 
 #include <map>
 
-namespace arbolex::economics {
+namespace arbolex::work {
 
 /// Timber revenue of the sub-compartment by year of the projection, euro per
 /// hectare: what the thinnings and the final cut earn at long-term average
@@ -24,4 +24,4 @@ private:
     std::map<int, double> m_byAge;
 };
 
-} // namespace arbolex::economics
+} // namespace arbolex::work

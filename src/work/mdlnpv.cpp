@@ -1,10 +1,10 @@
-#include "economics/mdlnpv.hpp"
+#include "work/mdlnpv.hpp"
 
 #include "shell/apperror.hpp"
 #include "shell/errorlog.hpp"
 #include "valuation/discounting.hpp"
 
-namespace arbolex::economics {
+namespace arbolex::work {
 
 void CashFlow::SetRotationLength(int firstYear, int lastYear) {
     m_firstYear = static_cast<std::int16_t>(firstYear);
@@ -83,4 +83,4 @@ double CashFlow::SumNPV() const {
     return sum;
 }
 
-} // namespace arbolex::economics
+} // namespace arbolex::work

@@ -1,6 +1,6 @@
-#include "workflow/incrementrows.hpp"
+#include "work/incrementrows.hpp"
 
-namespace arbolex::workflow {
+namespace arbolex::work {
 
 std::vector<int> incrementRows(const ProjectionTable &table) {
     std::vector<int> rows;
@@ -16,4 +16,4 @@ std::vector<int> incrementRows(const ProjectionTable &table) {
     return rows;
 }
 
-} // namespace arbolex::workflow
+} // namespace arbolex::work

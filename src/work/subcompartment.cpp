@@ -1,8 +1,6 @@
-#include "document/subcompartment.hpp"
+#include "work/subcompartment.hpp"
 
-#include "document/documentmessages.hpp"
-
-namespace arbolex::document {
+namespace arbolex::work {
 
 QStringList SubCompartment::heading() const {
     QStringList lines;
@@ -11,13 +9,13 @@ QStringList SubCompartment::heading() const {
             lines << caption + QStringLiteral(": ") + value;
         }
     };
-    add(text::captionForest(), forest);
-    add(text::captionCompartment(), compartment);
-    add(text::captionSubCompartment(), subCompartment);
+    add(forestCaption(), forest);
+    add(compartmentCaption(), compartment);
+    add(subCompartmentCaption(), subCompartment);
     if (!notes.isEmpty()) {
         lines << notes.split(QLatin1Char('\n'));
     }
     return lines;
 }
 
-} // namespace arbolex::document
+} // namespace arbolex::work

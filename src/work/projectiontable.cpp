@@ -1,8 +1,8 @@
-#include "workflow/projectiontable.hpp"
+#include "work/projectiontable.hpp"
 
 #include <algorithm>
 
-namespace arbolex::workflow {
+namespace arbolex::work {
 
 namespace {
 
@@ -193,4 +193,4 @@ ProjectionTable::Removals ProjectionTable::removalsUpTo(int upTo) const {
     return m_removals[static_cast<std::size_t>(last - 1)];
 }
 
-} // namespace arbolex::workflow
+} // namespace arbolex::work

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "workflow/rowrecord.hpp"
+#include "work/rowrecord.hpp"
 
 #include <QString>
 #include <QStringList>
@@ -9,7 +9,7 @@
 
 #include <vector>
 
-namespace arbolex::workflow {
+namespace arbolex::work {
 
 /// Columns of a row of `flxMain`. Every data row carries all 26 cells; the
 /// header layout without the money column hides `kColValuePerHa`.
@@ -164,4 +164,4 @@ private:
     int m_rowSel = 0;
 };
 
-} // namespace arbolex::workflow
+} // namespace arbolex::work

@@ -3,7 +3,7 @@
 #include <QString>
 #include <QStringList>
 
-namespace arbolex::document {
+namespace arbolex::work {
 
 /// Which piece of ground a document describes: the forest, the compartment
 /// and the sub-compartment as the estate's maps name them, and a free note.
@@ -21,9 +21,14 @@ struct SubCompartment {
     }
     bool operator==(const SubCompartment &) const = default;
 
+    /// Captions of the three parts, as the identification dialog shows them.
+    static QString forestCaption() { return QStringLiteral("Forest"); }
+    static QString compartmentCaption() { return QStringLiteral("Compartment"); }
+    static QString subCompartmentCaption() { return QStringLiteral("Sub-compartment"); }
+
     /// The lines that head a report: "Forest: Kilbrack", "Compartment: 12",
     /// "Sub-compartment: b", then the note; a part left empty is left out.
     QStringList heading() const;
 };
 
-} // namespace arbolex::document
+} // namespace arbolex::work

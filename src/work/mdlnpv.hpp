@@ -5,8 +5,8 @@
 // revenue of each year, the costs, other revenues and operations the user
 // types, and the cash flows discounted to the first year.
 
-#include "economics/timberrevenue.hpp"
 #include "shell/settings.hpp"
+#include "work/timberrevenue.hpp"
 
 #include <QString>
 
@@ -18,7 +18,7 @@ namespace arbolex::shell {
 class ErrorLog;
 }
 
-namespace arbolex::economics {
+namespace arbolex::work {
 
 /// Columns of the cash flow, as the grid `NPV_Grid` shows them.
 enum CashFlowColumn : int {
@@ -96,4 +96,4 @@ private:
     double m_interestRate = shell::kDefaultInterestRate;
 };
 
-} // namespace arbolex::economics
+} // namespace arbolex::work

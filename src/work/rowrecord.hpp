@@ -2,7 +2,7 @@
 
 #include <array>
 
-namespace arbolex::workflow {
+namespace arbolex::work {
 
 /// What one row of the projection table was printed from. A growth row holds
 /// the standing crop and no removal; a thinning row holds the stand after the
@@ -44,4 +44,4 @@ enum RowNumber : int {
 };
 using RowNumbers = std::array<double, 5>;
 
-} // namespace arbolex::workflow
+} // namespace arbolex::work
