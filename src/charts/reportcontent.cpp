@@ -1,17 +1,18 @@
 #include "charts/reportcontent.hpp"
+#include "work/worktexts.hpp"
 
 #include "charts/reportmessages.hpp"
 #include "charts/standcharts.hpp"
-#include "economics/npvmessages.hpp"
+#include "engine/grow.hpp"
 #include "shell/vbformat.hpp"
 #include "work/mdlnpv.hpp"
+#include "work/standwork.hpp"
 #include "work/subcompartment.hpp"
-#include "workflow/mainwindowlogic.hpp"
 
 namespace arbolex::charts {
 
 using shell::formatNumber;
-using workflow::MainControl;
+using work::WorkField;
 
 namespace {
 
@@ -43,11 +44,11 @@ struct ComputedCashFlow {
     int years = 0;
 };
 
-ComputedCashFlow computedCashFlow(workflow::MainWindowLogic &logic) {
-    ComputedCashFlow computed{logic.cashFlow(), 0};
+ComputedCashFlow computedCashFlow(work::StandWork &work) {
+    ComputedCashFlow computed{work.cashFlow(), 0};
     if (computed.flow.years() > 0) {
-        computed.flow.LoadTimberRevenues(logic.timberRevenue());
-        computed.years = computed.flow.ComputeCashFlow(logic.errorLog());
+        computed.flow.LoadTimberRevenues(work.timberRevenue());
+        computed.years = computed.flow.ComputeCashFlow(work.errorLog());
     }
     return computed;
 }
@@ -57,7 +58,7 @@ ReportTable cashFlowTable(const ComputedCashFlow &computed) {
     if (computed.years == 0) {
         return table;
     }
-    table.captions = economics::text::npvHeaders();
+    table.captions = work::text::cashFlowHeaders();
     for (int i = 0; i < computed.years; ++i) {
         // Years without an operation, a cost or a revenue are left out.
         const bool quiet = computed.flow.operation(i).trimmed().isEmpty() &&
@@ -79,62 +80,63 @@ ReportTable cashFlowTable(const ComputedCashFlow &computed) {
 
 /// The stand the projection started from: the table's first row, else the
 /// grow-from fields as typed.
-std::vector<std::pair<QString, QString>> inputs(workflow::MainWindowLogic &logic) {
-    const work::ProjectionTable &table = logic.table();
-    const auto value = [&](int column, MainControl field) {
-        return table.empty() ? logic.view().text(field) : table.row(1).cells.value(column);
+std::vector<std::pair<QString, QString>> inputs(const work::StandWork &work) {
+    const work::ProjectionTable &table = work.table();
+    const auto value = [&](int column, WorkField field) {
+        return table.empty() ? work.field(field) : table.row(1).cells.value(column);
     };
     return {
-        {text::inputAge(), value(work::kColAge, MainControl::txtFromA)},
-        {text::inputStocking(), value(work::kColStocking, MainControl::txtFromN)},
-        {text::inputTopHeight(), value(work::kColTopHeight, MainControl::txtFromH)},
-        {text::inputBasalArea(), value(work::kColBasalArea, MainControl::txtFromB)},
-        {text::inputDbh(), value(work::kColDbh, MainControl::txtFromD)},
-        {text::inputNetArea(), logic.view().text(MainControl::txtNetArea)},
+        {text::inputAge(), value(work::kColAge, WorkField::FromAge)},
+        {text::inputStocking(), value(work::kColStocking, WorkField::FromStocking)},
+        {text::inputTopHeight(), value(work::kColTopHeight, WorkField::FromHeight)},
+        {text::inputBasalArea(), value(work::kColBasalArea, WorkField::FromBasalArea)},
+        {text::inputDbh(), value(work::kColDbh, WorkField::FromDbh)},
+        {text::inputNetArea(), work.field(WorkField::NetArea)},
     };
+}
+
+/// The yield class as the main window shows it: fixed at the final cut, else
+/// once the increment has culminated.
+QString yieldClassText(const work::StandWork &work) {
+    const int yc = work.yieldClass();
+    return work.felled() || yc > 0 ? QString::number(yc) : QString();
 }
 
 } // namespace
 
-RotationCharts rotationCharts(workflow::MainWindowLogic &logic) {
-    const ComputedCashFlow computed = computedCashFlow(logic);
-    return {standDevelopment(logic.table()), increments(logic.table()),
+RotationCharts rotationCharts(work::StandWork &work) {
+    const ComputedCashFlow computed = computedCashFlow(work);
+    return {standDevelopment(work.table()), increments(work.table()),
             cashFlowChart(computed.flow, computed.years)};
 }
 
-ReportContent reportContent(workflow::MainWindowLogic &logic) {
+ReportContent reportContent(work::StandWork &work) {
     ReportContent content;
-    const work::SubCompartment &id = logic.identification();
+    const work::SubCompartment &id = work.identification();
     content.forest = id.forest;
     content.compartment = id.compartment;
     content.subCompartment = id.subCompartment;
     content.description = id.notes;
-    content.modelLabel = QString::fromStdString(logic.grow().label());
-    content.inputs = inputs(logic);
-    content.siteIndex = logic.view().text(MainControl::lblSI);
-    content.yieldClass = logic.view().text(MainControl::lblYC);
+    content.modelLabel = QString::fromStdString(work.grow().label());
+    content.inputs = inputs(work);
+    content.siteIndex = work.siteIndexText();
+    content.yieldClass = yieldClassText(work);
     if (content.yieldClass.isEmpty()) {
         content.yieldClass = text::notCalculated();
     }
-    content.projection = fromGrid(logic.table().exportGrid(), logic.table().exportGroups());
-
-    if (!logic.table().empty()) {
-        // The summary of the table as it is now; the window keeps its view.
-        const bool showingSummary = logic.showingSummary();
-        if (logic.FillSummary() && !showingSummary) {
-            logic.cmdSummary_Click();
-        }
-        content.summary = fromGrid(logic.summaryGrid(), logic.summaryGroups());
+    content.projection = fromGrid(work.table().exportGrid(), work.table().exportGroups());
+    if (const auto summary = work.summary()) {
+        content.summary = fromGrid(work.summaryGrid(*summary), work.summaryGroups());
     }
 
-    const ComputedCashFlow computed = computedCashFlow(logic);
+    const ComputedCashFlow computed = computedCashFlow(work);
     content.cashFlow = cashFlowTable(computed);
     if (computed.years > 0) {
         content.netPresentValue = formatNumber(computed.flow.SumNPV(), u"#0");
         content.interestRate = formatNumber(computed.flow.interestRate(), u"0.00##");
     }
-    content.standChart = standDevelopment(logic.table());
-    content.incrementChart = increments(logic.table());
+    content.standChart = standDevelopment(work.table());
+    content.incrementChart = increments(work.table());
     content.cashFlowChart = cashFlowChart(computed.flow, computed.years);
     return content;
 }

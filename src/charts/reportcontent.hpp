@@ -12,8 +12,8 @@
 #include <utility>
 #include <vector>
 
-namespace arbolex::workflow {
-class MainWindowLogic;
+namespace arbolex::work {
+class StandWork;
 }
 
 namespace arbolex::charts {
@@ -55,10 +55,9 @@ struct ReportContent {
     ChartData cashFlowChart;
 };
 
-/// The report of what the main window holds now. The summary is filled
-/// afresh (the window goes on showing what it showed) and the cash flow is
-/// computed on a copy with the costs and revenues typed so far.
-ReportContent reportContent(workflow::MainWindowLogic &logic);
+/// The report of the work as it stands: its summary made afresh, and the
+/// cash flow computed on a copy with the costs and revenues typed so far.
+ReportContent reportContent(work::StandWork &work);
 
 /// The three charts of the main window now (the panel beside the table).
 struct RotationCharts {
@@ -66,6 +65,6 @@ struct RotationCharts {
     ChartData increments;
     ChartData cashFlow;
 };
-RotationCharts rotationCharts(workflow::MainWindowLogic &logic);
+RotationCharts rotationCharts(work::StandWork &work);
 
 } // namespace arbolex::charts

@@ -66,7 +66,7 @@ int runReport(CommandContext &context) {
         context.err << "arbolex-cli report: " << fault << '\n';
         return kExitBadArguments;
     }
-    const int pages = report::writeReportPdf(charts::reportContent(session.main()), outPath,
+    const int pages = report::writeReportPdf(charts::reportContent(session.work()), outPath,
                                              report::printedNow());
     if (pages == 0) {
         context.err << "arbolex-cli report: cannot write " << outPath << '\n';

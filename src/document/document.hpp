@@ -1,14 +1,14 @@
 #pragma once
 
 // A sub-compartment as a document: the file format's name and version, and
-// the work it holds (the main window's snapshot with its identification).
+// the work it holds (the work on the sub-compartment as a whole).
 
-#include "workflow/mainsnapshot.hpp"
+#include "work/worksnapshot.hpp"
 
 namespace arbolex::document {
 
 /// The work of one sub-compartment as a file holds it.
-using Document = workflow::MainSnapshot;
+using Document = work::WorkSnapshot;
 
 /// Value of the "format" field that opens every file.
 inline constexpr const char *kFormatName = "ARBOLEX sub-compartment";

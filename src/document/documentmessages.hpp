@@ -31,14 +31,6 @@ inline QString titleIdentification() {
 inline QString untitled() {
     return QStringLiteral("Untitled");
 }
-/// Between the model in use and the document's name.
-inline QString captionDocument() {
-    return QStringLiteral("   ----  ");
-}
-/// After the name of a document with unsaved changes.
-inline QString unsavedMark() {
-    return QStringLiteral(" *");
-}
 
 // ---- Questions and faults --------------------------------------------------------
 inline QString unsavedQuestion(const QString &name) {

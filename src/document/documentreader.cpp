@@ -181,8 +181,9 @@ work::SubCompartment readIdentification(const ObjectReader &top) {
 
 void readFields(const ObjectReader &top, Document &d) {
     const ObjectReader r(top.object(key::fields), QStringLiteral("the grow-from fields"));
-    for (std::size_t i = 0; i < workflow::kSnapshotFields.size(); ++i) {
-        const QByteArray field = workflow::controlName(workflow::kSnapshotFields.at(i)).toLatin1();
+    for (std::size_t i = 0; i < work::kWorkFields.size(); ++i) {
+        const std::string_view name = work::workFieldName(work::kWorkFields.at(i));
+        const QByteArray field(name.data(), static_cast<qsizetype>(name.size()));
         const QString text = r.string(field.constData(), kMaxFieldLength);
         // The fields take digits and the decimal point only: a minus sign
         // (a negative stocking) or a letter was never typed there.

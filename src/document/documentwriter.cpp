@@ -95,8 +95,10 @@ QJsonObject cashFlowJson(const Document &d) {
 
 QByteArray documentToJson(const Document &d) {
     QJsonObject fields;
-    for (std::size_t i = 0; i < workflow::kSnapshotFields.size(); ++i) {
-        fields.insert(workflow::controlName(workflow::kSnapshotFields.at(i)), d.fields.at(i));
+    for (std::size_t i = 0; i < work::kWorkFields.size(); ++i) {
+        const std::string_view name = work::workFieldName(work::kWorkFields.at(i));
+        fields.insert(QLatin1String(name.data(), static_cast<qsizetype>(name.size())),
+                      d.fields.at(i));
     }
     QJsonArray prices;
     for (double p : d.pricesInUse) {

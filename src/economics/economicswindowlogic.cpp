@@ -6,12 +6,13 @@
 #include "economics/economicsformat.hpp"
 #include "economics/economicsmessages.hpp"
 #include "prices/prices.hpp"
+#include "rotation/standmath.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
 #include "shell/vbtext.hpp"
-#include "workflow/mainwindowlogic.hpp"
-#include "workflow/standmath.hpp"
+#include "work/standwork.hpp"
+#include "workflow/iworkwindows.hpp"
 
 #include <cmath>
 #include <exception>
@@ -89,10 +90,10 @@ std::optional<long long> wholeNumber(const QString &typed) {
 
 } // namespace
 
-EconomicsWindowLogic::EconomicsWindowLogic(workflow::MainWindowLogic &main,
+EconomicsWindowLogic::EconomicsWindowLogic(work::StandWork &work, workflow::IMainCommands &main,
                                            thinning::ThinWindowLogic &thin, IEconomicsView &view,
                                            shell::IInteractive &interactive)
-    : m_main(main), m_thin(thin), m_view(view), m_interactive(interactive) {}
+    : m_standWork(work), m_main(main), m_thin(thin), m_view(view), m_interactive(interactive) {}
 
 void EconomicsWindowLogic::message(const QString &text, EconomicsControl focus) {
     m_interactive.message(economicstext::titleEconomics(), text, shell::kExclamation);
@@ -105,8 +106,8 @@ void EconomicsWindowLogic::cmdEconomics_Click() {
 }
 
 void EconomicsWindowLogic::Form_Load() {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in frmEconomics.Form_Load()"), [&] {
-        m_view.setText(C::txtInterestRate, percentText(m_main.cashFlow().interestRate()));
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in frmEconomics.Form_Load()"), [&] {
+        m_view.setText(C::txtInterestRate, percentText(m_standWork.cashFlow().interestRate()));
         const rotation::MonteCarloSettings draws;
         const auto fill = [&](C c, const QString &value) {
             if (m_view.text(c).isEmpty()) {
@@ -145,7 +146,7 @@ bool EconomicsWindowLogic::readEconomics() {
     }
     // The cash flow's own prices: the long-term averages, as their absolute values.
     prices::Prices longTerm;
-    longTerm.data() = m_main.prices().data();
+    longTerm.data() = m_standWork.prices().data();
     longTerm.selectPriceSet(prices::kLongTermPrices);
     e.prices = longTerm.pricesInUse();
     // Or every harvest divided into the assortment report's classes and sold
@@ -154,28 +155,35 @@ bool EconomicsWindowLogic::readEconomics() {
             .trimmed()
             .startsWith(QStringLiteral("assortment"), Qt::CaseInsensitive)) {
         e.valuation = rotation::Valuation::kAssortments;
-        e.assortmentPrices = m_main.prices().data().assortmentPrices;
+        e.assortmentPrices = m_standWork.prices().data().assortmentPrices;
     }
     // One interest rate for the program: the cash flow's.
-    m_main.cashFlow().setInterestRate(e.ratePercent);
+    m_standWork.cashFlow().setInterestRate(e.ratePercent);
     m_economics = e;
     return true;
 }
 
 bool EconomicsWindowLogic::readStand() {
-    const std::int16_t model = m_main.grow().modelId();
-    if (const auto s = standFromTable(m_main.table(), model)) {
+    const std::int16_t model = m_standWork.grow().modelId();
+    if (const auto s = standFromTable(m_standWork.table(), model)) {
         m_stand = *s;
         return true;
     }
     // No table yet: the grow-from fields, checked as the grow command checks them.
-    if (!m_main.ChkGrowFromFlds() || !m_main.ChkGrowFromBnds()) {
+    if (!m_main.checkGrowFrom()) {
         return false;
     }
-    const workflow::GrowFrom g = m_main.GetGrowFrom();
+    const auto value = [&](work::WorkField f) {
+        return static_cast<float>(shell::val(m_standWork.field(f)));
+    };
+    const float stocking = value(work::WorkField::FromStocking);
+    const float typedBasalArea = value(work::WorkField::FromBasalArea);
     const float basalArea =
-        g.basalArea > 0.0f ? g.basalArea : workflow::basalAreaFromDbh(g.stocking, g.dbh);
-    m_stand = rotation::Stand{model, g.age, g.stocking, g.topHeight, basalArea};
+        typedBasalArea > 0.0f
+            ? typedBasalArea
+            : rotation::basalAreaFromDbh(stocking, value(work::WorkField::FromDbh));
+    m_stand = rotation::Stand{model, value(work::WorkField::FromAge), stocking,
+                              value(work::WorkField::FromHeight), basalArea};
     return true;
 }
 
@@ -195,43 +203,45 @@ void EconomicsWindowLogic::clearFigures(const QString &why) {
 }
 
 void EconomicsWindowLogic::cmdCompute_Click() {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in frmEconomics.cmdCompute_Click()"), [&] {
-        if (m_optimising) {
-            return;
-        }
-        const rotation::Stand before = m_stand;
-        const rotation::Economics money = m_economics;
-        if (!readEconomics() || !readStand()) {
-            return;
-        }
-        if (!sameStand(before, m_stand) || !sameMoney(money, m_economics)) {
-            // The optimiser's regimes belong to another stand or other money.
-            m_best.clear();
-            m_view.setText(C::lblOptimiser, QString());
-            m_view.setEnabled(C::cmdApply, false);
-            m_view.regimesChanged();
-        }
-        m_table = regimeFromTable(m_main.table());
-        rotation::GrowthFailure failure;
-        m_path = rotation::growPath(m_grow, m_stand, m_table.regime, failure);
-        if (!m_path) {
-            clearFigures(QString::fromStdString(failure.text));
-            return;
-        }
-        m_explorer = rotation::exploreRotations(*m_path, m_table.regime, m_economics);
-        m_rotation = m_table.finalCut.value_or(m_explorer.economicRotation);
-        if (const auto problem = rotation::rotationProblem(*m_path, m_table.regime, m_rotation)) {
-            clearFigures(QString::fromStdString(*problem));
-            return;
-        }
-        m_value = rotation::valueRotation(*m_path, m_rotation, m_economics);
-        m_tornado = rotation::tornado(*m_path, m_rotation, m_economics);
-        m_yours = rotation::scoreRotation(*m_path, m_table.regime, m_rotation, m_economics,
-                                          rotation::Objective::kLev);
-        showFigures();
-        m_view.regimesChanged();
-        cmdMonteCarlo_Click();
-    });
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in frmEconomics.cmdCompute_Click()"),
+                 [&] {
+                     if (m_optimising) {
+                         return;
+                     }
+                     const rotation::Stand before = m_stand;
+                     const rotation::Economics money = m_economics;
+                     if (!readEconomics() || !readStand()) {
+                         return;
+                     }
+                     if (!sameStand(before, m_stand) || !sameMoney(money, m_economics)) {
+                         // The optimiser's regimes belong to another stand or other money.
+                         m_best.clear();
+                         m_view.setText(C::lblOptimiser, QString());
+                         m_view.setEnabled(C::cmdApply, false);
+                         m_view.regimesChanged();
+                     }
+                     m_table = regimeFromTable(m_standWork.table());
+                     rotation::GrowthFailure failure;
+                     m_path = rotation::growPath(m_grow, m_stand, m_table.regime, failure);
+                     if (!m_path) {
+                         clearFigures(QString::fromStdString(failure.text));
+                         return;
+                     }
+                     m_explorer = rotation::exploreRotations(*m_path, m_table.regime, m_economics);
+                     m_rotation = m_table.finalCut.value_or(m_explorer.economicRotation);
+                     if (const auto problem =
+                             rotation::rotationProblem(*m_path, m_table.regime, m_rotation)) {
+                         clearFigures(QString::fromStdString(*problem));
+                         return;
+                     }
+                     m_value = rotation::valueRotation(*m_path, m_rotation, m_economics);
+                     m_tornado = rotation::tornado(*m_path, m_rotation, m_economics);
+                     m_yours = rotation::scoreRotation(*m_path, m_table.regime, m_rotation,
+                                                       m_economics, rotation::Objective::kLev);
+                     showFigures();
+                     m_view.regimesChanged();
+                     cmdMonteCarlo_Click();
+                 });
 }
 
 QString EconomicsWindowLogic::rateText() const {
@@ -303,126 +313,128 @@ void EconomicsWindowLogic::showFigures() {
 }
 
 void EconomicsWindowLogic::cmdMonteCarlo_Click() {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in frmEconomics.cmdMonteCarlo_Click()"), [&] {
-        if (!m_path || !m_value) {
-            message(economicstext::noStand(), C::txtInterestRate);
-            return;
-        }
-        rotation::MonteCarloSettings s;
-        const auto draws = wholeNumber(m_view.text(C::txtDraws));
-        if (!draws || *draws < kFewestDraws || *draws > kMostDraws) {
-            message(economicstext::faultDraws(), C::txtDraws);
-            return;
-        }
-        s.draws = static_cast<int>(*draws);
-        const auto seed = wholeNumber(m_view.text(C::txtSeed));
-        if (!seed || *seed < 0) {
-            message(economicstext::faultSeed(), C::txtSeed);
-            return;
-        }
-        s.seed = static_cast<std::uint64_t>(*seed);
-        for (const C c : {C::txtPriceSpread, C::txtCostSpread}) {
-            const QString typed = m_view.text(c).trimmed();
-            const double percent = shell::val(typed);
-            if (!shell::isNumeric(typed) || percent < 0.0 || percent > 100.0) {
-                message(economicstext::faultSpread(), c);
+    shell::guard(
+        m_standWork.errorLog(), QStringLiteral(" in frmEconomics.cmdMonteCarlo_Click()"), [&] {
+            if (!m_path || !m_value) {
+                message(economicstext::noStand(), C::txtInterestRate);
                 return;
             }
-            (c == C::txtPriceSpread ? s.priceSpread : s.costSpread) = percent / 100.0;
-        }
-        const QString low = m_view.text(C::txtRateLow).trimmed();
-        const QString high = m_view.text(C::txtRateHigh).trimmed();
-        if (!shell::isNumeric(low) || !shell::isNumeric(high) || !(shell::val(low) > 0.0) ||
-            !(shell::val(low) < shell::val(high))) {
-            message(economicstext::faultRateRange(), C::txtRateLow);
-            return;
-        }
-        s.rateLow = shell::val(low);
-        s.rateHigh = shell::val(high);
-        m_monteCarlo = rotation::monteCarlo(*m_path, m_rotation, m_economics, s);
-        const rotation::MonteCarloResult &r = *m_monteCarlo;
-        m_view.setText(C::lblMonteCarlo, QStringLiteral("NPV P5 ") + euroText(r.npv.p5) +
-                                             QStringLiteral(" · P50 ") + euroText(r.npv.p50) +
-                                             QStringLiteral(" · P95 ") + euroText(r.npv.p95) +
-                                             QStringLiteral(" €/ha · P(NPV < 0) = ") +
-                                             quantityText(r.probabilityNpvBelowZero * 100.0, 1) +
-                                             QStringLiteral(" % · ") + quantityText(s.draws, 0) +
-                                             QStringLiteral(" draws at rates from ") +
-                                             percentText(s.rateLow) + QStringLiteral(" to ") +
-                                             percentText(s.rateHigh) + QStringLiteral(" % a year"));
-        m_view.monteCarloChanged();
-    });
+            rotation::MonteCarloSettings s;
+            const auto draws = wholeNumber(m_view.text(C::txtDraws));
+            if (!draws || *draws < kFewestDraws || *draws > kMostDraws) {
+                message(economicstext::faultDraws(), C::txtDraws);
+                return;
+            }
+            s.draws = static_cast<int>(*draws);
+            const auto seed = wholeNumber(m_view.text(C::txtSeed));
+            if (!seed || *seed < 0) {
+                message(economicstext::faultSeed(), C::txtSeed);
+                return;
+            }
+            s.seed = static_cast<std::uint64_t>(*seed);
+            for (const C c : {C::txtPriceSpread, C::txtCostSpread}) {
+                const QString typed = m_view.text(c).trimmed();
+                const double percent = shell::val(typed);
+                if (!shell::isNumeric(typed) || percent < 0.0 || percent > 100.0) {
+                    message(economicstext::faultSpread(), c);
+                    return;
+                }
+                (c == C::txtPriceSpread ? s.priceSpread : s.costSpread) = percent / 100.0;
+            }
+            const QString low = m_view.text(C::txtRateLow).trimmed();
+            const QString high = m_view.text(C::txtRateHigh).trimmed();
+            if (!shell::isNumeric(low) || !shell::isNumeric(high) || !(shell::val(low) > 0.0) ||
+                !(shell::val(low) < shell::val(high))) {
+                message(economicstext::faultRateRange(), C::txtRateLow);
+                return;
+            }
+            s.rateLow = shell::val(low);
+            s.rateHigh = shell::val(high);
+            m_monteCarlo = rotation::monteCarlo(*m_path, m_rotation, m_economics, s);
+            const rotation::MonteCarloResult &r = *m_monteCarlo;
+            m_view.setText(
+                C::lblMonteCarlo,
+                QStringLiteral("NPV P5 ") + euroText(r.npv.p5) + QStringLiteral(" · P50 ") +
+                    euroText(r.npv.p50) + QStringLiteral(" · P95 ") + euroText(r.npv.p95) +
+                    QStringLiteral(" €/ha · P(NPV < 0) = ") +
+                    quantityText(r.probabilityNpvBelowZero * 100.0, 1) + QStringLiteral(" % · ") +
+                    quantityText(s.draws, 0) + QStringLiteral(" draws at rates from ") +
+                    percentText(s.rateLow) + QStringLiteral(" to ") + percentText(s.rateHigh) +
+                    QStringLiteral(" % a year"));
+            m_view.monteCarloChanged();
+        });
 }
 
 void EconomicsWindowLogic::cmdOptimise_Click() {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in frmEconomics.cmdOptimise_Click()"), [&] {
-        if (m_optimising) {
-            return;
-        }
-        if (!m_path || !m_value) {
-            message(economicstext::noStand(), C::txtInterestRate);
-            return;
-        }
-        struct Job {
-            rotation::Stand stand;
-            rotation::Economics economics;
-            rotation::OptimiserSettings settings;
-            std::optional<rotation::OptimiserResult> result;
-            rotation::GrowthFailure failure;
-        };
-        auto job = std::make_shared<Job>();
-        job->stand = m_stand;
-        job->economics = m_economics;
-        m_optimising = true;
-        m_cancel = false;
-        for (const C c : {C::cmdOptimise, C::cmdApply, C::cmdCompute, C::cmdMonteCarlo}) {
-            m_view.setEnabled(c, false);
-        }
-        m_view.setEnabled(C::cmdCancel, true);
-        m_view.setText(C::lblOptimiser, QStringLiteral("Searching…"));
-        m_view.setProgress(0.0);
-        m_view.runInBackground(
-            [this, job] {
-                // Each thread grows with an engine of its own.
-                try {
-                    engine::Grow grow;
-                    job->result =
-                        rotation::optimise(grow, job->stand, job->economics, job->settings,
-                                           job->failure, [this](double fraction) {
-                                               m_view.setProgress(fraction);
-                                               return !m_cancel.load();
-                                           });
-                } catch (const std::exception &e) {
-                    job->result.reset();
-                    job->failure.text = e.what();
-                }
-            },
-            [this, job] {
-                m_optimising = false;
-                for (const C c : {C::cmdOptimise, C::cmdCompute, C::cmdMonteCarlo}) {
-                    m_view.setEnabled(c, true);
-                }
-                m_view.setEnabled(C::cmdCancel, false);
-                if (!job->result) {
-                    m_view.setText(C::lblOptimiser, QString());
-                    message(economicstext::optimiserFailed() +
-                                QString::fromStdString(job->failure.text),
-                            C::cmdOptimise);
-                    return;
-                }
-                m_best = job->result->best;
-                m_chosen = 1;
-                m_view.setEnabled(C::cmdApply, !m_best.empty());
-                const QString grown = quantityText(job->result->regimesGrown, 0);
-                m_view.setText(C::lblOptimiser,
-                               job->result->completed
-                                   ? grown + QStringLiteral(" regimes grown and valued at ") +
-                                         rateText() + QStringLiteral(" % a year.")
-                                   : QStringLiteral("Cancelled after ") + grown +
-                                         QStringLiteral(" regimes: the best found so far."));
-                m_view.regimesChanged();
-            });
-    });
+    shell::guard(
+        m_standWork.errorLog(), QStringLiteral(" in frmEconomics.cmdOptimise_Click()"), [&] {
+            if (m_optimising) {
+                return;
+            }
+            if (!m_path || !m_value) {
+                message(economicstext::noStand(), C::txtInterestRate);
+                return;
+            }
+            struct Job {
+                rotation::Stand stand;
+                rotation::Economics economics;
+                rotation::OptimiserSettings settings;
+                std::optional<rotation::OptimiserResult> result;
+                rotation::GrowthFailure failure;
+            };
+            auto job = std::make_shared<Job>();
+            job->stand = m_stand;
+            job->economics = m_economics;
+            m_optimising = true;
+            m_cancel = false;
+            for (const C c : {C::cmdOptimise, C::cmdApply, C::cmdCompute, C::cmdMonteCarlo}) {
+                m_view.setEnabled(c, false);
+            }
+            m_view.setEnabled(C::cmdCancel, true);
+            m_view.setText(C::lblOptimiser, QStringLiteral("Searching…"));
+            m_view.setProgress(0.0);
+            m_view.runInBackground(
+                [this, job] {
+                    // Each thread grows with an engine of its own.
+                    try {
+                        engine::Grow grow;
+                        job->result =
+                            rotation::optimise(grow, job->stand, job->economics, job->settings,
+                                               job->failure, [this](double fraction) {
+                                                   m_view.setProgress(fraction);
+                                                   return !m_cancel.load();
+                                               });
+                    } catch (const std::exception &e) {
+                        job->result.reset();
+                        job->failure.text = e.what();
+                    }
+                },
+                [this, job] {
+                    m_optimising = false;
+                    for (const C c : {C::cmdOptimise, C::cmdCompute, C::cmdMonteCarlo}) {
+                        m_view.setEnabled(c, true);
+                    }
+                    m_view.setEnabled(C::cmdCancel, false);
+                    if (!job->result) {
+                        m_view.setText(C::lblOptimiser, QString());
+                        message(economicstext::optimiserFailed() +
+                                    QString::fromStdString(job->failure.text),
+                                C::cmdOptimise);
+                        return;
+                    }
+                    m_best = job->result->best;
+                    m_chosen = 1;
+                    m_view.setEnabled(C::cmdApply, !m_best.empty());
+                    const QString grown = quantityText(job->result->regimesGrown, 0);
+                    m_view.setText(C::lblOptimiser,
+                                   job->result->completed
+                                       ? grown + QStringLiteral(" regimes grown and valued at ") +
+                                             rateText() + QStringLiteral(" % a year.")
+                                       : QStringLiteral("Cancelled after ") + grown +
+                                             QStringLiteral(" regimes: the best found so far."));
+                    m_view.regimesChanged();
+                });
+        });
 }
 
 std::vector<QStringList> EconomicsWindowLogic::regimeGrid() const {

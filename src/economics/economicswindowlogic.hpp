@@ -27,16 +27,23 @@ namespace arbolex::thinning {
 class ThinWindowLogic;
 }
 
+namespace arbolex::work {
+class StandWork;
+}
+
 namespace arbolex::workflow {
-class MainWindowLogic;
+class IMainCommands;
 }
 
 namespace arbolex::economics {
 
 class EconomicsWindowLogic {
 public:
-    EconomicsWindowLogic(workflow::MainWindowLogic &main, thinning::ThinWindowLogic &thin,
-                         IEconomicsView &view, shell::IInteractive &interactive);
+    /// The economics of `work`; "Apply" writes a regime through the commands
+    /// of `main` and `thin`.
+    EconomicsWindowLogic(work::StandWork &work, workflow::IMainCommands &main,
+                         thinning::ThinWindowLogic &thin, IEconomicsView &view,
+                         shell::IInteractive &interactive);
 
     /// The main window's "Economics…": loads the window and shows it.
     void cmdEconomics_Click();
@@ -98,7 +105,8 @@ private:
     void showFigures();
     void clearFigures(const QString &why);
 
-    workflow::MainWindowLogic &m_main;
+    work::StandWork &m_standWork;
+    workflow::IMainCommands &m_main;
     thinning::ThinWindowLogic &m_thin;
     IEconomicsView &m_view;
     shell::IInteractive &m_interactive;

@@ -1,4 +1,5 @@
 #include "economics/npvwindowlogic.hpp"
+#include "work/worktexts.hpp"
 
 #include "economics/npvmessages.hpp"
 #include "shell/apperror.hpp"
@@ -27,17 +28,16 @@ double valueOrZero(const QString &text) {
 
 } // namespace
 
-NpvWindowLogic::NpvWindowLogic(work::CashFlow &cashFlow, const work::TimberRevenue &revenue,
-                               shell::ErrorLog &log, INpvView &view,
+NpvWindowLogic::NpvWindowLogic(work::StandWork &work, INpvView &view,
                                shell::IInteractive &interactive, shell::IClipboard &clipboard)
-    : m_cashFlow(cashFlow), m_revenue(revenue), m_log(log), m_view(view),
+    : m_standWork(work), m_cashFlow(work.cashFlow()), m_log(work.errorLog()), m_view(view),
       m_interactive(interactive), m_clipboard(clipboard) {}
 
 void NpvWindowLogic::Form_Load() {
     shell::guard(m_log, QStringLiteral(" in frmNPV.Form_Load()"), [&] {
         const int years = m_cashFlow.years();
         m_grid.assign(static_cast<std::size_t>(years) + 1, QStringList());
-        m_grid[0] = text::npvHeaders();
+        m_grid[0] = work::text::cashFlowHeaders();
         for (int i = 0; i < years; ++i) {
             QStringList &row = m_grid[static_cast<std::size_t>(i) + 1];
             for (int c = 0; c < work::kCashFlowColumnCount; ++c) {
@@ -45,7 +45,7 @@ void NpvWindowLogic::Form_Load() {
             }
             row[work::kCfYear] = QString::number(m_cashFlow.firstYear() + i);
         }
-        m_cashFlow.LoadTimberRevenues(m_revenue);
+        m_cashFlow.LoadTimberRevenues(m_standWork.timberRevenue());
         LoadNPV_GridWithArray();
         m_view.setText(NpvControl::txtInterestRate,
                        formatNumber(m_cashFlow.interestRate(), u"0.00##"));
@@ -93,6 +93,7 @@ void NpvWindowLogic::cmdNPV_Click() {
         showNetPresentValue();
     }
     m_view.gridChanged();
+    m_standWork.cashFlowEdited();
 }
 
 bool NpvWindowLogic::editable(int column) const {
@@ -141,6 +142,7 @@ void NpvWindowLogic::NPV_Grid_KeyPress(QChar key) {
             m_cashFlow.setMatrix(m_column, i, valueOrZero(cell));
         }
         m_view.gridChanged();
+        m_standWork.cashFlowEdited();
     });
 }
 
@@ -191,6 +193,7 @@ bool NpvWindowLogic::txtInterestRate_LostFocus() {
         return false;
     }
     m_cashFlow.setInterestRate(shell::val(typed));
+    m_standWork.cashFlowEdited();
     return true;
 }
 

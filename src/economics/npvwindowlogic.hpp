@@ -6,6 +6,7 @@
 
 #include "economics/inpvview.hpp"
 #include "work/mdlnpv.hpp"
+#include "work/standwork.hpp"
 
 #include <QString>
 #include <QStringList>
@@ -22,9 +23,8 @@ namespace arbolex::economics {
 
 class NpvWindowLogic {
 public:
-    /// `cashFlow` and `revenue` are the program's; the window shows and edits them.
-    NpvWindowLogic(work::CashFlow &cashFlow, const work::TimberRevenue &revenue,
-                   shell::ErrorLog &log, INpvView &view, shell::IInteractive &interactive,
+    /// The window shows and edits the cash flow of `work`.
+    NpvWindowLogic(work::StandWork &work, INpvView &view, shell::IInteractive &interactive,
                    shell::IClipboard &clipboard);
 
     /// The window's load: headers, one row per year, the timber revenues, the
@@ -68,8 +68,8 @@ private:
     void showNetPresentValue();
     bool editable(int column) const;
 
+    work::StandWork &m_standWork;
     work::CashFlow &m_cashFlow;
-    const work::TimberRevenue &m_revenue;
     shell::ErrorLog &m_log;
     INpvView &m_view;
     shell::IInteractive &m_interactive;

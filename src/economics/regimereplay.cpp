@@ -9,7 +9,8 @@
 #include "shell/vbformat.hpp"
 #include "shell/vbtext.hpp"
 #include "thinning/thinwindowlogic.hpp"
-#include "workflow/mainwindowlogic.hpp"
+#include "work/standwork.hpp"
+#include "workflow/iworkwindows.hpp"
 
 #include <algorithm>
 #include <cmath>
@@ -41,10 +42,10 @@ private:
 
 } // namespace
 
-std::optional<QString> replayRegime(workflow::MainWindowLogic &main,
+std::optional<QString> replayRegime(work::StandWork &work, workflow::IMainCommands &main,
                                     thinning::ThinWindowLogic &thin, const rotation::Stand &stand,
                                     const rotation::Regime &regime, int rotation) {
-    const double typedStep = shell::val(main.view().text(MainControl::txtByA));
+    const double typedStep = shell::val(work.field(work::WorkField::ByStep));
     const double step = typedStep >= 1.0 ? typedStep : kDefaultStep;
     // Whole years: the grow command moves the start to the nearest one.
     int grownTo = static_cast<int>(std::nearbyint(stand.age));
@@ -60,7 +61,7 @@ std::optional<QString> replayRegime(workflow::MainWindowLogic &main,
         main.typeText(MainControl::txtByA,
                       shell::generalNumber(std::min(step, static_cast<double>(age - grownTo))));
         main.cmdGrow_Click();
-        const work::ProjectionTable &table = main.table();
+        const work::ProjectionTable &table = work.table();
         if (table.empty() || !table.row(table.lastRow()).isGrowth() ||
             static_cast<int>(std::nearbyint(table.row(table.lastRow()).record.age)) != age) {
             return QStringLiteral("the stand could not be grown to ") + QString::number(age) +
@@ -95,7 +96,7 @@ std::optional<QString> replayRegime(workflow::MainWindowLogic &main,
 }
 
 void EconomicsWindowLogic::cmdApply_Click(int rank) {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in frmEconomics.cmdApply_Click()"), [&] {
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in frmEconomics.cmdApply_Click()"), [&] {
         if (m_optimising) {
             return;
         }
@@ -104,8 +105,8 @@ void EconomicsWindowLogic::cmdApply_Click(int rank) {
             return;
         }
         const rotation::Candidate chosen = m_best[static_cast<std::size_t>(rank - 1)];
-        if (const auto failed =
-                replayRegime(m_main, m_thin, m_stand, chosen.regime, chosen.rotation)) {
+        if (const auto failed = replayRegime(m_standWork, m_main, m_thin, m_stand, chosen.regime,
+                                             chosen.rotation)) {
             m_interactive.message(economicstext::titleEconomics(),
                                   economicstext::applyStopped() + *failed, shell::kExclamation);
         }

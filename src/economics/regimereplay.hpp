@@ -15,17 +15,22 @@ namespace arbolex::thinning {
 class ThinWindowLogic;
 }
 
+namespace arbolex::work {
+class StandWork;
+}
+
 namespace arbolex::workflow {
-class MainWindowLogic;
+class IMainCommands;
 }
 
 namespace arbolex::economics {
 
-/// Writes `regime` felled at `rotation` (years) for `stand` into the table of
-/// `main`, grown by the step of its step field (5 years when it holds none).
+/// Writes `regime` felled at `rotation` (years) for `stand` into `work` by the
+/// commands of `main` and `thin`, grown by the step of its step field (5
+/// years when it holds none).
 /// Returns the reason when a step could not be made; the table then holds
 /// what was made up to that step.
-std::optional<QString> replayRegime(workflow::MainWindowLogic &main,
+std::optional<QString> replayRegime(work::StandWork &work, workflow::IMainCommands &main,
                                     thinning::ThinWindowLogic &thin, const rotation::Stand &stand,
                                     const rotation::Regime &regime, int rotation);
 

@@ -26,12 +26,16 @@ namespace arbolex::shell {
 class IInteractive;
 }
 
+namespace arbolex::work {
+class StandWork;
+}
+
 namespace arbolex::thinning {
 class ThinWindowLogic;
 }
 
 namespace arbolex::workflow {
-class MainWindowLogic;
+class IMainCommands;
 }
 
 namespace arbolex::estatewindow {
@@ -51,9 +55,9 @@ struct ForecastChart {
 
 class EstateWindowLogic {
 public:
-    EstateWindowLogic(workflow::MainWindowLogic &main, thinning::ThinWindowLogic &thin,
-                      document::DocumentController &documents, IEstateView &view,
-                      shell::IInteractive &interactive);
+    EstateWindowLogic(work::StandWork &work, workflow::IMainCommands &main,
+                      thinning::ThinWindowLogic &thin, document::DocumentController &documents,
+                      IEstateView &view, shell::IInteractive &interactive);
 
     /// File → Open Estate…: the table the user chooses, run.
     void mnuOpenEstate_Click();
@@ -86,7 +90,8 @@ public:
     const QString &summaryText() const { return m_summary; }
 
 private:
-    workflow::MainWindowLogic &m_main;
+    work::StandWork &m_standWork;
+    workflow::IMainCommands &m_main;
     thinning::ThinWindowLogic &m_thin;
     document::DocumentController &m_documents;
     IEstateView &m_view;

@@ -5,7 +5,6 @@
 #include <QObject>
 
 class QMenu;
-class QTimer;
 class QWidget;
 
 namespace arbolex::document {
@@ -37,7 +36,6 @@ private:
     QMenu *m_menu;
     QMenu *m_recent = nullptr;
     QWidget *m_window;
-    QTimer *m_caption = nullptr;
     document::DocumentController *m_controller = nullptr;
 };
 

@@ -198,6 +198,12 @@ QLineEdit *MainWindow::addField(MainControl control) {
     field->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
     field->setFixedWidth(field->fontMetrics().horizontalAdvance(QString(kFieldDigits, u'0')) + 16);
     field->installEventFilter(this);
+    // The work keeps what the field holds, typed or set.
+    connect(field, &QLineEdit::textChanged, this, [this, control](const QString &text) {
+        if (m_logic != nullptr) {
+            m_logic->fields().fieldEdited(control, text);
+        }
+    });
     m_controls.at(slot(control)) = field;
     return field;
 }
@@ -481,6 +487,11 @@ void MainWindow::setEnabled(MainControl c, bool enabled) {
     if (QWidget *w = control(c)) {
         w->setEnabled(enabled);
     }
+}
+
+bool MainWindow::isEnabled(MainControl c) const {
+    const QWidget *w = control(c);
+    return w == nullptr || w->isEnabled();
 }
 
 void MainWindow::setHint(MainControl c, const QString &hint) {

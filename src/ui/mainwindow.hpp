@@ -81,9 +81,11 @@ public:
     void setText(workflow::MainControl control, const QString &text) override;
     using QMainWindow::setEnabled;
     void setEnabled(workflow::MainControl control, bool enabled) override;
+    bool isEnabled(workflow::MainControl control) const override;
     void setHint(workflow::MainControl control, const QString &hint) override;
     void focus(workflow::MainControl control) override;
     void setCaption(const QString &caption) override;
+    QString caption() const override { return windowTitle(); }
     void setBusy(bool busy) override;
     void tableChanged(int firstRow) override;
     void scrollToRow(int row) override;

@@ -48,7 +48,7 @@ bool ReportMenu::exportReport(const QString &path) {
     }
     QApplication::setOverrideCursor(Qt::WaitCursor);
     const int pages =
-        report::writeReportPdf(charts::reportContent(*m_logic), path, report::printedNow());
+        report::writeReportPdf(charts::reportContent(m_logic->work()), path, report::printedNow());
     QApplication::restoreOverrideCursor();
     if (pages == 0) {
         charts::reportOutputFailure(
@@ -83,7 +83,7 @@ void ReportMenu::print() {
     }
     QApplication::setOverrideCursor(Qt::WaitCursor);
     const int pages =
-        report::paintReport(printer, charts::reportContent(*m_logic), report::printedNow());
+        report::paintReport(printer, charts::reportContent(m_logic->work()), report::printedNow());
     QApplication::restoreOverrideCursor();
     if (pages == 0) {
         charts::reportOutputFailure(m_logic->interactive(), m_logic->errorLog(),

@@ -43,7 +43,7 @@ TEST_F(RunnerEconomicsTest, OptimiseApplyTheBestAndPrintTheFigures) {
     const QString rotation = best->split(QLatin1Char('\t')).value(5);
     // The table now ends with the best regime's final cut.
     const work::ProjectionTable &table = session.main().table();
-    EXPECT_TRUE(session.main().felled());
+    EXPECT_TRUE(session.work().felled());
     EXPECT_EQ(table.row(table.lastRow()).cells.value(work::kColAge), rotation);
     EXPECT_TRUE(lines.contains(QStringLiteral("lblRotation\t") + rotation +
                                QStringLiteral(" years (the final cut of the table)")))

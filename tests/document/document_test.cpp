@@ -117,7 +117,7 @@ TEST_F(DocumentTest, DocumentForAStandGrowsLikeTypedFields) {
     auto built = newSession();
     const rotation::Stand stand{0, 15.0f, 2500.0f, 7.0f, 20.0f};
     built->session.main().restore(document::documentForStand(
-        built->session.main(), stand, {QStringLiteral("Kilbrack"), {}, {}, {}}, 40, 5, 10.0));
+        built->session.work(), stand, {QStringLiteral("Kilbrack"), {}, {}, {}}, 40, 5, 10.0));
     built->run(QStringLiteral("press cmdGrow"));
     const auto builtRows = built->work().rows;
     const auto typedRows = typed->work().rows;
@@ -126,7 +126,7 @@ TEST_F(DocumentTest, DocumentForAStandGrowsLikeTypedFields) {
         EXPECT_EQ(builtRows[r].cells, typedRows[r].cells) << "row " << r + 1;
         EXPECT_EQ(builtRows[r].record, typedRows[r].record) << "row " << r + 1;
     }
-    EXPECT_EQ(built->session.main().identification().forest, QStringLiteral("Kilbrack"));
+    EXPECT_EQ(built->session.work().identification().forest, QStringLiteral("Kilbrack"));
 }
 
 } // namespace

@@ -53,14 +53,14 @@ protected:
         return all;
     }
 
-    economics::HeadlessEconomicsView view;
-    economics::EconomicsWindowLogic economics{logic, thin, view, interactive};
+    economics::HeadlessEconomicsView &view = economicsView;
+    economics::EconomicsWindowLogic &economics = session.economics();
 };
 
 TEST_F(EconomicsWindowTest, FiguresAreTheRotationLibrarysForTheTablesRotation) {
     typeRotation({20, 25, 30}, {QStringLiteral("40"), QStringLiteral("40"), QStringLiteral("40")},
                  45);
-    logic.cashFlow().setInterestRate(3.0);
+    work.cashFlow().setInterestRate(3.0);
     economics.typeText(EconomicsControl::txtEstablishmentCost, QStringLiteral("1800"));
     economics.typeText(EconomicsControl::txtAnnualCost, QStringLiteral("15"));
     economics.cmdEconomics_Click();
@@ -165,7 +165,7 @@ TEST_F(EconomicsWindowTest, BadInputIsRefusedAndKeepsWhatIsShown) {
         EXPECT_EQ(economics.monteCarlo()->histogram.empty() ? 0 : 1, draws);
         economics.typeText(c.field, before);
     }
-    EXPECT_EQ(logic.cashFlow().interestRate(), 5.0) << "a refused rate is not kept";
+    EXPECT_EQ(work.cashFlow().interestRate(), 5.0) << "a refused rate is not kept";
 }
 
 TEST_F(EconomicsWindowTest, CancelStopsTheOptimiser) {
@@ -213,7 +213,7 @@ TEST_F(EconomicsWindowTest, ApplyWritesTheTableAUserWouldType) {
     }
     typeRotation(ages, volumes, chosen.rotation);
     EXPECT_EQ(tableCells(), applied);
-    EXPECT_TRUE(logic.felled());
+    EXPECT_TRUE(work.felled());
 
     // The window now values the applied regime: it scores as the optimiser said.
     economics.cmdCompute_Click();

@@ -255,15 +255,13 @@ class TimberPricesMainTest : public MainWindowTest {
 protected:
     TimberPricesMainTest() {
         copyShippedData(dir.path());
-        logic.attachTimberPrices(&window);
         logic.Form_Load(settings, QRect(0, 0, 1280, 800));
     }
 
     QString file(const char *name) const { return QDir(dir.path()).filePath(QLatin1String(name)); }
 
     QSettings settings{dir.filePath(QStringLiteral("settings.ini")), QSettings::IniFormat};
-    economics::HeadlessTimberPricesView pricesView;
-    economics::TimberPricesWindowLogic window{prices, log, pricesView};
+    economics::TimberPricesWindowLogic &window = session.timberPrices();
 };
 
 TEST_F(TimberPricesMainTest, ShowTimberPricesOpensTheWindowOnTheListsRead) {

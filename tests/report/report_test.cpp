@@ -50,7 +50,7 @@ protected:
 
 TEST_F(ReportTest, ContentCarriesTheRotationAndLeavesTheWindowAsItWas) {
     closeRotation();
-    const charts::ReportContent content = charts::reportContent(logic);
+    const charts::ReportContent content = charts::reportContent(work);
     EXPECT_EQ(content.projection.rows.size(), static_cast<std::size_t>(logic.table().lastRow()));
     EXPECT_EQ(content.projection.captions.size(), content.projection.groups.size());
     EXPECT_FALSE(content.summary.empty());
@@ -74,7 +74,7 @@ TEST_F(ReportTest, PdfHoldsTheTextPagesThenOnePagePerChart) {
     closeRotation();
     const QString pdf = path(QStringLiteral("report.pdf"));
     const int pages =
-        report::writeReportPdf(charts::reportContent(logic), pdf, QStringLiteral("today"));
+        report::writeReportPdf(charts::reportContent(work), pdf, QStringLiteral("today"));
     EXPECT_GE(pages, 4); // at least one page of text and the three charts
     EXPECT_EQ(pdfPages(pdf), pages);
 
@@ -82,7 +82,7 @@ TEST_F(ReportTest, PdfHoldsTheTextPagesThenOnePagePerChart) {
     logic.cmdClear_Click();
     typeStand(QStringLiteral("30"));
     logic.cmdGrow_Click();
-    const charts::ReportContent young = charts::reportContent(logic);
+    const charts::ReportContent young = charts::reportContent(work);
     EXPECT_TRUE(young.cashFlow.empty());
     EXPECT_TRUE(young.cashFlowChart.empty());
     EXPECT_EQ(pdfPages(pdf), pages) << "unchanged until written again";
@@ -93,7 +93,7 @@ TEST_F(ReportTest, PdfHoldsTheTextPagesThenOnePagePerChart) {
 
 TEST_F(ReportTest, UnwritableFilesAreRefused) {
     closeRotation();
-    const charts::ReportContent content = charts::reportContent(logic);
+    const charts::ReportContent content = charts::reportContent(work);
     const QString nowhere = path(QStringLiteral("no-such-folder/file"));
     EXPECT_EQ(report::writeReportPdf(content, nowhere + QStringLiteral(".pdf"), QString()), 0);
     EXPECT_FALSE(report::saveChartPng(content.standChart, nowhere + QStringLiteral(".png"),
@@ -104,7 +104,7 @@ TEST_F(ReportTest, UnwritableFilesAreRefused) {
 
 TEST_F(ReportTest, ChartsExportAsPngAndSvg) {
     closeRotation();
-    const charts::ReportContent content = charts::reportContent(logic);
+    const charts::ReportContent content = charts::reportContent(work);
     const QString png = path(QStringLiteral("stand.png"));
     ASSERT_TRUE(report::saveChartPng(content.standChart, png, QSize(640, 420)));
     const QImage image(png);
@@ -150,13 +150,13 @@ TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
     type(MainControl::txtNetArea, QStringLiteral("10"));
     typeStand(QStringLiteral("40"));
     logic.cmdGrow_Click();
-    logic.setIdentification(
+    work.setIdentification(
         {QStringLiteral("Kilbrack"), QStringLiteral("12"), QStringLiteral("b"), QString()});
     const QString saved = path(QStringLiteral("kilbrack.arbolex"));
     QString reason;
-    ASSERT_TRUE(document::writeDocumentFile(saved, logic.snapshot(), reason))
+    ASSERT_TRUE(document::writeDocumentFile(saved, work.snapshot(), reason))
         << reason.toStdString();
-    EXPECT_EQ(charts::reportContent(logic).forest, QStringLiteral("Kilbrack"));
+    EXPECT_EQ(charts::reportContent(work).forest, QStringLiteral("Kilbrack"));
     EXPECT_EQ(run({saved, QStringLiteral("--out"), pdf}).first, 0);
     EXPECT_EQ(pdfPages(pdf), 3) << "text, stand and increments: no cash flow yet";
 

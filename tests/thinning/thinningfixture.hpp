@@ -20,7 +20,6 @@ protected:
     ThinningTest() {
         const QDir source(QStringLiteral(ARBOLEX_DATA_SOURCE));
         prices::GetPricesFromFiles(source.path(), prices.data(), log);
-        logic.attachThinning(&thin);
     }
 
     void growTo(const QString &to, const QString &by = QStringLiteral("5")) {
@@ -39,8 +38,7 @@ protected:
 
     const work::TableRow &lastRow() const { return logic.table().row(logic.table().lastRow()); }
 
-    thinning::HeadlessThinView thinView;
-    thinning::ThinWindowLogic thin{logic, thinView, interactive};
+    thinning::ThinWindowLogic &thin = session.thinning();
 };
 
 } // namespace arbolex::testing

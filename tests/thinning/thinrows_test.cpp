@@ -21,7 +21,7 @@ TEST_F(ThinningTest, AcceptWithNothingRemovedStoresNothing) {
     thin.cmdAccept_Click();
     EXPECT_EQ(logic.table().rowCount(), rows);
     EXPECT_FALSE(thinView.isShown());
-    EXPECT_TRUE(thin.flags().noThinningYet);
+    EXPECT_FALSE(work.thinned());
 }
 
 TEST_F(ThinningTest, AcceptedThinningRowShowsTheThinnedStandAndItsValue) {
@@ -45,13 +45,13 @@ TEST_F(ThinningTest, AcceptedThinningRowShowsTheThinnedStandAndItsValue) {
     const double price = prices::TrouveIndicePrix(meanTree, prices.data().current, interactive);
     EXPECT_EQ(row.cells[kColValuePerHa],
               shell::formatNumber(row.record.removedVolume * price, u"####0"));
-    EXPECT_GT(logic.timberRevenue().at(30), 0.0);
+    EXPECT_GT(work.timberRevenue().at(30), 0.0);
     // Total production is the stand before the thinning.
     EXPECT_EQ(row.cells[kColTotBasalArea], shell::formatNumber(w.preBasalArea, u"##0.0"));
     // The thinned stand is the new grow-from stand.
     EXPECT_EQ(view.text(MainControl::txtFromB), row.cells[kColBasalArea]);
     EXPECT_EQ(view.text(MainControl::txtFromN), row.cells[kColStocking]);
-    EXPECT_FALSE(thin.flags().noThinningYet);
+    EXPECT_TRUE(work.thinned());
     EXPECT_FALSE(thinView.isShown());
 }
 

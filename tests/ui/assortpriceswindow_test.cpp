@@ -20,13 +20,7 @@ using economics::AssortPricesControl;
 
 class AssortPricesGuiTest : public MainWindowGuiTest {
 protected:
-    AssortPricesGuiTest() {
-        pricesWindow.attach(pricesLogic);
-        assortWindow.attach(assortLogic);
-        pricesLogic.attachAssortmentPrices(&assortLogic);
-        logic.attachTimberPrices(&pricesLogic);
-        window.show();
-    }
+    AssortPricesGuiTest() { window.show(); }
 
     QLineEdit *priceField(int k) const {
         return qobject_cast<QLineEdit *>(
@@ -36,10 +30,10 @@ protected:
         qobject_cast<QPushButton *>(assortWindow.control({c, 0}))->click();
     }
 
-    ui::TimberPricesWindow pricesWindow{&window};
-    economics::TimberPricesWindowLogic pricesLogic{prices, log, pricesWindow};
-    ui::AssortPricesWindow assortWindow{&window};
-    economics::AssortPricesWindowLogic assortLogic{prices.data(), log, assortWindow, interactive};
+    ui::TimberPricesWindow &pricesWindow = desktop.pricesWindow();
+    economics::TimberPricesWindowLogic &pricesLogic = session.timberPrices();
+    ui::AssortPricesWindow &assortWindow = desktop.assortPricesWindow();
+    economics::AssortPricesWindowLogic &assortLogic = session.assortPrices();
 };
 
 TEST_F(AssortPricesGuiTest, OpenedFromTheTimberPricesAndEditedThroughTheKeyFilter) {

@@ -23,8 +23,6 @@ using estatewindow::EstateResultsModel;
 class EstateWindowGuiTest : public MainWindowGuiTest {
 protected:
     EstateWindowGuiTest() {
-        estateWindow.attach(estate);
-        documents.start();
         QFile example(QDir(QStringLiteral(ARBOLEX_DATA_SOURCE))
                           .filePath(QStringLiteral("examples/estate.csv")));
         QFile marked(dir.filePath(QStringLiteral("marked.csv")));
@@ -42,11 +40,9 @@ protected:
         QCoreApplication::processEvents();
     }
 
-    ui::ThinWindow thinWindow{&window};
-    thinning::ThinWindowLogic thin{logic, thinWindow, interactive};
-    document::DocumentController documents{logic, interactive, nullptr};
-    ui::EstateWindow estateWindow{&window};
-    estatewindow::EstateWindowLogic estate{logic, thin, documents, estateWindow, interactive};
+    document::DocumentController &documents = session.documents();
+    ui::EstateWindow &estateWindow = desktop.estateWindow();
+    estatewindow::EstateWindowLogic &estate = session.estate();
 };
 
 TEST_F(EstateWindowGuiTest, SortedTableOpensTheRowDoubleClickedAndMarksTheRefused) {
@@ -78,7 +74,7 @@ TEST_F(EstateWindowGuiTest, SortedTableOpensTheRowDoubleClickedAndMarksTheRefuse
 
     table->sortByColumn(EstateResultsModel::kNpvColumn, Qt::DescendingOrder);
     emit table->doubleClicked(shown->index(0, EstateResultsModel::kNpvColumn));
-    EXPECT_EQ(logic.identification().subCompartment, bestId);
+    EXPECT_EQ(work.identification().subCompartment, bestId);
     EXPECT_EQ(documents.displayName(), bestId);
     // The chart: one stacked set per species over every year of the forecast.
     const auto *view = estateWindow.findChild<QChartView *>();

@@ -2,6 +2,7 @@
 // grow and clear commands through their buttons, the grid and its selection,
 // the model menu and closing the window.
 #include "guifixture.hpp"
+#include "work/worktexts.hpp"
 
 #include "shell/vbformat.hpp"
 #include "ui/projectionmodel.hpp"
@@ -94,7 +95,7 @@ TEST_F(MainWindowGuiTest, GrowButtonFillsTheGridWithTheLogicsRows) {
         }
     }
     EXPECT_EQ(model.data(model.index(0, 0)).toString(), QStringLiteral("15"));
-    EXPECT_EQ(model.headerData(0, Qt::Vertical).toString(), workflow::text::rowLabelGrowth());
+    EXPECT_EQ(model.headerData(0, Qt::Vertical).toString(), work::text::rowLabelGrowth());
 
     // The grid follows the logic's current row: the last one.
     EXPECT_EQ(table.currentRow(), 8);
@@ -153,7 +154,7 @@ TEST_F(MainWindowGuiTest, ModelMenuListsTheCatalogueAndSwitchesTheModel) {
 
     entries[3]->trigger();
     EXPECT_EQ(grow.modelId(), 3);
-    EXPECT_TRUE(window.windowTitle().endsWith(QStringLiteral("NS - (UnThinned)")));
+    EXPECT_TRUE(window.windowTitle().contains(QStringLiteral("MODEL IN USE :  NS - (UnThinned)")));
     EXPECT_EQ(window.modelMenu()->checkedAction(), entries[3]);
 
     // A model chosen elsewhere is marked in the menu too.
@@ -167,7 +168,10 @@ TEST_F(MainWindowGuiTest, ClosingTheWindowSavesPlacementAndStartupFile) {
     window.setPlacement(QRect(40, 60, 1160, 720));
     field(MainControl::txtFromA)->setText(QStringLiteral("22"));
     QFile::remove(dir.filePath(QStringLiteral("IFPRM1.dat")));
+    // The changed field is unsaved work: the window asks, and it is discarded.
+    interactive.unsavedAnswers = {shell::UnsavedChoice::Discard};
     window.close();
+    EXPECT_EQ(interactive.questions.size(), 1);
     settings.sync();
     EXPECT_EQ(settings.value(QStringLiteral("Settings/MainWidth")).toInt(), 1160);
     EXPECT_EQ(settings.value(QStringLiteral("Settings/MainHeight")).toInt(), 720);

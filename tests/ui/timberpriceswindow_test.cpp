@@ -20,11 +20,7 @@ void click(QWidget *button) {
 
 class TimberPricesGuiTest : public MainWindowGuiTest {
 protected:
-    TimberPricesGuiTest() {
-        pricesWindow.attach(pricesLogic);
-        logic.attachTimberPrices(&pricesLogic);
-        window.show();
-    }
+    TimberPricesGuiTest() { window.show(); }
 
     QLineEdit *priceField(int index) const {
         return qobject_cast<QLineEdit *>(
@@ -39,8 +35,8 @@ protected:
         typeKeys(edit, keys);
     }
 
-    ui::TimberPricesWindow pricesWindow{&window};
-    economics::TimberPricesWindowLogic pricesLogic{prices, log, pricesWindow};
+    ui::TimberPricesWindow &pricesWindow = desktop.pricesWindow();
+    economics::TimberPricesWindowLogic &pricesLogic = session.timberPrices();
 };
 
 TEST_F(TimberPricesGuiTest, ShowTimberPricesOpensTheListsBesideTheirClasses) {

@@ -1,14 +1,18 @@
 // The grow-from fields: the key filter, the lost-focus handlers that show the
-// site index, the form and range checks, and reading and writing the values.
+// site index, and the form and range checks of the grow command.
+#include "workflow/growfrompanel.hpp"
+
+#include "engine/grow.hpp"
 #include "rotation/rotation.hpp"
 #include "rotation/standchecks.hpp"
+#include "rotation/standmath.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
 #include "shell/vbtext.hpp"
+#include "work/standwork.hpp"
+#include "workflow/imainview.hpp"
 #include "workflow/mainmessages.hpp"
-#include "workflow/mainwindowlogic.hpp"
-#include "workflow/standmath.hpp"
 
 namespace arbolex::workflow {
 
@@ -17,29 +21,61 @@ using shell::isNumeric;
 using shell::val;
 
 namespace {
-using rotation::kHeightFieldLimit;
 
 float valF(const QString &text) {
     return static_cast<float>(val(text));
 }
+
 } // namespace
 
-bool MainWindowLogic::KeyFilter(QChar key) {
+GrowFromPanel::GrowFromPanel(work::StandWork &work, engine::Grow &grow, shell::ErrorLog &log,
+                             IMainView &view, shell::IInteractive &interactive)
+    : m_work(work), m_grow(grow), m_log(log), m_view(view), m_interactive(interactive) {
+    // The window shows what the work holds; a field the user is typing in
+    // already shows it and is left alone.
+    m_fieldShown =
+        QObject::connect(&work, &work::StandWork::fieldChanged, [this](work::WorkField f) {
+            const MainControl c = controlOf(f);
+            if (m_view.text(c) != m_work.field(f)) {
+                m_view.setText(c, m_work.field(f));
+            }
+        });
+    m_siteIndexShown = QObject::connect(&work, &work::StandWork::siteIndexChanged, [this] {
+        m_view.setText(MainControl::lblSI, m_work.siteIndexText());
+    });
+}
+
+GrowFromPanel::~GrowFromPanel() {
+    QObject::disconnect(m_fieldShown);
+    QObject::disconnect(m_siteIndexShown);
+}
+
+const QString &GrowFromPanel::field(MainControl control) const {
+    return m_work.field(workFieldOf(control));
+}
+
+bool GrowFromPanel::KeyFilter(QChar key) {
     return key.isDigit() || key == QLatin1Char('.');
 }
 
-void MainWindowLogic::typeText(MainControl control, const QString &text) {
+void GrowFromPanel::typeText(MainControl control, const QString &text) {
     QString typed;
     for (const QChar c : text) {
         if (!isNumericField(control) || KeyFilter(c)) {
             typed.append(c);
         }
     }
-    m_view.setText(control, typed);
+    fieldEdited(control, typed);
     leaveField(control);
 }
 
-void MainWindowLogic::leaveField(MainControl control) {
+void GrowFromPanel::fieldEdited(MainControl control, const QString &text) {
+    if (isNumericField(control)) {
+        m_work.setField(workFieldOf(control), text);
+    }
+}
+
+void GrowFromPanel::leaveField(MainControl control) {
     if (control == MainControl::txtFromA) {
         txtFromA_LostFocus();
     } else if (control == MainControl::txtFromH) {
@@ -47,16 +83,15 @@ void MainWindowLogic::leaveField(MainControl control) {
     }
 }
 
-void MainWindowLogic::showSiteIndex(float age, float topHeight) {
+void GrowFromPanel::showSiteIndex(float age, float topHeight) {
     showSiteIndex(m_grow.SiteIndex(age, topHeight));
 }
 
-void MainWindowLogic::showSiteIndex(bool known) {
-    m_view.setText(MainControl::lblSI,
-                   known ? formatNumber(m_grow.siteIndex(), u"#.0") : QString());
+void GrowFromPanel::showSiteIndex(bool known) {
+    m_work.setSiteIndexText(known ? formatNumber(m_grow.siteIndex(), u"#.0") : QString());
 }
 
-void MainWindowLogic::txtFromA_LostFocus() {
+void GrowFromPanel::txtFromA_LostFocus() {
     shell::guard(m_log, QStringLiteral(" in frmMain.txtFromA_LostFocus()"), [&] {
         const float age = valF(field(MainControl::txtFromA));
         const float height = valF(field(MainControl::txtFromH));
@@ -66,12 +101,12 @@ void MainWindowLogic::txtFromA_LostFocus() {
     });
 }
 
-void MainWindowLogic::txtFromH_LostFocus() {
+void GrowFromPanel::txtFromH_LostFocus() {
     shell::guard(m_log, QStringLiteral(" in frmMain.txtFromH_LostFocus()"), [&] {
         const float height = valF(field(MainControl::txtFromH));
-        if (height > kHeightFieldLimit) {
+        if (height > rotation::kHeightFieldLimit) {
             // The typed height stays for the user to correct.
-            message(text::titleOstran(), text::maximumHeight(), shell::kExclamation);
+            m_interactive.message(text::titleOstran(), text::maximumHeight(), shell::kExclamation);
             m_view.focus(MainControl::txtFromH);
             return;
         }
@@ -82,14 +117,14 @@ void MainWindowLogic::txtFromH_LostFocus() {
     });
 }
 
-bool MainWindowLogic::refuse(const QString &title, const QString &text, int style,
-                             MainControl control) {
-    message(title, text, style);
+bool GrowFromPanel::refuse(const QString &title, const QString &text, int style,
+                           MainControl control) {
+    m_interactive.message(title, text, style);
     m_view.focus(control);
     return false;
 }
 
-bool MainWindowLogic::ChkGrowFromFlds() {
+bool GrowFromPanel::ChkGrowFromFlds() {
     const QString title = text::titleOstran();
     const int style = shell::kExclamation;
     struct Required {
@@ -124,11 +159,7 @@ bool MainWindowLogic::ChkGrowFromFlds() {
     return true;
 }
 
-int MainWindowLogic::maxTargetAge() const {
-    return rotation::modelAgeLimit(m_grow.modelId());
-}
-
-bool MainWindowLogic::ChkGrowFromBnds() {
+bool GrowFromPanel::ChkGrowFromBnds() {
     // The ranges, their order and their messages are the grow command's own,
     // shared with every rotation grown without the window.
     const auto refused = [&](const rotation::GrowFromFault &fault) {
@@ -140,7 +171,7 @@ bool MainWindowLogic::ChkGrowFromBnds() {
     };
     if (const auto fault = rotation::standRangeFault(
             valF(field(MainControl::txtFromA)), valF(field(MainControl::txtFromN)),
-            valF(field(MainControl::txtFromH)), maxTopHeight())) {
+            valF(field(MainControl::txtFromH)), m_grow.maxTopHeight())) {
         return refused(*fault);
     }
     if (!ChkGrowFromBD()) {
@@ -148,13 +179,14 @@ bool MainWindowLogic::ChkGrowFromBnds() {
                       shell::kExclamationOkCancel, MainControl::txtFromD);
     }
     if (const auto fault = rotation::basalAreaAndTargetFault(
-            valF(field(MainControl::txtFromB)), valF(field(MainControl::txtToA)), maxTargetAge())) {
+            valF(field(MainControl::txtFromB)), valF(field(MainControl::txtToA)),
+            rotation::modelAgeLimit(m_grow.modelId()))) {
         return refused(*fault);
     }
     return true;
 }
 
-bool MainWindowLogic::ChkGrowFromBD() {
+bool GrowFromPanel::ChkGrowFromBD() {
     try {
         float stocking = valF(field(MainControl::txtFromN));
         const bool haveBasalArea = isNumeric(field(MainControl::txtFromB));
@@ -162,12 +194,12 @@ bool MainWindowLogic::ChkGrowFromBD() {
         if (haveBasalArea) {
             // The basal area wins whenever it is given.
             float basalArea = valF(field(MainControl::txtFromB));
-            const float dbh = dbhFromBasalArea(basalArea, stocking);
-            m_view.setText(MainControl::txtFromD, formatNumber(dbh, u"##0.0"));
+            const float dbh = rotation::dbhFromBasalArea(basalArea, stocking);
+            m_work.setField(work::WorkField::FromDbh, formatNumber(dbh, u"##0.0"));
         } else if (haveDbh) {
             const float dbh = valF(field(MainControl::txtFromD));
-            m_view.setText(MainControl::txtFromB,
-                           formatNumber(basalAreaFromDbh(stocking, dbh), u"##0.00"));
+            m_work.setField(work::WorkField::FromBasalArea,
+                            formatNumber(rotation::basalAreaFromDbh(stocking, dbh), u"##0.00"));
         }
         return true;
     } catch (const shell::AppFault &fault) {
@@ -176,7 +208,7 @@ bool MainWindowLogic::ChkGrowFromBD() {
     }
 }
 
-GrowFrom MainWindowLogic::GetGrowFrom() const {
+GrowFrom GrowFromPanel::GetGrowFrom() const {
     GrowFrom g;
     g.age = valF(field(MainControl::txtFromA));
     g.stocking = valF(field(MainControl::txtFromN));
@@ -186,30 +218,6 @@ GrowFrom MainWindowLogic::GetGrowFrom() const {
     g.targetAge = valF(field(MainControl::txtToA));
     g.step = valF(field(MainControl::txtByA));
     return g;
-}
-
-bool MainWindowLogic::SetGrowFrom(float age, float basalArea, float stocking, float topHeight,
-                                  float targetAge, float step) {
-    // The age is written only forward: a field that already holds a later age keeps it.
-    if (age > 0.0f && valF(field(MainControl::txtFromA)) < age) {
-        m_view.setText(MainControl::txtFromA, formatNumber(age, u"##0"));
-    }
-    if (basalArea > 0.0f) {
-        m_view.setText(MainControl::txtFromB, formatNumber(basalArea, u"##0.00"));
-    }
-    if (stocking > 0.0f) {
-        m_view.setText(MainControl::txtFromN, formatNumber(stocking, u"#####0"));
-    }
-    if (topHeight > 0.0f) {
-        m_view.setText(MainControl::txtFromH, formatNumber(topHeight, u"##0.0"));
-    }
-    if (targetAge > 0.0f) {
-        m_view.setText(MainControl::txtToA, formatNumber(targetAge, u"##0"));
-    }
-    if (step >= 0.0f) {
-        m_view.setText(MainControl::txtByA, formatNumber(step, u"##0"));
-    }
-    return true;
 }
 
 } // namespace arbolex::workflow
