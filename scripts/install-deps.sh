@@ -14,9 +14,10 @@ if [[ "${1:-}" != "--no-gui" ]]; then
     # qt6-svg-dev draw and export the charts (Qt Charts needs the OpenGL module
     # present to configure); libgdal-dev reads and writes the
     # estate's spreadsheets and GIS layers; poppler-utils turns reports into
-    # pages to look at.
+    # pages to look at; python3-jsonschema checks the command-line program's
+    # JSON against docs/schemas/ in the tests.
     packages+=(qt6-base-dev qt6-multimedia-dev qt6-charts-dev libqt6opengl6-dev qt6-svg-dev libgl-dev
-               libgdal-dev poppler-utils
+               libgdal-dev poppler-utils python3-jsonschema
                fonts-dejavu-core xvfb xauth
                desktop-file-utils appstream shared-mime-info)
 fi

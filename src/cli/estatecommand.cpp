@@ -3,11 +3,13 @@
 // estate's harvest forecast.
 #include "cli/command.hpp"
 #include "cli/options.hpp"
+#include "cli/resultdocument.hpp"
 #include "cli/rotationinput.hpp"
 #include "estateio/estatefiles.hpp"
 #include "shell/errorlog.hpp"
 
 #include <QDate>
+#include <QJsonDocument>
 
 #include <chrono>
 #include <cstdio>
@@ -44,8 +46,9 @@ int defaultThreads() {
     return static_cast<int>(std::max(1U, std::thread::hardware_concurrency()));
 }
 
-/// The estate job of the command line. Throws UsageError.
-estateio::EstateJob readJob(const QStringList &arguments, const QString &dataFolder) {
+/// The estate job of the command line, recorded in `run`. Throws UsageError.
+estateio::EstateJob readJob(const QStringList &arguments, const QString &dataFolder,
+                            RunRecord &run) {
     if (arguments.isEmpty() || arguments.first().startsWith(QLatin1String("--"))) {
         throw UsageError{
             QStringLiteral("the input file is missing (arbolex-cli estate INPUT ...)")};
@@ -54,27 +57,72 @@ estateio::EstateJob readJob(const QStringList &arguments, const QString &dataFol
     for (const char *name : economicsOptionNames()) {
         known.push_back(name);
     }
-    known.insert(known.end(), {"rotation", "out", "year", "threads", "shard", "layer"});
+    known.insert(known.end(),
+                 {"rotation", "out", "year", "threads", "shard", "layer", kFormatOption});
     const Options options(arguments.mid(1), known);
     estateio::EstateJob job;
     job.input = arguments.first().toStdString();
+    run.input(QStringLiteral("input"), Value::word(arguments.first()));
     job.outFolder = options.has("out") ? options.text("out").toStdString() : std::string(".");
     job.layer = options.has("layer") ? options.text("layer").toStdString() : std::string();
     job.defaults.regime = readRegime(options);
+    run.inputs(regimeFields(job.defaults.regime));
     if (options.has("rotation")) {
         job.defaults.rotation = options.wholeNumber("rotation", 1, 200);
+        run.input(QStringLiteral("rotation"), Value::whole(*job.defaults.rotation));
     }
     job.defaults.year =
         options.has("year") ? options.wholeNumber("year", 1, 9999) : QDate::currentDate().year();
-    job.defaults.economics = readEconomics(options, dataFolder);
+    job.defaults.economics = readEconomics(options, dataFolder, run);
     job.settings.threads =
         options.has("threads") ? options.wholeNumber("threads", 1, 1024) : defaultThreads();
+    Shard shard;
     if (options.has("shard")) {
-        const Shard shard = readShard(options.text("shard"));
+        shard = readShard(options.text("shard"));
         job.settings.shardIndex = shard.index;
         job.settings.shardCount = shard.count;
     }
+    const Format format = readFormat(options, Format::kCsv);
+    job.format = format == Format::kJson  ? estate::TableFormat::kJson
+                 : format == Format::kTsv ? estate::TableFormat::kTsv
+                                          : estate::TableFormat::kCsv;
+    run.inputs(
+        {{QStringLiteral("out"), Value::word(QString::fromStdString(job.outFolder))},
+         {QStringLiteral("year"), Value::whole(job.defaults.year)},
+         {QStringLiteral("threads"), Value::whole(job.settings.threads)},
+         {QStringLiteral("shard"), Value::word(QString::number(shard.index + 1) + QLatin1Char('/') +
+                                               QString::number(shard.count))},
+         {QStringLiteral("format"), Value::word(formatWord(format))}});
+    if (!job.layer.empty()) {
+        run.input(QStringLiteral("layer"), Value::word(QString::fromStdString(job.layer)));
+    }
     return job;
+}
+
+/// The members that open each JSON result table: the run record (the input
+/// and its files' SHA-256 among them) and the units of the table's figures.
+/// The input is read for its checksum only when JSON is asked for.
+void prepareJson(estateio::EstateJob &job, RunRecord &run) {
+    if (job.format != estate::TableFormat::kJson) {
+        return;
+    }
+    for (const std::string &file : estateio::datasetFiles(job.input)) {
+        const QString path = QString::fromStdString(file);
+        run.fileRead(path, path);
+    }
+    job.jsonMembers = [run](const std::vector<estate::ResultColumn> &columns) {
+        ResultDocument document(run, units::Table::kEstate);
+        QStringList figures;
+        for (const estate::ResultColumn &c : columns) {
+            if (c.type != estate::ColumnType::kText) {
+                figures << QString::fromStdString(c.name);
+            }
+        }
+        document.addStreamedFigures(figures);
+        QByteArray members = QJsonDocument(document.json()).toJson(QJsonDocument::Compact);
+        // The members without the object's braces: the rows follow them.
+        return members.mid(1, members.size() - 2).toStdString();
+    };
 }
 
 /// "12345 rows, 98000 rows/s, 0:07 left" on one line of a terminal.
@@ -121,12 +169,14 @@ private:
 
 int runEstate(CommandContext &context) {
     estateio::EstateJob job;
+    RunRecord run(QStringLiteral("estate"));
     try {
-        job = readJob(context.arguments, context.dataFolder);
+        job = readJob(context.arguments, context.dataFolder, run);
     } catch (const UsageError &error) {
         context.err << "arbolex-cli estate: " << error.text << '\n';
         return kExitBadArguments;
     }
+    prepareJson(job, run);
     shell::ErrorLog log(context.dataFolder);
     ProgressLine progressLine(context.err, job.settings.shardCount);
     estateio::EstateCallbacks callbacks;
@@ -152,7 +202,10 @@ int runEstate(CommandContext &context) {
     const long long bad = summary.refused + summary.failed;
     if (bad > 0) {
         context.err << "arbolex-cli estate: " << bad << " of " << summary.rows
-                    << " rows not grown (see errors.csv)\n";
+                    << " rows not grown (see "
+                    << QString::fromStdString(
+                           estateio::resultFileName(estateio::kErrorsTable, job.format))
+                    << ")\n";
         return kExitEngineFailure;
     }
     return kExitSuccess;
@@ -169,14 +222,17 @@ Command estateCommand() {
                 "                           [--thin-until AGE]] [--rotation R] [--rate P]\n"
                 "                          [--establishment-cost C] [--annual-cost C]\n"
                 "                          [--prices current|user|longterm|private]\n"
-                "                          [--threads N] [--shard K/N] [--data-dir DIR]\n"
+                "                          [--threads N] [--shard K/N] [--format csv|tsv|json]\n"
+                "                          [--data-dir DIR]\n"
                 "\n"
                 "INPUT is a CSV file with a header row, or a GeoPackage, Shapefile or any\n"
                 "vector layer GDAL reads (--layer NAME, default the first). Its columns, by name\n"
                 "in any order: id, model, age, stocking, top_height, basal_area or dbh, area_ha,\n"
                 "and optionally thin_from, thin_every, thin_volume, thin_until and rotation\n"
                 "(empty: the command line's value; no rotation anywhere: the economic\n"
-                "rotation). Other columns are carried through to the results.\n"
+                "rotation). Other columns are carried through to the results. A CSV file whose\n"
+                "fields are separated by semicolons may write its numbers with a decimal comma\n"
+                "(\"7,0\"), as a spreadsheet with European settings exports it.\n"
                 "Each row is grown and valued as `arbolex-cli rotation` does. Writes in DIR\n"
                 "(default .): subcompartments.csv (one line per input row, in input order),\n"
                 "forecast.csv (harvests by calendar year from Y, default this year, for the\n"
@@ -184,7 +240,8 @@ Command estateCommand() {
                 "grown) and, for a GIS layer, subcompartments.gpkg with the input's geometry.\n"
                 "--threads N grows rows on N threads (default: all cores); the output is the\n"
                 "same whatever N. --shard K/N takes every N-th row from the K-th: the parts of\n"
-                "several runs merge by line, and their forecasts add up.\n"
+                "several runs merge by line, and their forecasts add up. --format tsv or json\n"
+                "writes the tables as .tsv or .json files instead (default csv; docs/cli.md).\n"
                 "Exit status: 0 every row grown, 1 some rows not grown, 2 the command line\n"
                 "or the input is wrong.\n"
                 "\n") +

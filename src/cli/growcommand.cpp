@@ -1,8 +1,11 @@
 // arbolex-cli grow: type a stand into the main window, press Grow, print the
 // table as the grid shows it.
 #include "cli/command.hpp"
+#include "cli/gridoutput.hpp"
 #include "cli/headlesssession.hpp"
 #include "cli/options.hpp"
+#include "cli/resultdocument.hpp"
+#include "cli/standinput.hpp"
 #include "shell/vbformat.hpp"
 
 namespace arbolex::cli {
@@ -11,70 +14,36 @@ namespace {
 
 using workflow::MainControl;
 
-QString csvCell(QString cell) {
-    if (cell.contains(QLatin1Char(',')) || cell.contains(QLatin1Char('"'))) {
-        cell.replace(QLatin1Char('"'), QStringLiteral("\"\""));
-        return QLatin1Char('"') + cell + QLatin1Char('"');
+/// The grid in the format asked for.
+QByteArray gridOutput(Format format, const RunRecord &run, const work::ProjectionTable &table) {
+    if (format == Format::kJson) {
+        ResultDocument document(run);
+        document.insert(QStringLiteral("columns"), QJsonArray::fromStringList(gridKeys(table)));
+        document.insert(QStringLiteral("rows"), gridJson(table));
+        return document.bytes();
     }
-    return cell;
-}
-
-QString jsonString(QString s) {
-    s.replace(QLatin1Char('\\'), QStringLiteral("\\\\"))
-        .replace(QLatin1Char('"'), QStringLiteral("\\\""));
-    return QLatin1Char('"') + s + QLatin1Char('"');
-}
-
-void printGrid(const std::vector<QStringList> &grid, const QString &format, QTextStream &out) {
-    if (format == QLatin1String("json")) {
-        auto array = [](const QStringList &cells) {
-            QStringList quoted;
-            for (const QString &c : cells) {
-                quoted << jsonString(c);
-            }
-            return QLatin1Char('[') + quoted.join(QStringLiteral(", ")) + QLatin1Char(']');
-        };
-        out << "{\n  \"columns\": " << array(grid.front()) << ",\n  \"rows\": [";
-        for (std::size_t r = 1; r < grid.size(); ++r) {
-            out << (r == 1 ? "\n    " : ",\n    ") << array(grid[r]);
-        }
-        out << "\n  ]\n}\n";
-        return;
-    }
-    const QChar separator = format == QLatin1String("csv") ? QLatin1Char(',') : QLatin1Char('\t');
-    for (const QStringList &row : grid) {
-        QStringList cells;
-        for (const QString &c : row) {
-            cells << (separator == QLatin1Char(',') ? csvCell(c) : c);
-        }
-        out << cells.join(separator) << '\n';
-    }
+    TextOutput text(format);
+    text.table(gridTable(table, false));
+    return text.bytes();
 }
 
 int grow(CommandContext &context) {
-    QString format = QStringLiteral("tsv");
-    QStringList arguments = context.arguments;
-    const qsizetype at = arguments.indexOf(QStringLiteral("--format"));
-    if (at >= 0) {
-        format = arguments.value(at + 1);
-        arguments.remove(at, std::min<qsizetype>(2, arguments.size() - at));
-        if (format != QLatin1String("tsv") && format != QLatin1String("csv") &&
-            format != QLatin1String("json")) {
-            context.err << "arbolex-cli grow: --format takes tsv, csv or json\n";
-            return kExitBadArguments;
-        }
-    }
     try {
-        const Options options(
-            arguments, {"model", "age", "stocking", "height", "basal-area", "dbh", "to", "by"});
+        const Options options(context.arguments, {"model", "age", "stocking", "height",
+                                                  "basal-area", "dbh", "to", "by", kFormatOption});
         const int model = options.wholeNumber("model", 0, 21);
         const int diameterGiven = options.oneOf({"basal-area", "dbh"});
+        const Format format = readFormat(options);
+        RunRecord run(QStringLiteral("grow"));
+        run.input(QStringLiteral("model"), Value::whole(model));
         // Messages of the window go to stderr, the table to stdout.
         HeadlessSession session(context.dataFolder, context.err);
         workflow::MainWindowLogic &main = session.main();
         main.mnuModel_Click(model);
         auto type = [&](MainControl c, const char *option) {
-            main.typeText(c, shell::generalNumber(options.number(option)));
+            const double typed = options.number(option);
+            run.input(inputKey(option), Value::exact(typed));
+            main.typeText(c, shell::generalNumber(typed));
         };
         type(MainControl::txtFromA, "age");
         type(MainControl::txtFromN, "stocking");
@@ -86,12 +55,13 @@ int grow(CommandContext &context) {
         }
         type(MainControl::txtToA, "to");
         type(MainControl::txtByA, "by");
+        run.setFormat(format);
         main.cmdGrow_Click();
         context.err.flush();
         if (main.table().empty()) {
             return kExitBadArguments; // the window refused the stand; stderr says why
         }
-        printGrid(main.table().visibleGrid(), format, context.out);
+        writeOutput(context.out, gridOutput(format, run, main.table()));
         return session.interactive().messagesShown() > 0 ? kExitEngineFailure : kExitSuccess;
     } catch (const UsageError &e) {
         context.err << "arbolex-cli grow: " << e.text << '\n';
@@ -110,7 +80,9 @@ Command growCommand() {
                 "                        [--format tsv|csv|json] [--data-dir DIR]\n"
                 "\n"
                 "Types the stand into the main window's fields, presses Grow and prints the\n"
-                "projection table as the grid shows it, header row first. The window's checks\n"
+                "projection table as the grid shows it, header row first (the marker of the\n"
+                "rows the summary carries as an empty cell); in JSON one object per row with\n"
+                "its label, in_summary and the figures by key. The window's checks\n"
                 "apply: a refused stand prints its message on stderr and exits with 2; a\n"
                 "projection that failed part-way prints the rows it made and exits with 1.\n"),
             &grow};

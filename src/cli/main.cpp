@@ -44,6 +44,8 @@ QString overview() {
     }
     text += QStringLiteral(
         "\n"
+        "Every command that prints a result takes --format tsv|csv|json; the JSON carries\n"
+        "the run record that reproduces it and the units of its figures (docs/cli.md).\n"
         "Engine messages and failure lines go to stderr as MSG<TAB>title<TAB>text<TAB>style\n"
         "and LOG<TAB>line; failure lines are also appended to ErrorLog.txt in the data\n"
         "folder: --data-dir DIR, else $ARBOLEX_DATA_DIR, else the program's folder, or\n"

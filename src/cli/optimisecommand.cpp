@@ -6,10 +6,6 @@
 #include "cli/standinput.hpp"
 #include "rotation/optimiser.hpp"
 
-#include <QJsonArray>
-#include <QJsonDocument>
-#include <QJsonObject>
-
 #include <cstdio>
 
 #include <unistd.h>
@@ -29,6 +25,15 @@ constexpr Objective kObjectives[] = {{"lev", rotation::Objective::kLev},
                                      {"npv", rotation::Objective::kNpv},
                                      {"volume", rotation::Objective::kVolume}};
 
+QString objectiveWord(rotation::Objective objective) {
+    for (const Objective &o : kObjectives) {
+        if (o.objective == objective) {
+            return QLatin1String(o.word);
+        }
+    }
+    return {};
+}
+
 rotation::Objective readObjective(const Options &options) {
     if (!options.has("objective")) {
         return rotation::Objective::kLev;
@@ -42,44 +47,45 @@ rotation::Objective readObjective(const Options &options) {
     throw UsageError{QStringLiteral("--objective takes lev, npv or volume")};
 }
 
-QJsonValue orNull(bool thins, double x) {
-    return thins ? QJsonValue(x) : QJsonValue(QJsonValue::Null);
-}
+/// The columns of a regime found, after "rank".
+const QStringList kCandidateColumns = {QStringLiteral("thin_from"),   QStringLiteral("thin_every"),
+                                       QStringLiteral("thin_volume"), QStringLiteral("thin_until"),
+                                       QStringLiteral("rotation"),    QStringLiteral("npv"),
+                                       QStringLiteral("lev"),         QStringLiteral("volume")};
 
-QJsonObject candidateJson(const Candidate &c) {
+/// A regime's figures in the order of kCandidateColumns; its thinning is
+/// empty when it does not thin.
+std::vector<Value> candidateCells(const Candidate &c) {
     const rotation::Regime &g = c.regime;
     const bool thins = g.thins();
-    return {{QStringLiteral("thin_from"), orNull(thins, g.thinFrom)},
-            {QStringLiteral("thin_every"), orNull(thins, g.thinEvery)},
-            {QStringLiteral("thin_volume"), orNull(thins, formatNumber(g.thinVolume).toDouble())},
-            {QStringLiteral("thin_until"), orNull(thins, g.thinUntil.value_or(0))},
-            {QStringLiteral("rotation"), c.rotation},
-            {QStringLiteral("npv"), moneyJson(c.npv)},
-            {QStringLiteral("lev"), moneyJson(c.lev)},
-            {QStringLiteral("volume"), formatNumber(c.volume).toDouble()}};
-}
-
-QString candidateLine(const QString &label, const Candidate &c) {
-    const rotation::Regime &g = c.regime;
-    const bool thins = g.thins();
-    auto field = [&](double x) {
-        return thins ? formatNumber(x) : QString();
+    auto thinning = [&](double x) {
+        return thins ? Value::number(x) : Value();
     };
-    return label + QLatin1Char('\t') + field(g.thinFrom) + QLatin1Char('\t') + field(g.thinEvery) +
-           QLatin1Char('\t') + field(g.thinVolume) + QLatin1Char('\t') +
-           field(g.thinUntil.value_or(0)) + QLatin1Char('\t') + QString::number(c.rotation) +
-           QLatin1Char('\t') + moneyText(c.npv) + QLatin1Char('\t') + moneyText(c.lev) +
-           QLatin1Char('\t') + formatNumber(c.volume) + QLatin1Char('\n');
+    return {thinning(g.thinFrom),     thinning(g.thinEvery),
+            thinning(g.thinVolume),   thinning(g.thinUntil.value_or(0)),
+            Value::whole(c.rotation), Value::money(c.npv),
+            Value::money(c.lev),      Value::number(c.volume)};
+}
+
+/// The regimes found (and the current one) as a table of kCandidateColumns.
+Table candidateTable(const std::vector<Candidate> &candidates) {
+    Table table(kCandidateColumns);
+    for (const Candidate &c : candidates) {
+        table.add(candidateCells(c));
+    }
+    return table;
 }
 
 int runOptimise(CommandContext &context) {
     const QString command = QStringLiteral("optimise");
     RotationInput in;
     rotation::OptimiserSettings settings;
+    double maxRemovalPercent = settings.maxRemovalShare * 100.0;
+    RunRecord run(command);
     try {
         const Options options(context.arguments, rotationOptionNames({"objective", "max-removal",
                                                                       "min-stocking", "top"}));
-        in = readRotationInput(options, context.dataFolder);
+        in = readRotationInput(options, context.dataFolder, run);
         settings.objective = readObjective(options);
         if (options.has("max-removal")) {
             const double percent = options.positive("max-removal");
@@ -87,6 +93,7 @@ int runOptimise(CommandContext &context) {
                 throw UsageError{QStringLiteral("--max-removal is a percentage up to 100")};
             }
             settings.maxRemovalShare = percent / 100.0;
+            maxRemovalPercent = percent;
         }
         if (options.has("min-stocking")) {
             settings.minStocking = options.single("min-stocking");
@@ -98,6 +105,10 @@ int runOptimise(CommandContext &context) {
         context.err << "arbolex-cli optimise: " << error.text << '\n';
         return kExitBadArguments;
     }
+    run.inputs({{QStringLiteral("objective"), Value::word(objectiveWord(settings.objective))},
+                {QStringLiteral("max_removal"), Value::exact(maxRemovalPercent)},
+                {QStringLiteral("min_stocking"), Value::number(settings.minStocking)},
+                {QStringLiteral("top"), Value::whole(settings.top)}});
 
     StreamReport report(context.err, context.dataFolder);
     engine::Grow grow(&report);
@@ -133,34 +144,45 @@ int runOptimise(CommandContext &context) {
         current && !result->best.empty()
             ? std::optional<double>(result->best.front().score - current->score)
             : std::nullopt;
-    if (in.format == QLatin1String("json")) {
-        QJsonArray best;
-        for (const Candidate &c : result->best) {
-            best.append(candidateJson(c));
-        }
-        QJsonObject o{{QStringLiteral("model"), QString::fromStdString(grow.label())},
-                      {QStringLiteral("rate"), in.economics.ratePercent},
-                      {QStringLiteral("valuation"), valuationName(in.economics)},
-                      {QStringLiteral("regimes_grown"), result->regimesGrown},
-                      {QStringLiteral("best"), best}};
+    const bool forVolume = settings.objective == rotation::Objective::kVolume;
+    const Value gainValue = gain ? Value::number(*gain) : Value();
+    if (in.format == Format::kJson) {
+        ResultDocument document(run);
+        Fields fields = rotationPreamble(grow, in.economics);
+        fields.push_back({QStringLiteral("regimes_grown"), Value::whole(result->regimesGrown)});
+        document.insert(fields);
+        document.insert(QStringLiteral("best"), candidateTable(result->best).json());
         if (current) {
-            o.insert(QStringLiteral("current"), candidateJson(*current));
-            o.insert(QStringLiteral("gain"), settings.objective == rotation::Objective::kVolume
-                                                 ? QJsonValue(*gain)
-                                                 : moneyJson(gain));
+            document.insert(QStringLiteral("current"), candidateTable({*current}).jsonRow(0));
+            document.insert(QStringLiteral("gain"), gainValue.json());
         }
-        context.out << QJsonDocument(o).toJson(QJsonDocument::Indented);
+        if (forVolume) {
+            document.setUnit(QStringLiteral("gain"), units::kCubicMetresPerHa);
+        }
+        writeOutput(context.out, document.bytes());
     } else {
-        writeRotationPreamble(context.out, grow, in.economics);
-        context.out << "rank\tthin_from\tthin_every\tthin_volume\tthin_until\trotation\tnpv\tlev"
-                       "\tvolume\n";
+        // The current regime is a row beside the best, its gain a line below.
+        QStringList columns = kCandidateColumns;
+        columns.prepend(QStringLiteral("rank"));
+        Table table(columns);
+        auto add = [&](const QString &rank, const Candidate &c) {
+            std::vector<Value> cells = candidateCells(c);
+            cells.insert(cells.begin(), Value::word(rank));
+            table.add(std::move(cells));
+        };
         for (std::size_t i = 0; i < result->best.size(); ++i) {
-            context.out << candidateLine(QString::number(i + 1), result->best[i]);
+            add(QString::number(i + 1), result->best[i]);
         }
         if (current) {
-            context.out << candidateLine(QStringLiteral("current"), *current) << "# gain\t"
-                        << formatNumber(*gain) << '\n';
+            add(QStringLiteral("current"), *current);
         }
+        TextOutput text(in.format);
+        text.comments(rotationPreamble(grow, in.economics));
+        text.table(table);
+        if (current) {
+            text.comment(QStringLiteral("gain"), gainValue);
+        }
+        writeOutput(context.out, text.bytes());
     }
     return report.reports() == 0 ? kExitSuccess : kExitEngineFailure;
 }
@@ -178,7 +200,7 @@ Command optimiseCommand() {
             "                            [--establishment-cost C] [--annual-cost C]\n"
             "                            [--prices LIST] [--valuation stand|assortment]\n"
             "                            [--assortment-prices FILE] [--max-removal PERCENT]\n"
-            "                            [--min-stocking N] [--top K] [--format tsv|json]\n"
+            "                            [--min-stocking N] [--top K] [--format tsv|csv|json]\n"
             "\n"
             "Searches the first thinning age, the years between thinnings, the volume per\n"
             "thinning (or none) and the rotation age for the largest objective: a coarse\n"
@@ -197,8 +219,8 @@ Command optimiseCommand() {
                 "  --objective lev|npv|volume  what to maximise (default lev)\n"
                 "  --max-removal PERCENT     largest removal per thinning (default 35)\n"
                 "  --min-stocking N          smallest stocking a thinning leaves (default 400)\n"
-                "  --top K                   regimes to print (default 5)\n"
-                "  --format tsv|json         output format (default tsv)\n"),
+                "  --top K                   regimes to print (default 5)\n") +
+            formatOptionHelp(),
         &runOptimise};
 }
 

@@ -8,21 +8,13 @@
 #include "cli/standinput.hpp"
 
 #include <QJsonArray>
-#include <QJsonDocument>
 #include <QJsonObject>
-
-#include <optional>
 
 namespace arbolex::cli {
 
 namespace {
 
 using rotation::Harvest;
-
-/// A single-precision quantity as the tables print it ("%.9g").
-QJsonValue quantity(double x) {
-    return formatNumber(x).toDouble();
-}
 
 QString irrNote(valuation::IrrOutcome outcome) {
     switch (outcome) {
@@ -38,31 +30,6 @@ QString irrNote(valuation::IrrOutcome outcome) {
     return {};
 }
 
-/// The classes of a harvest valued by assortments, as the assortment report
-/// names them, with their volumes (m³/ha).
-QJsonObject assortmentsJson(const Harvest &h) {
-    QJsonObject o;
-    for (std::size_t i = 0; i < h.assortments.size(); ++i) {
-        o.insert(QLatin1String(rotation::kAssortmentClassCaptions.at(i)),
-                 quantity(h.assortments.at(i)));
-    }
-    return o;
-}
-
-QJsonObject harvestJson(const Harvest &h, bool withStocking, bool byAssortments) {
-    QJsonObject o{{QStringLiteral("age"), h.age},
-                  {QStringLiteral("volume"), quantity(h.volume)},
-                  {QStringLiteral("mean_tree_volume"), h.meanTreeVolume},
-                  {QStringLiteral("revenue"), moneyJson(h.revenue)}};
-    if (withStocking) {
-        o.insert(QStringLiteral("stocking"), quantity(h.stocking));
-    }
-    if (byAssortments) {
-        o.insert(QStringLiteral("assortments"), assortmentsJson(h));
-    }
-    return o;
-}
-
 struct Report {
     const rotation::GrowthPath &path;
     const rotation::RotationValue &value;
@@ -72,114 +39,142 @@ struct Report {
     bool byAssortments() const { return economics.valuation == rotation::Valuation::kAssortments; }
 };
 
-QJsonObject toJson(const Report &r, const engine::Grow &grow) {
+/// The rotation's figures: "key<TAB>value" lines, members of the JSON.
+Fields figures(const Report &r) {
+    const rotation::RotationValue &v = r.value;
+    const bool rooted = v.irr.outcome == valuation::IrrOutcome::kRoot;
+    return {{QStringLiteral("rotation"), Value::whole(v.rotation)},
+            {QStringLiteral("economic_rotation"), Value::whole(r.explorer.economicRotation)},
+            {QStringLiteral("biological_rotation"), Value::whole(r.explorer.biologicalRotation)},
+            {QStringLiteral("yield_class"), Value::whole(v.yieldClass)},
+            {QStringLiteral("mai"), Value::number(v.mai)},
+            {QStringLiteral("npv"), Value::money(v.npv)},
+            {QStringLiteral("lev"), Value::money(v.lev)},
+            {QStringLiteral("eaa"), Value::money(v.eaa)},
+            {QStringLiteral("forest_value"), Value::money(v.forestValue)},
+            {QStringLiteral("irr"),
+             rooted ? Value::number(v.irr.ratePercent) : Value::note(irrNote(v.irr.outcome))},
+            {QStringLiteral("break_even_price_factor"),
+             v.breakEvenPriceFactor ? Value::number(*v.breakEvenPriceFactor) : Value()}};
+}
+
+/// The figures of a harvest, in the columns of harvestColumns after "kind".
+std::vector<Value> harvestCells(const Harvest &h, bool byAssortments) {
+    std::vector<Value> cells = {Value::whole(h.age), Value::number(h.volume),
+                                Value::number(h.stocking), Value::number(h.meanTreeVolume),
+                                Value::money(h.revenue)};
+    if (byAssortments) {
+        for (const float volume : h.assortments) {
+            cells.push_back(Value::number(volume));
+        }
+    }
+    return cells;
+}
+
+QStringList harvestColumns(bool byAssortments) {
+    QStringList columns = {QStringLiteral("age"), QStringLiteral("volume"),
+                           QStringLiteral("stocking"), QStringLiteral("mean_tree_volume"),
+                           QStringLiteral("revenue")};
+    if (byAssortments) {
+        for (const std::string_view caption : rotation::kAssortmentClassCaptions) {
+            columns << QLatin1String(caption);
+        }
+    }
+    return columns;
+}
+
+/// A harvest in JSON: the thinning's stocking, and its classes as one object.
+QJsonObject harvestJson(const Harvest &h, bool withStocking, bool byAssortments) {
+    Table one(harvestColumns(byAssortments));
+    one.add(harvestCells(h, byAssortments));
+    QJsonObject o = one.jsonRow(0);
+    QJsonObject classes;
+    for (const std::string_view caption : rotation::kAssortmentClassCaptions) {
+        const QString key = QLatin1String(caption);
+        if (o.contains(key)) {
+            classes.insert(key, o.take(key));
+        }
+    }
+    if (byAssortments) {
+        o.insert(QStringLiteral("assortments"), classes);
+    }
+    if (!withStocking) {
+        o.remove(QStringLiteral("stocking"));
+    }
+    return o;
+}
+
+Table cashflowTable(const rotation::RotationValue &v) {
+    Table table({QStringLiteral("age"), QStringLiteral("cost"), QStringLiteral("revenue")});
+    for (const rotation::CashFlowYear &c : v.cashflow) {
+        table.add({Value::whole(c.age), Value::money(c.cost), Value::money(c.revenue)});
+    }
+    return table;
+}
+
+Table byAgeTable(const rotation::RotationExplorer &explorer) {
+    Table table({QStringLiteral("age"), QStringLiteral("volume"), QStringLiteral("mai"),
+                 QStringLiteral("npv"), QStringLiteral("lev"), QStringLiteral("forest_value")});
+    for (const rotation::RotationRow &row : explorer.rows) {
+        table.add({Value::whole(row.age), Value::number(row.volume), Value::number(row.mai),
+                   Value::money(row.npv), Value::money(row.lev), Value::money(row.forestValue)});
+    }
+    return table;
+}
+
+QByteArray toJson(const Report &r, const engine::Grow &grow, const RunRecord &run) {
     const rotation::RotationValue &v = r.value;
     QJsonArray thinnings;
     for (const Harvest &t : v.thinnings) {
         thinnings.append(harvestJson(t, true, r.byAssortments()));
     }
-    QJsonArray cashflow;
-    for (const rotation::CashFlowYear &c : v.cashflow) {
-        cashflow.append(QJsonObject{{QStringLiteral("age"), c.age},
-                                    {QStringLiteral("cost"), moneyJson(c.cost)},
-                                    {QStringLiteral("revenue"), moneyJson(c.revenue)}});
-    }
-    QJsonArray byAge;
-    for (const rotation::RotationRow &row : r.explorer.rows) {
-        byAge.append(QJsonObject{{QStringLiteral("age"), row.age},
-                                 {QStringLiteral("volume"), quantity(row.volume)},
-                                 {QStringLiteral("mai"), row.mai},
-                                 {QStringLiteral("npv"), moneyJson(row.npv)},
-                                 {QStringLiteral("lev"), moneyJson(row.lev)},
-                                 {QStringLiteral("forest_value"), moneyJson(row.forestValue)}});
-    }
-    QJsonObject o{{QStringLiteral("model"), QString::fromStdString(grow.label())},
-                  {QStringLiteral("site_index"), quantity(r.path.siteIndex)},
-                  {QStringLiteral("present_age"), r.path.presentAge},
-                  {QStringLiteral("rate"), r.economics.ratePercent},
-                  {QStringLiteral("valuation"), valuationName(r.economics)},
-                  {QStringLiteral("rotation"), v.rotation},
-                  {QStringLiteral("economic_rotation"), r.explorer.economicRotation},
-                  {QStringLiteral("biological_rotation"), r.explorer.biologicalRotation},
-                  {QStringLiteral("yield_class"), v.yieldClass},
-                  {QStringLiteral("mai"), v.mai},
-                  {QStringLiteral("npv"), moneyJson(v.npv)},
-                  {QStringLiteral("lev"), moneyJson(v.lev)},
-                  {QStringLiteral("eaa"), moneyJson(v.eaa)},
-                  {QStringLiteral("forest_value"), moneyJson(v.forestValue)},
-                  {QStringLiteral("irr"), v.irr.outcome == valuation::IrrOutcome::kRoot
-                                              ? QJsonValue(v.irr.ratePercent)
-                                              : QJsonValue(QJsonValue::Null)},
-                  {QStringLiteral("break_even_price_factor"),
-                   v.breakEvenPriceFactor ? QJsonValue(*v.breakEvenPriceFactor)
-                                          : QJsonValue(QJsonValue::Null)},
-                  {QStringLiteral("thinnings"), thinnings},
-                  {QStringLiteral("final_cut"), harvestJson(v.finalCut, false, r.byAssortments())},
-                  {QStringLiteral("cashflow"), cashflow},
-                  {QStringLiteral("by_age"), byAge}};
+    ResultDocument document(run);
+    document.insert(rotationPreamble(grow, r.economics));
+    document.insert(figures(r));
+    document.insert(QStringLiteral("site_index"), Value::number(r.path.siteIndex).json());
+    document.insert(QStringLiteral("present_age"), r.path.presentAge);
     if (v.irr.outcome != valuation::IrrOutcome::kRoot) {
-        o.insert(QStringLiteral("irr_note"), irrNote(v.irr.outcome));
+        document.insert(QStringLiteral("irr_note"), irrNote(v.irr.outcome));
     }
-    return o;
+    document.insert(QStringLiteral("thinnings"), thinnings);
+    document.insert(QStringLiteral("final_cut"), harvestJson(v.finalCut, false, r.byAssortments()));
+    document.insert(QStringLiteral("cashflow"), cashflowTable(v).json());
+    document.insert(QStringLiteral("by_age"), byAgeTable(r.explorer).json());
+    return document.bytes();
 }
 
-void writeTsv(QTextStream &out, const Report &r, const engine::Grow &grow) {
+QByteArray toText(Format format, const Report &r, const engine::Grow &grow) {
     const rotation::RotationValue &v = r.value;
-    writeRotationPreamble(out, grow, r.economics);
-    out << "rotation\t" << v.rotation << '\n'
-        << "economic_rotation\t" << r.explorer.economicRotation << '\n'
-        << "biological_rotation\t" << r.explorer.biologicalRotation << '\n'
-        << "yield_class\t" << v.yieldClass << '\n'
-        << "mai\t" << formatNumber(v.mai) << '\n'
-        << "npv\t" << moneyText(v.npv) << '\n'
-        << "lev\t" << moneyText(v.lev) << '\n'
-        << "eaa\t" << moneyText(v.eaa) << '\n'
-        << "forest_value\t" << moneyText(v.forestValue) << '\n'
-        << "irr\t"
-        << (v.irr.outcome == valuation::IrrOutcome::kRoot ? formatNumber(v.irr.ratePercent)
-                                                          : irrNote(v.irr.outcome))
-        << '\n'
-        << "break_even_price_factor\t"
-        << (v.breakEvenPriceFactor ? formatNumber(*v.breakEvenPriceFactor) : QString()) << '\n';
-    out << "\n# harvests\nkind\tage\tvolume\tstocking\tmean_tree_volume\trevenue";
-    if (r.byAssortments()) {
-        for (const std::string_view caption : rotation::kAssortmentClassCaptions) {
-            out << '\t' << QLatin1String(caption);
-        }
-    }
-    out << '\n';
-    auto harvestLine = [&](const char *kind, const Harvest &h) {
-        out << kind << '\t' << h.age << '\t' << formatNumber(h.volume) << '\t'
-            << formatNumber(h.stocking) << '\t' << formatNumber(h.meanTreeVolume) << '\t'
-            << moneyText(h.revenue);
-        if (r.byAssortments()) {
-            for (const float volume : h.assortments) {
-                out << '\t' << formatNumber(volume);
-            }
-        }
-        out << '\n';
+    TextOutput text(format);
+    text.comments(rotationPreamble(grow, r.economics));
+    text.fields(figures(r));
+    QStringList columns = harvestColumns(r.byAssortments());
+    columns.prepend(QStringLiteral("kind"));
+    Table harvests(columns);
+    auto add = [&](const char *kind, const Harvest &h) {
+        std::vector<Value> cells = harvestCells(h, r.byAssortments());
+        cells.insert(cells.begin(), Value::word(QLatin1String(kind)));
+        harvests.add(std::move(cells));
     };
     for (const Harvest &t : v.thinnings) {
-        harvestLine("thinning", t);
+        add("thinning", t);
     }
-    harvestLine("final_cut", v.finalCut);
-    out << "\n# cashflow\nage\tcost\trevenue\n";
-    for (const rotation::CashFlowYear &c : v.cashflow) {
-        out << c.age << '\t' << moneyText(c.cost) << '\t' << moneyText(c.revenue) << '\n';
-    }
-    out << "\n# by_age\nage\tvolume\tmai\tnpv\tlev\tforest_value\n";
-    for (const rotation::RotationRow &row : r.explorer.rows) {
-        out << row.age << '\t' << formatNumber(row.volume) << '\t' << formatNumber(row.mai) << '\t'
-            << moneyText(row.npv) << '\t' << moneyText(row.lev) << '\t'
-            << moneyText(row.forestValue) << '\n';
-    }
+    add("final_cut", v.finalCut);
+    text.title(QStringLiteral("harvests"));
+    text.table(harvests);
+    text.title(QStringLiteral("cashflow"));
+    text.table(cashflowTable(v));
+    text.title(QStringLiteral("by_age"));
+    text.table(byAgeTable(r.explorer));
+    return text.bytes();
 }
 
 int runRotation(CommandContext &context) {
+    RunRecord run(QStringLiteral("rotation"));
     RotationInput in;
     try {
         const Options options(context.arguments, rotationOptionNames());
-        in = readRotationInput(options, context.dataFolder);
+        in = readRotationInput(options, context.dataFolder, run);
     } catch (const UsageError &error) {
         context.err << "arbolex-cli rotation: " << error.text << '\n';
         return kExitBadArguments;
@@ -198,11 +193,8 @@ int runRotation(CommandContext &context) {
     const rotation::RotationValue value =
         rotation::valueRotation(path, grown.rotation, in.economics);
     const Report r{path, value, explorer, in.economics};
-    if (in.format == QLatin1String("json")) {
-        context.out << QJsonDocument(toJson(r, grow)).toJson(QJsonDocument::Indented);
-    } else {
-        writeTsv(context.out, r, grow);
-    }
+    writeOutput(context.out,
+                in.format == Format::kJson ? toJson(r, grow, run) : toText(in.format, r, grow));
     return report.reports() == 0 ? kExitSuccess : kExitEngineFailure;
 }
 
@@ -220,7 +212,7 @@ Command rotationCommand() {
                 "                            [--prices current|user|longterm|private]\n"
                 "                            [--valuation stand|assortment]\n"
                 "                            [--assortment-prices FILE]\n"
-                "                            [--format tsv|json] [--data-dir DIR]\n"
+                "                            [--format tsv|csv|json] [--data-dir DIR]\n"
                 "\n"
                 "Grows the stand year by year to the model's age limit, thinning the given\n"
                 "volume at the regime's ages (the thinning window's volume method), and fells\n"
@@ -238,8 +230,7 @@ Command rotationCommand() {
                 "\n") +
                 standOptionsHelp() + regimeOptionsHelp() +
                 QStringLiteral("  --rotation R              final-cut age, years\n") +
-                economicsOptionsHelp() +
-                QStringLiteral("  --format tsv|json         output format (default tsv)\n"),
+                economicsOptionsHelp() + formatOptionHelp(),
             &runRotation};
 }
 

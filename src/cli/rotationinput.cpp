@@ -5,9 +5,11 @@
 #include "prices/prices.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/settings.hpp"
-#include "valuation/discounting.hpp"
 
 #include <QDir>
+#include <QFileInfo>
+#include <QJsonArray>
+#include <QJsonObject>
 
 #include <algorithm>
 #include <iterator>
@@ -29,6 +31,54 @@ constexpr PriceChoice kPriceChoices[] = {{"current", prices::kCurrentPrices},
                                          {"longterm", prices::kLongTermPrices},
                                          {"private", prices::kPrivatePrices}};
 
+/// The price list of --prices as the option names it.
+const char *priceListWord(prices::PriceSet set) {
+    const auto found = std::find_if(std::begin(kPriceChoices), std::end(kPriceChoices),
+                                    [&](const PriceChoice &c) { return c.set == set; });
+    return found->word;
+}
+
+/// A caption of a price class without its colon (".075 to .124").
+QString classCaption(std::string_view caption) {
+    if (caption.ends_with(':')) {
+        caption.remove_suffix(1);
+    }
+    return QString::fromLatin1(caption.data(), static_cast<qsizetype>(caption.size()));
+}
+
+/// The prices a valuation uses, class by class: the standing prices by
+/// mean tree volume and, valued by assortments, the assortment prices.
+QJsonObject pricesUsed(const rotation::Economics &economics, prices::PriceSet set) {
+    auto prices = [](const auto &captions, const auto &list) {
+        QJsonArray out;
+        for (std::size_t i = 0; i < list.size(); ++i) {
+            out.append(QJsonObject{{QStringLiteral("class"), classCaption(captions.at(i))},
+                                   {QStringLiteral("price"), Value::number(list[i]).json()}});
+        }
+        return out;
+    };
+    QJsonObject used{
+        {QStringLiteral("list"), QLatin1String(priceListWord(set))},
+        {QStringLiteral("standing"), prices(rotation::kTimberCategoryCaptions, economics.prices)}};
+    if (economics.valuation == rotation::Valuation::kAssortments) {
+        used.insert(QStringLiteral("assortments"),
+                    prices(rotation::kAssortmentClassCaptions, economics.assortmentPrices));
+    }
+    return used;
+}
+
+/// Records the data folder's price files the prices were read from, in the
+/// order they are read, to the first one missing.
+void recordPriceFiles(RunRecord &run, const QString &dataFolder) {
+    for (const char *name : prices::kFilesReadForPrices) {
+        const QString path = QDir(dataFolder).filePath(QLatin1String(name));
+        run.fileRead(QLatin1String(name), path);
+        if (!QFileInfo::exists(path)) {
+            break;
+        }
+    }
+}
+
 double cost(const Options &options, const char *name) {
     if (!options.has(name)) {
         return 0.0;
@@ -44,28 +94,33 @@ double cost(const Options &options, const char *name) {
 /// --valuation and --assortment-prices: how harvests are valued, and with
 /// which assortment prices (the data folder's file without the option).
 void readValuation(const Options &options, const QString &dataFolder,
-                   rotation::Economics &economics) {
+                   rotation::Economics &economics, RunRecord &run) {
     const QString word =
         options.has("valuation") ? options.text("valuation") : QStringLiteral("stand");
     if (word != QLatin1String("stand") && word != QLatin1String("assortment")) {
         throw UsageError{QStringLiteral("--valuation takes stand or assortment")};
     }
+    run.input(QStringLiteral("valuation"), Value::word(word));
     if (word == QLatin1String("stand")) {
         if (options.has("assortment-prices")) {
             throw UsageError{QStringLiteral("--assortment-prices is for --valuation assortment")};
         }
         return;
     }
+    const bool given = options.has("assortment-prices");
     const QString path =
-        options.has("assortment-prices")
-            ? options.text("assortment-prices")
-            : QDir(dataFolder).filePath(QLatin1String(prices::kAssortmentPricesFile));
+        given ? options.text("assortment-prices")
+              : QDir(dataFolder).filePath(QLatin1String(prices::kAssortmentPricesFile));
     const prices::AssortmentPricesReading read = prices::readAssortmentPrices(path);
     if (!read.prices) {
         throw UsageError{QStringLiteral("assortment prices ") + read.fault};
     }
     economics.valuation = rotation::Valuation::kAssortments;
     economics.assortmentPrices = *read.prices;
+    if (given) {
+        run.input(QStringLiteral("assortment_prices"), Value::word(path));
+    }
+    run.fileRead(given ? path : QLatin1String(prices::kAssortmentPricesFile), path);
 }
 
 } // namespace
@@ -126,7 +181,19 @@ QString economicsOptionsHelp() {
                "folder)\n");
 }
 
-rotation::Economics readEconomics(const Options &options, const QString &dataFolder) {
+Fields regimeFields(const rotation::Regime &regime) {
+    if (!regime.thins()) {
+        return {};
+    }
+    return {{QStringLiteral("thin_from"), Value::whole(regime.thinFrom)},
+            {QStringLiteral("thin_every"), Value::whole(regime.thinEvery)},
+            {QStringLiteral("thin_volume"), Value::number(regime.thinVolume)},
+            {QStringLiteral("thin_until"),
+             regime.thinUntil ? Value::whole(*regime.thinUntil) : Value()}};
+}
+
+rotation::Economics readEconomics(const Options &options, const QString &dataFolder,
+                                  RunRecord &run) {
     rotation::Economics economics;
     economics.ratePercent =
         options.has("rate") ? options.number("rate") : shell::kDefaultInterestRate;
@@ -152,16 +219,14 @@ rotation::Economics readEconomics(const Options &options, const QString &dataFol
     prices::GetPricesFromFiles(dataFolder, prices.data(), log);
     prices.selectPriceSet(set);
     economics.prices = prices.pricesInUse();
-    readValuation(options, dataFolder, economics);
+    run.inputs({{QStringLiteral("rate"), Value::exact(economics.ratePercent)},
+                {QStringLiteral("establishment_cost"), Value::exact(economics.establishmentCost)},
+                {QStringLiteral("annual_cost"), Value::exact(economics.annualCost)},
+                {QStringLiteral("prices"), Value::word(QLatin1String(priceListWord(set)))}});
+    recordPriceFiles(run, dataFolder);
+    readValuation(options, dataFolder, economics, run);
+    run.insert(QStringLiteral("prices_used"), pricesUsed(economics, set));
     return economics;
-}
-
-QString readFormat(const Options &options) {
-    const QString format = options.has("format") ? options.text("format") : QStringLiteral("tsv");
-    if (format != QLatin1String("tsv") && format != QLatin1String("json")) {
-        throw UsageError{QStringLiteral("--format takes tsv or json")};
-    }
-    return format;
 }
 
 std::vector<const char *> rotationOptionNames(std::initializer_list<const char *> more) {
@@ -174,23 +239,27 @@ std::vector<const char *> rotationOptionNames(std::initializer_list<const char *
     return known;
 }
 
-RotationInput readRotationInput(const Options &options, const QString &dataFolder) {
+RotationInput readRotationInput(const Options &options, const QString &dataFolder, RunRecord &run) {
     RotationInput input;
     input.stand = readStand(options);
+    run.inputs(standFields(input.stand));
     input.regime = readRegime(options);
+    run.inputs(regimeFields(input.regime));
     if (options.has("rotation")) {
         input.rotation = options.wholeNumber("rotation", 1, kLongestAge);
+        run.input(QStringLiteral("rotation"), Value::whole(*input.rotation));
     }
     input.format = readFormat(options);
-    input.economics = readEconomics(options, dataFolder);
+    run.setFormat(input.format);
+    input.economics = readEconomics(options, dataFolder, run);
     return input;
 }
 
-void writeRotationPreamble(QTextStream &out, const engine::Grow &grow,
-                           const rotation::Economics &economics) {
-    writePreamble(out, grow, true);
-    out << "# rate\t" << formatNumber(economics.ratePercent) << '\n'
-        << "# valuation\t" << valuationName(economics) << '\n';
+Fields rotationPreamble(const engine::Grow &grow, const rotation::Economics &economics) {
+    Fields fields = standPreamble(grow, true);
+    fields.push_back({QStringLiteral("rate"), Value::number(economics.ratePercent)});
+    fields.push_back({QStringLiteral("valuation"), Value::word(valuationName(economics))});
+    return fields;
 }
 
 GrownRotation growRotation(engine::Grow &grow, const RotationInput &input, const QString &command,
@@ -212,14 +281,6 @@ GrownRotation growRotation(engine::Grow &grow, const RotationInput &input, const
         return {std::nullopt, 0, kExitBadArguments};
     }
     return {std::move(path), choice.age, kExitSuccess};
-}
-
-QJsonValue moneyJson(const std::optional<double> &euro) {
-    return euro ? QJsonValue(valuation::roundToCents(*euro)) : QJsonValue(QJsonValue::Null);
-}
-
-QString moneyText(const std::optional<double> &euro) {
-    return euro ? formatNumber(valuation::roundToCents(*euro)) : QString();
 }
 
 } // namespace arbolex::cli

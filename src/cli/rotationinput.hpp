@@ -5,10 +5,10 @@
 // the data folder as the program reads them.
 
 #include "cli/options.hpp"
+#include "cli/resultdocument.hpp"
 #include "cli/standinput.hpp"
 #include "rotation/rotation.hpp"
 
-#include <QJsonValue>
 #include <QString>
 #include <QTextStream>
 
@@ -27,6 +27,9 @@ QString regimeOptionsHelp();
 /// --thin-from, --thin-every and --thin-volume come together. Throws UsageError.
 rotation::Regime readRegime(const Options &options);
 
+/// The regime as its options (nothing for a rotation without thinning).
+Fields regimeFields(const rotation::Regime &regime);
+
 /// The option names of the money of a rotation, without their dashes.
 std::vector<const char *> economicsOptionNames();
 
@@ -38,15 +41,13 @@ QString economicsOptionsHelp();
 /// average prices without --prices), whose prices come from the data folder's
 /// files as the program reads them, each as its absolute value, and the
 /// valuation (--valuation, by assortments with the prices of
-/// --assortment-prices or the data folder's assortment price file). Throws
-/// UsageError.
-rotation::Economics readEconomics(const Options &options, const QString &dataFolder);
+/// --assortment-prices or the data folder's assortment price file). Records
+/// them in `run`, with the files read and the prices used. Throws UsageError.
+rotation::Economics readEconomics(const Options &options, const QString &dataFolder,
+                                  RunRecord &run);
 
 /// The valuation of the harvests as the output names it: "stand" or "assortment".
 QString valuationName(const rotation::Economics &economics);
-
-/// The output format: "tsv" (the default) or "json". Throws UsageError.
-QString readFormat(const Options &options);
 
 /// The option names of a command over one stand's rotations: the stand, the
 /// regime, the money, "rotation" and "format", then `more`.
@@ -59,16 +60,16 @@ struct RotationInput {
     rotation::Economics economics;
     /// --rotation: the final-cut age, when given.
     std::optional<int> rotation;
-    /// "tsv" or "json".
-    QString format;
+    Format format = Format::kTsv;
 };
 
-/// Reads the stand, the regime, --rotation, --format and the money. Throws UsageError.
-RotationInput readRotationInput(const Options &options, const QString &dataFolder);
+/// Reads the stand, the regime, --rotation, --format and the money, and
+/// records them in `run`. Throws UsageError.
+RotationInput readRotationInput(const Options &options, const QString &dataFolder, RunRecord &run);
 
-/// The "# site_index", "# model", "# rate" and "# valuation" lines of a table.
-void writeRotationPreamble(QTextStream &out, const engine::Grow &grow,
-                           const rotation::Economics &economics);
+/// The site index, the model, the rate and the valuation: the "#" lines
+/// above a table.
+Fields rotationPreamble(const engine::Grow &grow, const rotation::Economics &economics);
 
 /// The stand grown under the regime and the final-cut age (--rotation, else
 /// the economic rotation), or the exit status after the reason has been
@@ -81,10 +82,5 @@ struct GrownRotation {
 };
 GrownRotation growRotation(engine::Grow &grow, const RotationInput &input, const QString &command,
                            QTextStream &err);
-
-/// Money rounded to cents, null when it does not exist.
-QJsonValue moneyJson(const std::optional<double> &euro);
-/// Money rounded to cents as the tables print it, empty when it does not exist.
-QString moneyText(const std::optional<double> &euro);
 
 } // namespace arbolex::cli

@@ -4,6 +4,7 @@
 #include "cli/assortscript.hpp"
 #include "cli/documentscript.hpp"
 #include "cli/economicsscript.hpp"
+#include "cli/gridoutput.hpp"
 #include "shell/tableexport.hpp"
 
 #include <QFile>
@@ -320,9 +321,9 @@ QString ScriptRunner::print(const QString &control) {
         return *asmtPrices;
     }
     if (control == QLatin1String("flxMain")) {
-        for (const QStringList &row : m_session.main().table().visibleGrid()) {
-            m_out << row.join(QLatin1Char('\t')) << '\n';
-        }
+        TextOutput text(Format::kTsv);
+        text.table(gridTable(m_session.main().table(), true));
+        m_out << QString::fromUtf8(text.bytes());
         return {};
     }
     if (control == QLatin1String("flxSummary")) {
@@ -372,7 +373,7 @@ ScriptRunner::Outcome runScriptText(const QByteArray &script, ScriptTarget &sess
     const QStringList lines = QString::fromUtf8(script).split(QLatin1Char('\n'));
     session.main().Form_Load(settings, QRect(0, 0, 1280, 800));
     ScriptRunner runner(session, out);
-    const ScriptRunner::Outcome outcome = runner.run(lines);
+    ScriptRunner::Outcome outcome = runner.run(lines);
     out.flush();
     return outcome;
 }

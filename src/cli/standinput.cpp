@@ -3,13 +3,10 @@
 #include "workflow/standmath.hpp"
 
 #include <cmath>
-#include <cstdio>
 
 namespace arbolex::cli {
 
 namespace {
-
-/// π as the diameter and basal-area conversions have always written it.
 
 QString fromUtf8(std::string_view s) {
     return QString::fromUtf8(s.data(), static_cast<qsizetype>(s.size()));
@@ -64,12 +61,6 @@ StandInput readStand(const Options &options) {
     return stand;
 }
 
-QString formatNumber(double x) {
-    char text[32];
-    std::snprintf(text, sizeof text, "%.9g", x);
-    return QString::fromLatin1(text);
-}
-
 bool selectModelAndSiteIndex(engine::Grow &grow, const StandInput &stand) {
     grow.GetModel(stand.model);
     // The correction factor follows the site index current at selection.
@@ -77,9 +68,22 @@ bool selectModelAndSiteIndex(engine::Grow &grow, const StandInput &stand) {
     return grow.SiteIndex(stand.age, stand.height);
 }
 
-void writePreamble(QTextStream &out, const engine::Grow &grow, bool siteIndexOk) {
-    out << "# site_index\t" << (siteIndexOk ? formatNumber(grow.siteIndex()) : QString()) << '\n';
-    out << "# model\t" << fromUtf8(grow.label()) << '\n';
+Fields standFields(const StandInput &stand) {
+    return {{QStringLiteral("model"), Value::whole(stand.model)},
+            {QStringLiteral("age"), Value::number(stand.age)},
+            {QStringLiteral("stocking"), Value::number(stand.stocking)},
+            {QStringLiteral("height"), Value::number(stand.height)},
+            {QStringLiteral("basal_area"), Value::number(stand.basalArea)}};
+}
+
+Fields standPreamble(const engine::Grow &grow, bool siteIndexOk) {
+    return {{QStringLiteral("site_index"), siteIndexOk ? Value::number(grow.siteIndex()) : Value()},
+            {QStringLiteral("model"), Value::word(fromUtf8(grow.label()))}};
+}
+
+void writeOutput(QTextStream &out, const QByteArray &bytes) {
+    out << QString::fromUtf8(bytes);
+    out.flush();
 }
 
 } // namespace arbolex::cli

@@ -5,6 +5,7 @@
 // way numbers are written.
 
 #include "cli/options.hpp"
+#include "cli/output.hpp"
 #include "engine/grow.hpp"
 #include "rotation/rotation.hpp"
 #include "shell/errorlog.hpp"
@@ -49,17 +50,20 @@ QString standOptionsHelp();
 /// Reads the stand; --basal-area and --dbh exclude each other. Throws UsageError.
 StandInput readStand(const Options &options);
 
-/// A number as the tables print it ("%.9g": every single-precision value
-/// comes back exactly).
-QString formatNumber(double x);
+/// The stand as the options that give it again: model, age, stocking,
+/// height and the basal area (given, or from the diameter), each exactly.
+Fields standFields(const StandInput &stand);
 
 /// Makes the stand's model active with its volume correction factor, as the
 /// model menu does, then computes the site index. Returns the site index's
 /// success.
 bool selectModelAndSiteIndex(engine::Grow &grow, const StandInput &stand);
 
-/// The "# site_index" and "# model" lines; the site index is left empty when
-/// it could not be computed.
-void writePreamble(QTextStream &out, const engine::Grow &grow, bool siteIndexOk);
+/// The site index (nothing when it could not be computed) and the model's
+/// label: the "# site_index" and "# model" lines of a table.
+Fields standPreamble(const engine::Grow &grow, bool siteIndexOk);
+
+/// Writes a command's output in one piece, once it is complete.
+void writeOutput(QTextStream &out, const QByteArray &bytes);
 
 } // namespace arbolex::cli

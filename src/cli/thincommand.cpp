@@ -2,7 +2,10 @@
 // basal area, stocking or volume, as the thinning preview computes it.
 #include "cli/command.hpp"
 #include "cli/options.hpp"
+#include "cli/resultdocument.hpp"
 #include "cli/standinput.hpp"
+
+#include <iterator>
 
 namespace arbolex::cli {
 
@@ -10,23 +13,31 @@ namespace {
 
 enum Residual { kResidualBasalArea, kResidualStocking, kResidualVolume };
 
+/// The options of the residual kinds, in the order of Residual.
+constexpr const char *kResidualOptions[] = {"residual-ba", "residual-stocking", "residual-volume"};
+
 int runThin(CommandContext &context) {
     StandInput stand;
     int kind = kResidualBasalArea;
     float residual = 0.0f;
+    Format format = Format::kTsv;
     try {
         std::vector<const char *> known = standOptionNames();
-        known.insert(known.end(), {"residual-ba", "residual-stocking", "residual-volume"});
+        known.insert(known.end(), std::begin(kResidualOptions), std::end(kResidualOptions));
+        known.push_back(kFormatOption);
         const Options options(context.arguments, known);
         stand = readStand(options);
-        kind = options.oneOf({"residual-ba", "residual-stocking", "residual-volume"});
-        residual = options.single(kind == kResidualBasalArea  ? "residual-ba"
-                                  : kind == kResidualStocking ? "residual-stocking"
-                                                              : "residual-volume");
+        kind = options.oneOf({kResidualOptions[0], kResidualOptions[1], kResidualOptions[2]});
+        residual = options.single(kResidualOptions[kind]);
+        format = readFormat(options);
     } catch (const UsageError &error) {
         context.err << "arbolex-cli thin: " << error.text << '\n';
         return kExitBadArguments;
     }
+    RunRecord run(QStringLiteral("thin"));
+    run.inputs(standFields(stand));
+    run.input(inputKey(kResidualOptions[kind]), Value::number(residual));
+    run.setFormat(format);
 
     StreamReport report(context.err, context.dataFolder);
     engine::Grow grow(&report);
@@ -53,10 +64,12 @@ int runThin(CommandContext &context) {
     }
     const float volume = grow.GetV7(residualBasalArea, residualStocking, h);
 
-    writePreamble(context.out, grow, siteIndexOk);
-    context.out << "basal_area\tstocking\tvolume\n"
-                << formatNumber(residualBasalArea) << '\t' << formatNumber(residualStocking) << '\t'
-                << formatNumber(volume) << '\n';
+    Table table(
+        {QStringLiteral("basal_area"), QStringLiteral("stocking"), QStringLiteral("volume")});
+    table.add(
+        {Value::number(residualBasalArea), Value::number(residualStocking), Value::number(volume)});
+    writeOutput(context.out, fieldsAndTable(format, run, standPreamble(grow, siteIndexOk),
+                                            QStringLiteral("residual"), table, true));
     return siteIndexOk && solved && report.reports() == 0 ? kExitSuccess : kExitEngineFailure;
 }
 
@@ -70,18 +83,20 @@ Command thinCommand() {
         QStringLiteral("usage: arbolex-cli thin --model M --age A --stocking N --height H\n"
                        "                       (--basal-area G | --dbh D)\n"
                        "                       (--residual-ba X | --residual-stocking X |\n"
-                       "                        --residual-volume X) [--data-dir DIR]\n"
+                       "                        --residual-volume X) [--format tsv|csv|json]\n"
+                       "                       [--data-dir DIR]\n"
                        "\n"
                        "Thins the stand along the model's thinning response (models without\n"
-                       "one fail). Prints \"# site_index\", \"# model\", then a tab-separated\n"
-                       "line after the header basal_area (m2/ha), stocking (stems/ha),\n"
-                       "volume (m3/ha to 7 cm top).\n"
+                       "one fail). Prints \"# site_index\", \"# model\", then one line after the\n"
+                       "header basal_area (m2/ha), stocking (stems/ha), volume (m3/ha to 7 cm\n"
+                       "top); in JSON site_index, model and residual.\n"
                        "\n") +
             standOptionsHelp() +
             QStringLiteral("  --residual-ba X        basal area left, m2/ha; the stocking follows\n"
                            "  --residual-stocking X  stems left per ha; the basal area follows\n"
                            "  --residual-volume X    volume left, m3/ha; basal area and stocking\n"
-                           "                         follow by Newton's method\n"),
+                           "                         follow by Newton's method\n") +
+            formatOptionHelp(),
         &runThin};
 }
 

@@ -7,7 +7,6 @@
 #include "rotation/uncertainty.hpp"
 
 #include <QJsonArray>
-#include <QJsonDocument>
 #include <QJsonObject>
 
 namespace arbolex::cli {
@@ -40,45 +39,94 @@ double rate(const QString &text) {
     return x;
 }
 
-QJsonObject percentilesJson(const rotation::Percentiles &p) {
-    return {{QStringLiteral("p5"), moneyJson(p.p5)},
-            {QStringLiteral("p50"), moneyJson(p.p50)},
-            {QStringLiteral("p95"), moneyJson(p.p95)}};
+/// The percentiles of NPV and LEV, a row each.
+Table percentileTable(const rotation::MonteCarloResult &mc) {
+    Table table({QStringLiteral("figure"), QStringLiteral("p5"), QStringLiteral("p50"),
+                 QStringLiteral("p95")});
+    for (const auto &[name, p] : {std::pair{"npv", &mc.npv}, std::pair{"lev", &mc.lev}}) {
+        table.add({Value::word(QLatin1String(name)), Value::money(p->p5), Value::money(p->p50),
+                   Value::money(p->p95)});
+    }
+    return table;
 }
 
-void writeTsv(QTextStream &out, const rotation::MonteCarloResult &mc,
-              const std::vector<rotation::TornadoBar> &bars) {
-    out << "figure\tp5\tp50\tp95\n";
-    out << "npv\t" << moneyText(mc.npv.p5) << '\t' << moneyText(mc.npv.p50) << '\t'
-        << moneyText(mc.npv.p95) << '\n';
-    out << "lev\t" << moneyText(mc.lev.p5) << '\t' << moneyText(mc.lev.p50) << '\t'
-        << moneyText(mc.lev.p95) << '\n';
-    out << "probability_npv_below_zero\t" << formatNumber(mc.probabilityNpvBelowZero) << '\n';
-    out << "\n# histogram\nnpv_from\tnpv_to\tdraws\n";
+Table tornadoTable(const std::vector<rotation::TornadoBar> &bars) {
+    Table table({QStringLiteral("factor"), QStringLiteral("npv_low"), QStringLiteral("npv_high"),
+                 QStringLiteral("lev_low"), QStringLiteral("lev_high")});
+    for (const rotation::TornadoBar &b : bars) {
+        table.add({Value::word(QString::fromStdString(b.factor)), Value::money(b.npvLow),
+                   Value::money(b.npvHigh), Value::money(b.levLow), Value::money(b.levHigh)});
+    }
+    return table;
+}
+
+Value probabilityOfLoss(const rotation::MonteCarloResult &mc) {
+    return Value::number(mc.probabilityNpvBelowZero);
+}
+
+QByteArray toText(Format format, const Fields &preamble, const rotation::MonteCarloResult &mc,
+                  const std::vector<rotation::TornadoBar> &bars) {
+    TextOutput text(format);
+    text.comments(preamble);
+    text.table(percentileTable(mc));
+    text.blank();
+    text.fields({{QStringLiteral("probability_npv_below_zero"), probabilityOfLoss(mc)}});
+    text.title(QStringLiteral("histogram"));
+    Table histogram(
+        {QStringLiteral("npv_from"), QStringLiteral("npv_to"), QStringLiteral("draws")});
     const double width = (mc.npvHighest - mc.npvLowest) / static_cast<double>(mc.histogram.size());
     for (std::size_t i = 0; i < mc.histogram.size(); ++i) {
-        out << moneyText(mc.npvLowest + width * static_cast<double>(i)) << '\t'
-            << moneyText(mc.npvLowest + width * static_cast<double>(i + 1)) << '\t'
-            << mc.histogram[i] << '\n';
+        histogram.add({Value::money(mc.npvLowest + width * static_cast<double>(i)),
+                       Value::money(mc.npvLowest + width * static_cast<double>(i + 1)),
+                       Value::whole(mc.histogram[i])});
     }
-    out << "\n# tornado\nfactor\tnpv_low\tnpv_high\tlev_low\tlev_high\n";
-    for (const rotation::TornadoBar &b : bars) {
-        out << QString::fromStdString(b.factor) << '\t' << moneyText(b.npvLow) << '\t'
-            << moneyText(b.npvHigh) << '\t' << moneyText(b.levLow) << '\t' << moneyText(b.levHigh)
-            << '\n';
+    text.table(histogram);
+    text.title(QStringLiteral("tornado"));
+    text.table(tornadoTable(bars));
+    return text.bytes();
+}
+
+QByteArray toJson(const RunRecord &run, const Fields &preamble, int age,
+                  const rotation::MonteCarloSettings &settings,
+                  const rotation::MonteCarloResult &mc,
+                  const std::vector<rotation::TornadoBar> &bars) {
+    const Table percentiles = percentileTable(mc);
+    auto percentilesOf = [&](std::size_t row) {
+        QJsonObject o = percentiles.jsonRow(row);
+        o.remove(QStringLiteral("figure"));
+        return o;
+    };
+    QJsonArray counts;
+    for (const int n : mc.histogram) {
+        counts.append(n);
     }
+    ResultDocument document(run);
+    document.insert(preamble);
+    document.insert({{QStringLiteral("rotation"), Value::whole(age)},
+                     {QStringLiteral("draws"), Value::whole(settings.draws)},
+                     {QStringLiteral("seed"), Value::whole(static_cast<qint64>(settings.seed))},
+                     {QStringLiteral("probability_npv_below_zero"), probabilityOfLoss(mc)}});
+    document.insert(QStringLiteral("npv"), percentilesOf(0));
+    document.insert(QStringLiteral("lev"), percentilesOf(1));
+    document.insert(QStringLiteral("histogram"),
+                    QJsonObject{{QStringLiteral("npv_lowest"), Value::money(mc.npvLowest).json()},
+                                {QStringLiteral("npv_highest"), Value::money(mc.npvHighest).json()},
+                                {QStringLiteral("counts"), counts}});
+    document.insert(QStringLiteral("tornado"), tornadoTable(bars).json());
+    return document.bytes();
 }
 
 int runUncertainty(CommandContext &context) {
     const QString command = QStringLiteral("uncertainty");
     RotationInput in;
     rotation::MonteCarloSettings settings;
+    RunRecord run(command);
     try {
         QStringList arguments = context.arguments;
         const auto range = takeRateRange(arguments);
         const Options options(
             arguments, rotationOptionNames({"draws", "seed", "price-spread", "cost-spread"}));
-        in = readRotationInput(options, context.dataFolder);
+        in = readRotationInput(options, context.dataFolder, run);
         if (options.has("draws")) {
             settings.draws = options.wholeNumber("draws", 1, 10'000'000);
         }
@@ -104,6 +152,12 @@ int runUncertainty(CommandContext &context) {
         context.err << "arbolex-cli uncertainty: " << error.text << '\n';
         return kExitBadArguments;
     }
+    run.inputs({{QStringLiteral("draws"), Value::whole(settings.draws)},
+                {QStringLiteral("seed"), Value::whole(static_cast<qint64>(settings.seed))},
+                {QStringLiteral("price_spread"), Value::exact(settings.priceSpread)},
+                {QStringLiteral("cost_spread"), Value::exact(settings.costSpread)}});
+    run.input(QStringLiteral("rate_range"), QJsonArray{Value::exact(settings.rateLow).json(),
+                                                       Value::exact(settings.rateHigh).json()});
 
     StreamReport report(context.err, context.dataFolder);
     engine::Grow grow(&report);
@@ -116,38 +170,13 @@ int runUncertainty(CommandContext &context) {
         rotation::monteCarlo(*grown.path, age, in.economics, settings);
     const std::vector<rotation::TornadoBar> bars =
         rotation::tornado(*grown.path, age, in.economics);
-    if (in.format == QLatin1String("json")) {
-        QJsonArray tornado;
-        for (const rotation::TornadoBar &b : bars) {
-            tornado.append(QJsonObject{{QStringLiteral("factor"), QString::fromStdString(b.factor)},
-                                       {QStringLiteral("npv_low"), moneyJson(b.npvLow)},
-                                       {QStringLiteral("npv_high"), moneyJson(b.npvHigh)},
-                                       {QStringLiteral("lev_low"), moneyJson(b.levLow)},
-                                       {QStringLiteral("lev_high"), moneyJson(b.levHigh)}});
-        }
-        QJsonArray counts;
-        for (const int n : mc.histogram) {
-            counts.append(n);
-        }
-        const QJsonObject o{
-            {QStringLiteral("rotation"), age},
-            {QStringLiteral("rate"), in.economics.ratePercent},
-            {QStringLiteral("valuation"), valuationName(in.economics)},
-            {QStringLiteral("draws"), settings.draws},
-            {QStringLiteral("seed"), static_cast<qint64>(settings.seed)},
-            {QStringLiteral("npv"), percentilesJson(mc.npv)},
-            {QStringLiteral("lev"), percentilesJson(mc.lev)},
-            {QStringLiteral("probability_npv_below_zero"), mc.probabilityNpvBelowZero},
-            {QStringLiteral("histogram"),
-             QJsonObject{{QStringLiteral("npv_lowest"), moneyJson(mc.npvLowest)},
-                         {QStringLiteral("npv_highest"), moneyJson(mc.npvHighest)},
-                         {QStringLiteral("counts"), counts}}},
-            {QStringLiteral("tornado"), tornado}};
-        context.out << QJsonDocument(o).toJson(QJsonDocument::Indented);
+    const Fields preamble = rotationPreamble(grow, in.economics);
+    if (in.format == Format::kJson) {
+        writeOutput(context.out, toJson(run, preamble, age, settings, mc, bars));
     } else {
-        writeRotationPreamble(context.out, grow, in.economics);
-        context.out << "# rotation\t" << age << '\n';
-        writeTsv(context.out, mc, bars);
+        Fields withRotation = preamble;
+        withRotation.push_back({QStringLiteral("rotation"), Value::whole(age)});
+        writeOutput(context.out, toText(in.format, withRotation, mc, bars));
     }
     return report.reports() == 0 ? kExitSuccess : kExitEngineFailure;
 }
@@ -164,7 +193,8 @@ Command uncertaintyCommand() {
                 "                               [--price-spread SD] [--rate-range LO HI]\n"
                 "                               [--cost-spread SD] [--rate P] [costs]\n"
                 "                               [--prices LIST] [--valuation stand|assortment]\n"
-                "                               [--assortment-prices FILE] [--format tsv|json]\n"
+                "                               [--assortment-prices FILE]\n"
+                "                               [--format tsv|csv|json]\n"
                 "\n"
                 "Grows the rotation once (at --rotation, else its economic rotation) and\n"
                 "values it N times (default 10000) with a price level drawn log-normal\n"
@@ -177,7 +207,7 @@ Command uncertaintyCommand() {
                 "+-10 %, one at a time.\n"
                 "\n") +
                 standOptionsHelp() + regimeOptionsHelp() + economicsOptionsHelp() +
-                QStringLiteral("  --format tsv|json         output format (default tsv)\n"),
+                formatOptionHelp(),
             &runUncertainty};
 }
 

@@ -45,13 +45,16 @@ std::string csvLine(const std::vector<std::string> &fields) {
 }
 
 CsvFile::CsvFile(std::string path, const std::vector<std::string> &header)
-    : m_path(std::move(path)) {
+    : CsvFile(std::move(path)) {
+    write(header);
+}
+
+CsvFile::CsvFile(std::string path) : m_path(std::move(path)) {
     m_file = std::fopen(m_path.c_str(), "wb");
     if (m_file == nullptr) {
         fail();
     }
     std::setvbuf(m_file, nullptr, _IOFBF, kBufferBytes);
-    write(header);
 }
 
 CsvFile::~CsvFile() {

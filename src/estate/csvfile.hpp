@@ -29,6 +29,8 @@ class CsvFile {
 public:
     /// Creates (or empties) `path` and writes the header. Throws CsvFileError.
     CsvFile(std::string path, const std::vector<std::string> &header);
+    /// Creates (or empties) `path`; the caller writes its first line. Throws CsvFileError.
+    explicit CsvFile(std::string path);
     ~CsvFile();
     CsvFile(const CsvFile &) = delete;
     CsvFile &operator=(const CsvFile &) = delete;

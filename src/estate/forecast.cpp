@@ -85,8 +85,13 @@ std::vector<Forecast::Line> Forecast::lines(int firstYear) const {
     return out;
 }
 
-std::vector<std::string> forecastColumns() {
-    return {"year", "species", "thinning_volume", "final_cut_volume", "revenue"};
+std::vector<ResultColumn> forecastColumns() {
+    using enum ColumnType;
+    return {{"year", kInteger},
+            {"species", kText},
+            {"thinning_volume", kReal},
+            {"final_cut_volume", kReal},
+            {"revenue", kReal}};
 }
 
 std::vector<std::string> forecastValues(const Forecast::Line &line) {

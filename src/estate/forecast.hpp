@@ -5,6 +5,7 @@
 // litres and cents, so the forecasts of any split of the estate add up to the
 // forecast of the whole, exactly.
 
+#include "estate/resulttable.hpp"
 #include "estate/rowresult.hpp"
 
 #include <cstdint>
@@ -56,8 +57,8 @@ private:
     std::map<std::pair<int, std::string>, ForecastTotals> m_bySpecies;
 };
 
-/// Column names of the forecast table.
-std::vector<std::string> forecastColumns();
+/// Columns of the forecast table.
+std::vector<ResultColumn> forecastColumns();
 /// The values of a line as the table writes them (m³ to the litre, euro to the cent).
 std::vector<std::string> forecastValues(const Forecast::Line &line);
 /// A line read back from its values; std::nullopt when they are not a line.

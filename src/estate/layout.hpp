@@ -42,6 +42,10 @@ struct Layout {
     std::vector<int> carried;
     /// Names of the carried columns, in table order.
     std::vector<std::string> carriedNames;
+    /// True when a comma may stand for the decimal point in the numbers the
+    /// estate reads ("7,0"): a table whose fields are separated by
+    /// semicolons, as a spreadsheet with European settings exports it.
+    bool decimalComma = false;
 
     bool has(Column c) const { return index[static_cast<std::size_t>(c)] >= 0; }
     int at(Column c) const { return index[static_cast<std::size_t>(c)]; }

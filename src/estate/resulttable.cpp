@@ -109,8 +109,9 @@ void resultValues(const Layout &layout, long long line, const RowValues &input,
     figureValues(row, values);
 }
 
-std::vector<std::string> errorColumns() {
-    return {"line", "id", "message"};
+std::vector<ResultColumn> errorColumns() {
+    return {
+        {"line", ColumnType::kInteger}, {"id", ColumnType::kText}, {"message", ColumnType::kText}};
 }
 
 } // namespace arbolex::estate

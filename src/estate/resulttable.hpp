@@ -35,8 +35,8 @@ std::vector<ResultColumn> resultColumns(const Layout &layout);
 void resultValues(const Layout &layout, long long line, const RowValues &input,
                   const RowResult &row, std::vector<std::string> &values);
 
-/// Column names of the error table.
-std::vector<std::string> errorColumns();
+/// Columns of the error table.
+std::vector<ResultColumn> errorColumns();
 
 /// The id of a row as written in the input.
 const std::string &rowId(const Layout &layout, const RowValues &input);

@@ -28,20 +28,6 @@ std::string_view trimmed(const std::string &text) {
     return s;
 }
 
-/// A finite number, read the same whatever the locale.
-std::optional<double> number(const std::string &text) {
-    std::string_view s = trimmed(text);
-    if (!s.empty() && s.front() == '+') {
-        s.remove_prefix(1);
-    }
-    double x = 0.0;
-    const auto [end, error] = std::from_chars(s.data(), s.data() + s.size(), x);
-    if (s.empty() || error != std::errc() || end != s.data() + s.size() || !std::isfinite(x)) {
-        return std::nullopt;
-    }
-    return x;
-}
-
 class RowReader {
 public:
     RowReader(const Layout &layout, const RowValues &values) : m_layout(layout), m_values(values) {}
@@ -55,7 +41,12 @@ public:
                    : kNone;
     }
     bool empty(Column c) const { return trimmed(text(c)).empty(); }
-    std::optional<double> value(Column c) const { return number(text(c)); }
+    std::optional<double> value(Column c) const {
+        return decimalNumber(text(c), m_layout.decimalComma);
+    }
+    std::optional<long long> whole(Column c) const {
+        return wholeNumber(text(c), m_layout.decimalComma);
+    }
 
 private:
     const Layout &m_layout;
@@ -76,7 +67,7 @@ AgeValue ageValue(const RowReader &row, Column c, std::optional<int> fallback, i
     if (row.empty(c)) {
         return {fallback, std::nullopt};
     }
-    const std::optional<long long> whole = wholeNumber(row.text(c));
+    const std::optional<long long> whole = row.whole(c);
     if (!whole || *whole < lowest || *whole > kLongestAge) {
         return {std::nullopt, "the " + columnName(c) + " \"" + row.text(c) +
                                   "\" is not a whole number from " + std::to_string(lowest) +
@@ -130,8 +121,33 @@ std::variant<rotation::Regime, std::string> regimeOf(const RowReader &row,
 
 } // namespace
 
-std::optional<long long> wholeNumber(const std::string &text) {
-    const std::optional<double> x = number(text);
+std::optional<double> decimalNumber(const std::string &text, bool decimalComma) {
+    std::string_view s = trimmed(text);
+    if (!s.empty() && s.front() == '+') {
+        s.remove_prefix(1);
+    }
+    // "12,4" is read as "12.4": one comma, and no point beside it.
+    std::string pointed;
+    const std::size_t comma = s.find(',');
+    if (decimalComma && comma != std::string_view::npos) {
+        if (s.find(',', comma + 1) != std::string_view::npos ||
+            s.find('.') != std::string_view::npos) {
+            return std::nullopt;
+        }
+        pointed.assign(s);
+        pointed[comma] = '.';
+        s = pointed;
+    }
+    double x = 0.0;
+    const auto [end, error] = std::from_chars(s.data(), s.data() + s.size(), x);
+    if (s.empty() || error != std::errc() || end != s.data() + s.size() || !std::isfinite(x)) {
+        return std::nullopt;
+    }
+    return x;
+}
+
+std::optional<long long> wholeNumber(const std::string &text, bool decimalComma) {
+    const std::optional<double> x = decimalNumber(text, decimalComma);
     if (!x || *x != std::trunc(*x) || std::fabs(*x) > 1e15) {
         return std::nullopt;
     }
@@ -139,8 +155,7 @@ std::optional<long long> wholeNumber(const std::string &text) {
 }
 
 std::optional<std::int16_t> modelOf(const Layout &layout, const RowValues &values) {
-    const std::optional<long long> model =
-        wholeNumber(RowReader(layout, values).text(Column::kModel));
+    const std::optional<long long> model = RowReader(layout, values).whole(Column::kModel);
     if (!model || *model < 0 || *model >= engine::kModelCount) {
         return std::nullopt;
     }

@@ -47,7 +47,12 @@ std::variant<RowPlan, std::string> planRow(const Layout &layout, const RowValues
 std::optional<std::int16_t> modelOf(const Layout &layout, const RowValues &values);
 
 /// A whole number from the text of a value (spaces around it allowed), or
-/// std::nullopt.
-std::optional<long long> wholeNumber(const std::string &text);
+/// std::nullopt. With `decimalComma`, a comma may stand for the decimal
+/// point ("12,0"), but a value never holds both.
+std::optional<long long> wholeNumber(const std::string &text, bool decimalComma = false);
+
+/// A finite number from the text of a value, read the same whatever the
+/// locale, or std::nullopt; `decimalComma` as for wholeNumber.
+std::optional<double> decimalNumber(const std::string &text, bool decimalComma = false);
 
 } // namespace arbolex::estate

@@ -8,26 +8,27 @@ namespace arbolex::estateio {
 
 namespace {
 
-std::vector<std::string> names(const std::vector<estate::ResultColumn> &columns) {
-    std::vector<std::string> out;
-    out.reserve(columns.size());
-    for (const estate::ResultColumn &c : columns) {
-        out.push_back(c.name);
-    }
-    return out;
+/// A result table of the job in its folder and format.
+estate::ResultFile resultFile(const EstateJob &job, const char *table,
+                              std::vector<estate::ResultColumn> columns) {
+    const std::string members = job.format == estate::TableFormat::kJson && job.jsonMembers
+                                    ? job.jsonMembers(columns)
+                                    : std::string();
+    return {job.outFolder + "/" + resultFileName(table, job.format), job.format, std::move(columns),
+            members};
 }
 
 /// Writes each row's results and lists the rows that were not grown.
 class FileSink : public estate::IRowSink {
 public:
-    FileSink(const estate::Layout &layout, const std::string &folder, const LayerReader &reader,
+    FileSink(const estate::Layout &layout, const EstateJob &job, const LayerReader &reader,
              const EstateCallbacks &callbacks)
         : m_layout(layout), m_callbacks(callbacks),
-          m_results(folder + "/" + kResultsFile, names(estate::resultColumns(layout))),
-          m_errors(folder + "/" + kErrorsFile, estate::errorColumns()) {
+          m_results(resultFile(job, kResultsTable, estate::resultColumns(layout))),
+          m_errors(resultFile(job, kErrorsTable, estate::errorColumns())) {
         if (!reader.isTable()) {
             const TableWriter::Geometry geometry{reader.spatialReference(), reader.geometryType()};
-            m_layerResults = std::make_unique<TableWriter>(folder + "/" + kResultsLayerFile,
+            m_layerResults = std::make_unique<TableWriter>(job.outFolder + "/" + kResultsLayerFile,
                                                            estate::resultColumns(layout), geometry);
         }
     }
@@ -35,7 +36,7 @@ public:
     void prepare(const estate::EstateRow &row, estate::RowResult &result) const override {
         std::vector<std::string> values;
         estate::resultValues(m_layout, row.line, row.values, result, values);
-        result.prepared = estate::csvLine(values);
+        result.prepared = m_results.line(values);
     }
 
     void write(const estate::EstateRow &row, const estate::RowResult &result) override {
@@ -66,15 +67,15 @@ public:
 private:
     const estate::Layout &m_layout;
     const EstateCallbacks &m_callbacks;
-    estate::CsvFile m_results;
-    estate::CsvFile m_errors;
+    estate::ResultFile m_results;
+    estate::ResultFile m_errors;
     std::unique_ptr<TableWriter> m_layerResults;
     std::vector<std::string> m_values;
 };
 
-void writeForecast(const std::string &path, const estate::Forecast &forecast, int firstYear) {
-    estate::CsvFile table(path, estate::forecastColumns());
-    for (const estate::Forecast::Line &line : forecast.lines(firstYear)) {
+void writeForecast(const EstateJob &job, const estate::Forecast &forecast) {
+    estate::ResultFile table = resultFile(job, kForecastTable, estate::forecastColumns());
+    for (const estate::Forecast::Line &line : forecast.lines(job.defaults.year)) {
         table.write(estate::forecastValues(line));
     }
     table.close();
@@ -82,10 +83,14 @@ void writeForecast(const std::string &path, const estate::Forecast &forecast, in
 
 } // namespace
 
+std::string resultFileName(const char *table, estate::TableFormat format) {
+    return std::string(table) + '.' + estate::fileExtension(format);
+}
+
 estate::RunSummary runEstateFiles(const EstateJob &job, const EstateCallbacks &callbacks) {
     LayerReader reader(job.input, job.layer, true);
     std::string problem;
-    const std::optional<estate::Layout> layout = estate::layoutOf(reader.columnNames(), problem);
+    const std::optional<estate::Layout> layout = layoutOf(reader, problem);
     if (!layout) {
         throw GdalError("\"" + job.input + "\": " + problem);
     }
@@ -95,7 +100,7 @@ estate::RunSummary runEstateFiles(const EstateJob &job, const EstateCallbacks &c
         throw GdalError("cannot create the folder \"" + job.outFolder + "\": " + made.message());
     }
     try {
-        FileSink sink(*layout, job.outFolder, reader, callbacks);
+        FileSink sink(*layout, job, reader, callbacks);
         estate::EstateProgress progress;
         if (callbacks.progress) {
             // Counting the rows costs a pass over the input: only for a progress line.
@@ -106,7 +111,7 @@ estate::RunSummary runEstateFiles(const EstateJob &job, const EstateCallbacks &c
         estate::RunSummary summary =
             estate::runEstate(reader, sink, *layout, job.defaults, job.settings, progress);
         sink.close();
-        writeForecast(job.outFolder + "/" + kForecastFile, summary.forecast, job.defaults.year);
+        writeForecast(job, summary.forecast);
         return summary;
     } catch (const estate::CsvFileError &error) {
         throw GdalError(error.what());

@@ -2,9 +2,11 @@
 
 // An estate from a file to a folder of results: the input read through GDAL,
 // every row grown and valued, and subcompartments.csv, forecast.csv,
-// errors.csv (and, for a GIS layer, subcompartments.gpkg) written.
+// errors.csv (or .tsv, or .json) and, for a GIS layer, subcompartments.gpkg
+// written.
 
 #include "estate/estaterun.hpp"
+#include "estate/tablefile.hpp"
 #include "estateio/gdallayer.hpp"
 
 #include <functional>
@@ -12,10 +14,14 @@
 
 namespace arbolex::estateio {
 
-inline constexpr const char *kResultsFile = "subcompartments.csv";
+/// The result tables' names, before the format's ending.
+inline constexpr const char *kResultsTable = "subcompartments";
+inline constexpr const char *kForecastTable = "forecast";
+inline constexpr const char *kErrorsTable = "errors";
 inline constexpr const char *kResultsLayerFile = "subcompartments.gpkg";
-inline constexpr const char *kForecastFile = "forecast.csv";
-inline constexpr const char *kErrorsFile = "errors.csv";
+
+/// The file name of a result table in a format ("forecast.tsv").
+std::string resultFileName(const char *table, estate::TableFormat format);
 
 struct EstateJob {
     /// The input: a CSV file with a header row or any vector layer GDAL reads.
@@ -26,6 +32,11 @@ struct EstateJob {
     std::string outFolder;
     estate::EstateDefaults defaults;
     estate::RunSettings settings;
+    /// Format of the result tables.
+    estate::TableFormat format = estate::TableFormat::kCsv;
+    /// For JSON, the members that open the document of a table with
+    /// `columns` (its run record and units), rendered by the caller.
+    std::function<std::string(const std::vector<estate::ResultColumn> &columns)> jsonMembers;
 };
 
 /// What a run tells its caller besides the result files.

@@ -1,6 +1,7 @@
 #include "estateio/gdallayer.hpp"
 
 #include <cpl_conv.h>
+#include <cpl_csv.h>
 #include <cpl_error.h>
 #include <cpl_vsi.h>
 #include <gdal.h>
@@ -44,6 +45,22 @@ OGRFieldType fieldType(estate::ColumnType type) {
     return OFTString;
 }
 
+/// The separator of a CSV file as GDAL's CSV driver finds it in the first
+/// line (a UTF-8 byte-order mark before it is skipped, as the driver does).
+char csvSeparator(const char *path) {
+    VSILFILE *file = VSIFOpenL(path, "rb");
+    if (file == nullptr) {
+        return ',';
+    }
+    const char *line = CPLReadLineL(file);
+    std::string header = line != nullptr ? line : "";
+    VSIFCloseL(file);
+    if (header.rfind("\xEF\xBB\xBF", 0) == 0) {
+        header.erase(0, 3);
+    }
+    return CSVDetectSeperator(header.c_str());
+}
+
 } // namespace
 
 LayerReader::LayerReader(const std::string &path, const std::string &layerName, bool keepGeometry)
@@ -68,6 +85,11 @@ LayerReader::LayerReader(const std::string &path, const std::string &layerName, 
     }
     const char *driver = GDALGetDriverShortName(GDALGetDatasetDriver(m_dataset));
     m_isTable = std::string(driver) == "CSV";
+    if (m_isTable) {
+        char **files = GDALGetFileList(m_dataset);
+        m_decimalComma = files != nullptr && files[0] != nullptr && csvSeparator(files[0]) == ';';
+        CSLDestroy(files);
+    }
 }
 
 LayerReader::~LayerReader() {
@@ -209,6 +231,31 @@ void TableWriter::close() {
     if (CPLGetLastErrorType() >= CE_Failure) {
         throw GdalError(lastError("cannot write to \"" + m_path + "\""));
     }
+}
+
+std::optional<estate::Layout> layoutOf(const LayerReader &reader, std::string &problem) {
+    std::optional<estate::Layout> layout = estate::layoutOf(reader.columnNames(), problem);
+    if (layout) {
+        layout->decimalComma = reader.decimalComma();
+    }
+    return layout;
+}
+
+std::vector<std::string> datasetFiles(const std::string &path) {
+    registerDrivers();
+    std::vector<std::string> out;
+    GDALDatasetH dataset =
+        GDALOpenEx(path.c_str(), GDAL_OF_VECTOR | GDAL_OF_READONLY, nullptr, nullptr, nullptr);
+    if (dataset == nullptr) {
+        return out;
+    }
+    char **files = GDALGetFileList(dataset);
+    for (char **f = files; f != nullptr && *f != nullptr; ++f) {
+        out.emplace_back(*f);
+    }
+    CSLDestroy(files);
+    GDALClose(dataset);
+    return out;
 }
 
 std::vector<std::vector<std::string>> readTable(const std::string &path,

@@ -32,6 +32,10 @@ public:
     const std::vector<std::string> &columnNames() const { return m_names; }
     /// True for a table without geometry (a CSV file).
     bool isTable() const { return m_isTable; }
+    /// True for a CSV file whose fields are separated by semicolons (as GDAL
+    /// finds the separator in the header line): its numbers may be written
+    /// with a decimal comma.
+    bool decimalComma() const { return m_decimalComma; }
     /// Rows of the layer, or -1 when the driver cannot tell quickly (a CSV
     /// file is scanned once, without reading its fields).
     long long rowCount() const;
@@ -47,6 +51,7 @@ private:
     void *m_layer = nullptr;
     std::vector<std::string> m_names;
     bool m_isTable = false;
+    bool m_decimalComma = false;
     bool m_keepGeometry = false;
     long long m_read = 0;
 };
@@ -81,6 +86,14 @@ private:
     long long m_inTransaction = 0;
     std::string m_path;
 };
+
+/// The layout of the reader's columns, with the decimal comma of its file
+/// (estate::layoutOf).
+std::optional<estate::Layout> layoutOf(const LayerReader &reader, std::string &problem);
+
+/// The files of the dataset at `path` (a Shapefile's .shp, .dbf, .shx …);
+/// empty when it cannot be opened.
+std::vector<std::string> datasetFiles(const std::string &path);
 
 /// Every row of the first layer of `path`, as text (for reading back the
 /// estate's own tables). Throws GdalError.

@@ -150,7 +150,7 @@ void EstateWindowLogic::openEstate(const QString &path) {
                     try {
                         estateio::LayerReader reader(job->path, std::string(), false);
                         std::string problem;
-                        job->layout = estate::layoutOf(reader.columnNames(), problem);
+                        job->layout = estateio::layoutOf(reader, problem);
                         if (!job->layout) {
                             job->fault = QString::fromStdString(problem);
                             return;

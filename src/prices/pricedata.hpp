@@ -60,6 +60,11 @@ inline constexpr const char *kUserPricesFile = "USRPRIC.qdm";
 inline constexpr const char *kAveragePricesFile = "AvPRIC_npv.qdm";
 inline constexpr const char *kUserAssortmentsFile = "UD_Assort.qdm";
 inline constexpr const char *kAssortmentPricesFile = "AssortPrices.qdm";
+/// The files GetPricesFromFiles reads, in its order: it stops at the first
+/// one missing.
+inline constexpr const char *kFilesReadForPrices[] = {kCurrentPricesFile, kPrivatePricesFile,
+                                                      kUserPricesFile, kAveragePricesFile,
+                                                      kUserAssortmentsFile};
 /// The files the exit writes back, which the data history keeps.
 inline constexpr const char *kFilesWrittenAtExit[] = {kCurrentPricesFile, kUserPricesFile,
                                                       kAveragePricesFile, kUserAssortmentsFile,

@@ -38,8 +38,8 @@ TEST_F(AssortRunnerTest, ThinningReportsBecomeRows) {
     EXPECT_EQ(lines[1], QStringLiteral("7-14 cm"));
     // Header, four growth rows, the thinning row, then pre-thin before thinning.
     ASSERT_EQ(lines.size(), 2 + 1 + 4 + 1 + 2);
-    EXPECT_TRUE(lines[8].startsWith(QStringLiteral("30\t7-14(%) ")));
-    EXPECT_TRUE(lines[9].startsWith(QStringLiteral("30\t7-14(%) ")));
+    EXPECT_TRUE(lines[8].startsWith(QStringLiteral("AC yr\t30\t7-14(%) ")));
+    EXPECT_TRUE(lines[9].startsWith(QStringLiteral("AT yr\t30\t7-14(%) ")));
 }
 
 TEST_F(AssortRunnerTest, CategoriesWindowAndUserReport) {

@@ -265,6 +265,35 @@ TEST_F(EstateCliTest, AGeoPackageComesBackWithItsGeometryAndTypedResults) {
     EXPECT_EQ(read(path("gis/subcompartments.csv")).size(), 2U);
 }
 
+TEST_F(EstateCliTest, ASemicolonSpreadsheetWithDecimalCommasGivesItsPlainTwinsFiles) {
+    // As a spreadsheet with European settings saves it: a byte-order mark,
+    // semicolons, decimal commas, and a carried text holding a semicolon.
+    writeInput("european.csv",
+               "\xEF\xBB\xBFid;model;age;stocking;top_height;basal_area;area_ha;note\n"
+               "A1;0;15;2500;7,0;20,5;2,25;\"fenced; deer\"\n"
+               "A2;8;18;2200;9;22,25;4;\n"
+               "B1;0;15;2500;7,0,1;20;1;\n");
+    writeInput("plain.csv", "id,model,age,stocking,top_height,basal_area,area_ha,note\n"
+                            "A1,0,15,2500,7.0,20.5,2.25,fenced; deer\n"
+                            "A2,8,18,2200,9,22.25,4,\n"
+                            "B1,0,15,2500,\"7,0\",20,1,\n");
+    EXPECT_EQ(estate(path("european.csv"), path("eu")).exitCode, 1);
+    EXPECT_EQ(estate(path("plain.csv"), path("plain")).exitCode, 1);
+    for (const char *file : {"/subcompartments.csv", "/forecast.csv", "/errors.csv"}) {
+        const QByteArray european = bytes(path("eu") + QLatin1String(file));
+        EXPECT_FALSE(european.isEmpty()) << file;
+        EXPECT_EQ(european, bytes(path("plain") + QLatin1String(file))) << file;
+    }
+    // A value that is no number keeps its row's message and line in both; in
+    // the comma-separated twin that is the quoted decimal comma.
+    const Table errors = read(path("plain/errors.csv"));
+    ASSERT_EQ(errors.size(), 1U);
+    EXPECT_EQ(errors[0],
+              (std::vector<std::string>{"4", "B1",
+                                        "FAULT - Grow From TOP HEIGHT has not been specified "
+                                        "correctly."}));
+}
+
 TEST_F(EstateCliTest, AnInputThatCannotBeReadExitsWithTwo) {
     EXPECT_EQ(estate(path("missing.csv"), path("out")).exitCode, 2);
     writeInput("short.csv", "id,model,age,stocking,top_height,basal_area\nS,0,15,2500,7,20\n");

@@ -8,6 +8,9 @@
 
 #include <QDir>
 #include <QFile>
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
 #include <QProcess>
 #include <QTemporaryDir>
 
@@ -30,9 +33,13 @@ TEST_F(RunnerTest, TypesPressesAndPrintsAsAUserWould) {
     ASSERT_EQ(lines.size(), 2 + 4) << output.toStdString(); // two fields, header, three rows
     EXPECT_EQ(lines[0], QStringLiteral("25")) << "the key filter dropped the x";
     EXPECT_EQ(lines[1], QStringLiteral("16.0"));
-    EXPECT_TRUE(lines[2].startsWith(QStringLiteral("Age\tTop Ht\tN/ha\tDBH\t BA")));
-    EXPECT_EQ(lines[2].count(QLatin1Char('\t')), 25);
-    EXPECT_TRUE(lines[3].startsWith(QStringLiteral("15\t7.0\t2500\t10.1\t20.0\t")));
+    // Each row's label first, as a copied table has it; every line has the
+    // header's fields, the first row's summary marker an empty cell.
+    EXPECT_TRUE(lines[2].startsWith(QStringLiteral("Row\tAge\tTop Ht\tN/ha\tDBH\t BA")));
+    for (qsizetype i = 2; i < lines.size(); ++i) {
+        EXPECT_EQ(lines[i].count(QLatin1Char('\t')), 26) << lines[i].toStdString();
+    }
+    EXPECT_TRUE(lines[3].startsWith(QStringLiteral("G yr\t15\t7.0\t2500\t10.1\t20.0\t")));
 }
 
 TEST_F(RunnerTest, MessagesAndQuestionsArePrintedInOrder) {
@@ -65,7 +72,7 @@ TEST_F(RunnerTest, AWholeThinnedRotationCanBeScripted) {
     EXPECT_TRUE(lines[1].endsWith(QStringLiteral("\tno")));
     EXPECT_TRUE(lines[1].contains(QStringLiteral("thinning only once\\r\\nOR ")));
     EXPECT_EQ(lines[2], QStringLiteral("0"));
-    EXPECT_TRUE(lines.last().startsWith(QStringLiteral("30\t16.0\t"))) << "the thinning row";
+    EXPECT_TRUE(lines.last().startsWith(QStringLiteral("T yr\t30\t16.0\t"))) << "the thinning row";
     EXPECT_TRUE(lines.last().contains(QStringLiteral("\t40\t")));
 }
 
@@ -189,9 +196,16 @@ TEST(GrowCommandTest, PrintsTheGridInEachFormat) {
 
     p.start(cli(), stand + QStringList{QStringLiteral("--format"), QStringLiteral("json")});
     ASSERT_TRUE(p.waitForFinished());
-    const QString json = QString::fromUtf8(p.readAllStandardOutput());
-    EXPECT_TRUE(json.contains(QStringLiteral("\"columns\": [\"Age\", \"Top Ht\"")));
-    EXPECT_EQ(json.count(QStringLiteral("[\"")), 4);
+    const QJsonObject json = QJsonDocument::fromJson(p.readAllStandardOutput()).object();
+    const QJsonArray rows = json[QStringLiteral("rows")].toArray();
+    ASSERT_EQ(rows.size(), 3);
+    const QJsonObject first = rows[0].toObject();
+    EXPECT_EQ(first[QStringLiteral("label")], QStringLiteral("G yr"));
+    EXPECT_EQ(first[QStringLiteral("in_summary")], true);
+    EXPECT_EQ(rows[1].toObject()[QStringLiteral("in_summary")], false);
+    EXPECT_EQ(first[QStringLiteral("basal_area")].toDouble(), 20.0) << "DBH completed BA";
+    EXPECT_EQ(json[QStringLiteral("units")].toObject()[QStringLiteral("top_height")],
+              QStringLiteral("m"));
 
     QStringList refused = stand;
     refused[refused.indexOf(QStringLiteral("7"))] = QStringLiteral("60");

@@ -94,7 +94,7 @@ TEST_F(RunnerRotationTest, DeletedRowsLetTheStandGrowAgain) {
                QStringLiteral("press cmdDeleteRows"), QStringLiteral("set txtToA 40"),
                QStringLiteral("press cmdGrow"), QStringLiteral("print flxMain")});
     ASSERT_EQ(shown.size(), 1 + 6) << output.toStdString(); // header, 15 to 40
-    EXPECT_TRUE(shown.last().startsWith(QStringLiteral("40\t")));
+    EXPECT_TRUE(shown.last().startsWith(QStringLiteral("G yr\t40\t")));
 }
 
 } // namespace

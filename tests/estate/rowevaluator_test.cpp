@@ -193,3 +193,57 @@ TEST_F(EstateRowTest, WithoutARotationAnywhereFellsAtTheEconomicRotation) {
 
 } // namespace
 } // namespace arbolex::estate
+
+namespace arbolex::estate {
+namespace {
+
+using testing::sitkaRow;
+using testing::with;
+
+/// `row` with a decimal comma in every number the estate reads.
+RowValues withDecimalCommas(const RowValues &row) {
+    RowValues out =
+        with(with(with(row, "top_height", "7,0"), "basal_area", "20,0"), "area_ha", "2,5");
+    return with(
+        with(with(with(out, "thin_from", "20,0"), "thin_every", "5"), "thin_volume", "40,0"),
+        "rotation", "48,0");
+}
+
+TEST_F(EstateRowTest, DecimalCommasOfASemicolonTableReadAsTheirPointedTwins) {
+    Layout semicolons = m_layout;
+    semicolons.decimalComma = true;
+    RowEvaluator european(semicolons, m_defaults);
+    RowEvaluator plain(m_layout, m_defaults);
+    const RowValues pointed = with(
+        with(with(with(sitkaRow(), "thin_from", "20"), "thin_every", "5"), "thin_volume", "40"),
+        "rotation", "48");
+    const RowResult a = european.evaluate(withDecimalCommas(sitkaRow()));
+    const RowResult b = plain.evaluate(pointed);
+    ASSERT_EQ(a.status, RowStatus::kOk) << a.message;
+    EXPECT_EQ(a.npv, b.npv);
+    EXPECT_EQ(a.areaHa, 2.5);
+    EXPECT_EQ(a.finalCutAge, 48);
+    // A point still reads in a semicolon table.
+    EXPECT_EQ(european.evaluate(pointed).npv, b.npv);
+
+    // Where the comma separates fields it is no decimal point: the row's own message.
+    const RowResult refused = plain.evaluate(withDecimalCommas(sitkaRow()));
+    EXPECT_EQ(refused.status, RowStatus::kRefused);
+    EXPECT_EQ(refused.message, std::string(rotation::standtext::kFaultFromHeight));
+}
+
+TEST(EstateNumberTest, ADecimalCommaIsOneCommaAndNoPoint) {
+    EXPECT_EQ(decimalNumber(" 12,4 ", true), 12.4);
+    EXPECT_EQ(decimalNumber("+7,", true), 7.0);
+    EXPECT_EQ(decimalNumber("7.5", true), 7.5);
+    EXPECT_EQ(decimalNumber("1e3", true), 1000.0);
+    EXPECT_EQ(wholeNumber("50,0", true), 50);
+    // Thousands and decimals, or two commas, say nothing certain: refused.
+    EXPECT_FALSE(decimalNumber("2.500,5", true));
+    EXPECT_FALSE(decimalNumber("1,2,3", true));
+    EXPECT_FALSE(decimalNumber("12,4", false));
+    EXPECT_FALSE(wholeNumber("50,5", true));
+}
+
+} // namespace
+} // namespace arbolex::estate
