@@ -1,5 +1,6 @@
 #include "rotation/rotation.hpp"
 
+#include "engine/vectorstate.hpp"
 #include "format/displayformat.hpp"
 #include "rotation/optimiser.hpp"
 #include "rotation/yieldclass.hpp"
@@ -93,7 +94,10 @@ Figures figures(const Flows &f, int presentAge, double ratePercent) {
     out.npv = valuation::netPresentValue(fromPresent, ratePercent);
     out.lev = valuation::landExpectationValue(f.net, ratePercent);
     if (out.lev) {
-        out.forestValue = valuation::forestValue(fromPresent, *out.lev, ratePercent);
+        // The forest value adds the LEV to the same net present value.
+        const int yearsToFinalCut =
+            fromPresent.empty() ? 0 : static_cast<int>(fromPresent.size()) - 1;
+        out.forestValue = valuation::forestValue(out.npv, yearsToFinalCut, *out.lev, ratePercent);
     }
     return out;
 }
@@ -205,6 +209,7 @@ std::optional<std::string> rotationProblem(const GrowthPath &path, const Regime 
 std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const Regime &regime,
                                    GrowthFailure &failure, const ThinningLimits *limits,
                                    std::optional<int> finalCut) {
+    engine::clearUpperVectorState();
     const unsigned faultsBefore = grow.faultCount();
     auto engineFailed = [&](std::string text) {
         failure = {false, std::move(text)};
@@ -310,6 +315,7 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
 }
 
 void divideThinnings(GrowthPath &path) {
+    engine::clearUpperVectorState();
     for (Harvest &t : path.thinnings) {
         t.assortments = divideHarvest(t.volume, t.basalArea, t.stocking, path.volumeRatio);
     }
@@ -318,6 +324,7 @@ void divideThinnings(GrowthPath &path) {
 
 RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics,
                             Appraisal appraisal) {
+    engine::clearUpperVectorState();
     RotationValue v;
     v.rotation = rotation;
     std::vector<Harvest> all = harvests(path, rotation, economics, v.finalCut);
@@ -359,6 +366,7 @@ int firstRotation(const GrowthPath &path, const Regime &regime) {
 
 RotationExplorer exploreRotations(const GrowthPath &path, const Regime &regime,
                                   const Economics &economics) {
+    engine::clearUpperVectorState();
     RotationExplorer e;
     double bestMai = -std::numeric_limits<double>::infinity();
     double bestLev = -std::numeric_limits<double>::infinity();
@@ -393,6 +401,7 @@ RotationChoice chooseRotation(const GrowthPath &path, const Regime &regime,
 
 Candidate scoreRotation(const GrowthPath &path, const Regime &regime, int rotation,
                         const Economics &economics, Objective objective) {
+    engine::clearUpperVectorState();
     Candidate c;
     c.rotation = rotation;
     Harvest finalCut;

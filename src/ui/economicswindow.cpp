@@ -3,6 +3,7 @@
 #include "economics/economicsformat.hpp"
 #include "economics/economicsmessages.hpp"
 #include "economics/economicswindowlogic.hpp"
+#include "engine/vectorstate.hpp"
 #include "ui/economicscharts.hpp"
 #include "ui/fieldinput.hpp"
 #include "ui/stringgridmodel.hpp"
@@ -98,6 +99,7 @@ EconomicsWindow::EconomicsWindow(QWidget *main) : QDialog(main) {
     m_tabs->addTab(buildOptimiserTab(), et::tabOptimiser());
     m_tabs->addTab(buildSensitivityTab(), et::tabSensitivity());
     m_tabs->addTab(buildMonteCarloTab(), et::tabMonteCarlo());
+    connect(m_tabs, &QTabWidget::currentChanged, this, [this] { showPendingCharts(); });
     layout->addWidget(m_tabs, 1);
 
     auto *bottom = new QHBoxLayout;
@@ -370,10 +372,33 @@ void EconomicsWindow::focus(EconomicsControl c) {
     focusControl(control(c));
 }
 
-void EconomicsWindow::showChart(QChartView *view, QChart *chart) {
+void EconomicsWindow::showChart(QChartView *view, std::function<QChart *()> build) {
+    // A chart on a tab out of view is built when its tab is shown: laying out
+    // the sensitivity and Monte Carlo charts at every computation cost more
+    // than all the figures.
+    if (!m_tabs->currentWidget()->isAncestorOf(view)) {
+        m_pendingCharts[view] = std::move(build);
+        return;
+    }
+    m_pendingCharts.erase(view);
     QChart *old = view->chart();
-    view->setChart(chart);
+    view->setChart(build());
     delete old;
+}
+
+void EconomicsWindow::showPendingCharts() {
+    for (auto pending = m_pendingCharts.begin(); pending != m_pendingCharts.end();) {
+        QChartView *view = pending->first;
+        if (!m_tabs->currentWidget()->isAncestorOf(view)) {
+            ++pending;
+            continue;
+        }
+        const std::function<QChart *()> build = std::move(pending->second);
+        pending = m_pendingCharts.erase(pending);
+        QChart *old = view->chart();
+        view->setChart(build());
+        delete old;
+    }
 }
 
 void EconomicsWindow::figuresChanged() {
@@ -382,17 +407,22 @@ void EconomicsWindow::figuresChanged() {
     }
     const QString rate = et::atRate(m_logic->rateText());
     m_valueBox->setTitle(et::panelValue() + QLatin1Char(' ') + rate);
-    showChart(m_rotationChart,
-              rotationChart(m_logic->explorer(), et::panelRotations() + QLatin1Char(' ') + rate));
+    showChart(m_rotationChart, [this, rate] {
+        return rotationChart(m_logic->explorer(), et::panelRotations() + QLatin1Char(' ') + rate);
+    });
     const auto &value = m_logic->value();
     if (value && value->npv && value->lev) {
-        showChart(m_tornadoNpv, tornadoChart(m_logic->tornado(), *value->npv, false,
-                                             et::panelTornadoNpv() + QLatin1Char(' ') + rate));
-        showChart(m_tornadoLev, tornadoChart(m_logic->tornado(), *value->lev, true,
-                                             et::panelTornadoLev() + QLatin1Char(' ') + rate));
+        showChart(m_tornadoNpv, [this, rate, npv = *value->npv] {
+            return tornadoChart(m_logic->tornado(), npv, false,
+                                et::panelTornadoNpv() + QLatin1Char(' ') + rate);
+        });
+        showChart(m_tornadoLev, [this, rate, lev = *value->lev] {
+            return tornadoChart(m_logic->tornado(), lev, true,
+                                et::panelTornadoLev() + QLatin1Char(' ') + rate);
+        });
     } else {
-        showChart(m_tornadoNpv, new QChart);
-        showChart(m_tornadoLev, new QChart);
+        showChart(m_tornadoNpv, [] { return new QChart; });
+        showChart(m_tornadoLev, [] { return new QChart; });
     }
     regimesChanged();
 }
@@ -414,16 +444,16 @@ void EconomicsWindow::monteCarloChanged() {
     if (m_logic == nullptr) {
         return;
     }
-    if (const auto &result = m_logic->monteCarlo()) {
-        showChart(m_histogram, histogramChart(*result, et::panelMonteCarlo() +
-                                                           QStringLiteral(" (rate drawn "
-                                                                          "from ") +
-                                                           m_logic->view().text(C::txtRateLow) +
-                                                           QStringLiteral(" to ") +
-                                                           m_logic->view().text(C::txtRateHigh) +
-                                                           QStringLiteral(" % a year)")));
+    if (m_logic->monteCarlo()) {
+        const QString title = et::panelMonteCarlo() + QStringLiteral(" (rate drawn from ") +
+                              m_logic->view().text(C::txtRateLow) + QStringLiteral(" to ") +
+                              m_logic->view().text(C::txtRateHigh) + QStringLiteral(" % a year)");
+        showChart(m_histogram, [this, title] {
+            const auto &drawn = m_logic->monteCarlo();
+            return drawn ? histogramChart(*drawn, title) : new QChart;
+        });
     } else {
-        showChart(m_histogram, new QChart);
+        showChart(m_histogram, [] { return new QChart; });
     }
 }
 
@@ -435,7 +465,12 @@ void EconomicsWindow::setProgress(double fraction) {
 }
 
 void EconomicsWindow::runInBackground(std::function<void()> work, std::function<void()> done) {
-    m_worker = QThread::create(std::move(work));
+    // The thread starts with the window thread's vector state, which Qt
+    // leaves dirty (engine/vectorstate.hpp).
+    m_worker = QThread::create([work = std::move(work)] {
+        engine::clearUpperVectorState();
+        work();
+    });
     connect(m_worker, &QThread::finished, this, [this, done = std::move(done)] {
         m_worker->deleteLater();
         m_worker = nullptr;

@@ -5,6 +5,8 @@
 #include <QDialog>
 
 #include <array>
+#include <functional>
+#include <map>
 
 class QChart;
 class QChartView;
@@ -68,7 +70,10 @@ private:
     QWidget *valuationChoice();
     QWidget *button(economics::EconomicsControl control, const QString &caption);
     /// Shows `chart` in `view`, deleting the chart it showed before.
-    static void showChart(QChartView *view, QChart *chart);
+    /// Sets the chart `build` makes on `view` now when its tab is in view, or
+    /// when its tab is next shown.
+    void showChart(QChartView *view, std::function<QChart *()> build);
+    void showPendingCharts();
 
     economics::EconomicsWindowLogic *m_logic = nullptr;
     std::array<QWidget *, economics::kEconomicsControlCount> m_controls{};
@@ -79,6 +84,8 @@ private:
     QChartView *m_tornadoNpv = nullptr;
     QChartView *m_tornadoLev = nullptr;
     QChartView *m_histogram = nullptr;
+    /// Charts waiting for their tab to be shown.
+    std::map<QChartView *, std::function<QChart *()>> m_pendingCharts;
     QProgressBar *m_progress = nullptr;
     QTableView *m_regimes = nullptr;
     StringGridModel *m_regimeModel = nullptr;
