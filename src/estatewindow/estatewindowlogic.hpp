@@ -30,10 +30,6 @@ namespace arbolex::work {
 class StandWork;
 }
 
-namespace arbolex::thinning {
-class ThinWindowLogic;
-}
-
 namespace arbolex::workflow {
 class IMainCommands;
 }
@@ -56,8 +52,8 @@ struct ForecastChart {
 class EstateWindowLogic {
 public:
     EstateWindowLogic(work::StandWork &work, workflow::IMainCommands &main,
-                      thinning::ThinWindowLogic &thin, document::DocumentController &documents,
-                      IEstateView &view, shell::IInteractive &interactive);
+                      document::DocumentController &documents, IEstateView &view,
+                      shell::IInteractive &interactive);
 
     /// File → Open Estate…: the table the user chooses, run.
     void mnuOpenEstate_Click();
@@ -92,7 +88,6 @@ public:
 private:
     work::StandWork &m_standWork;
     workflow::IMainCommands &m_main;
-    thinning::ThinWindowLogic &m_thin;
     document::DocumentController &m_documents;
     IEstateView &m_view;
     shell::IInteractive &m_interactive;
