@@ -354,6 +354,15 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
     return path;
 }
 
+int pathYieldClass(const GrowthPath &path) {
+    std::vector<double> mai;
+    mai.reserve(path.years.size());
+    for (int a = path.presentAge; a <= path.lastAge(); ++a) {
+        mai.push_back(meanAnnualIncrement(path, a));
+    }
+    return yieldClass(mai);
+}
+
 void divideThinnings(GrowthPath &path) {
     engine::clearUpperVectorState();
     for (Harvest &t : path.thinnings) {

@@ -204,6 +204,12 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
                                    GrowthFailure &failure, const ThinningLimits *limits = nullptr,
                                    std::optional<int> finalCut = std::nullopt);
 
+/// Yield class of the stand over its whole path (grown to the model's age
+/// limit, or to where the window stops), as the window shows it after growing
+/// the stand under its regime by one-year steps that far: 0 only when the
+/// mean annual increment never culminates on the path.
+int pathYieldClass(const GrowthPath &path);
+
 /// Divides the thinnings of `path` into their assortments once, so that
 /// valuing its rotations by assortments reads them instead of dividing them
 /// again for every final-cut age.

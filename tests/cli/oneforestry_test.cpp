@@ -52,6 +52,8 @@ struct Valued {
     std::optional<double> npv;
     double finalCutVolume = 0.0;
     QString refusal;
+    /// The yield class the main window shows at the end, or the estate's.
+    int yieldClass = 0;
 };
 
 std::ostream &operator<<(std::ostream &os, const Valued &v) {
@@ -189,8 +191,15 @@ public:
         return true;
     }
 
-    /// The case typed into the main window as a forester types it.
+    /// The case typed into the main window as a forester types it, with the
+    /// yield class the window shows where it ends.
     Valued typed(const Case &c) {
+        Valued v = typedRotation(c);
+        v.yieldClass = session.work().yieldClass();
+        return v;
+    }
+
+    Valued typedRotation(const Case &c) {
         Valued v;
         if (!typeStand(c, v)) {
             return v;
@@ -365,6 +374,7 @@ std::map<QString, Valued> estateRows(const std::vector<Case> &cases, const QStri
                     v.refusal = r.value(QStringLiteral("message")).toString();
                 } else if (r.value(QStringLiteral("status")).toString() == QStringLiteral("ok")) {
                     v.npv = r.value(QStringLiteral("npv_ha")).toDouble();
+                    v.yieldClass = r.value(QStringLiteral("yield_class")).toInt();
                     v.finalCutVolume = r.value(QStringLiteral("final_cut_volume_ha")).toDouble();
                 }
             }
@@ -393,6 +403,13 @@ TEST(OneForestryTest, TheWindowTheLibraryAndTheEstateGiveOneRotation) {
         ASSERT_NE(row, estate.end()) << what;
         expectSame(window, row->second, what + " / estate");
         refused += window.refusal.isEmpty() ? 0 : 1;
+        if (window.refusal.isEmpty()) {
+            // The estate's yield class is the window's after growing on with
+            // the regime to the age limit (or to where the window stops).
+            Case toLimit = c;
+            toLimit.rotation = rotation::modelAgeLimit(static_cast<std::int16_t>(c.model));
+            EXPECT_EQ(row->second.yieldClass, Window().typed(toLimit).yieldClass) << what;
+        }
     }
     // The draw must exercise both outcomes.
     EXPECT_GT(refused, 0);

@@ -126,13 +126,30 @@ TEST_F(EstateRowTest, GrowsAndValuesTheStandAsTheRotationLibraryDoes) {
     EXPECT_EQ(r.finalCutVolume, v.finalCut.volume);
     EXPECT_EQ(r.thinningCount, 6); // ages 20, 25, ..., 45
     EXPECT_EQ(r.thinningCount, static_cast<int>(v.thinnings.size()));
-    EXPECT_EQ(r.yieldClass, v.yieldClass);
+    EXPECT_EQ(r.yieldClass, rotation::pathYieldClass(*path));
+    EXPECT_EQ(r.finalCutMai, v.mai);
     EXPECT_EQ(r.npv, v.npv);
     EXPECT_EQ(r.lev, v.lev);
     EXPECT_EQ(r.forestValue, v.forestValue);
     // One harvest per thinning and the final cut, for the 2.5 ha.
     ASSERT_EQ(r.harvests.size(), 7U);
     EXPECT_EQ(r.harvests.back().finalCutLitres, std::llround(double{v.finalCut.volume} * 2500.0));
+}
+
+TEST_F(EstateRowTest, TheYieldClassIsTheStandsProductivityWhateverTheFinalCut) {
+    RowEvaluator evaluator(m_layout, m_defaults);
+    // A fertile site (11 m at 15 years): felled at 25 its increment has not
+    // culminated; the yield class is read over the whole path all the same,
+    // as it is for a final cut at 60.
+    const RowValues fertile = with(sitkaRow(), "top_height", "11");
+    const RowResult early = evaluator.evaluate(with(fertile, "rotation", "25"));
+    const RowResult late = evaluator.evaluate(with(fertile, "rotation", "60"));
+    ASSERT_EQ(early.status, RowStatus::kOk) << early.message;
+    EXPECT_GT(early.yieldClass, 0);
+    EXPECT_EQ(early.yieldClass, late.yieldClass);
+    EXPECT_LT(early.finalCutMai, early.maxMai + 1e-12);
+    EXPECT_NEAR(early.finalCutMai,
+                (double{early.finalCutVolume} + early.thinningVolume) / early.finalCutAge, 1e-4);
 }
 
 TEST_F(EstateRowTest, DiameterStandsInForAMissingBasalAreaAndEmptyValuesTakeTheDefaults) {

@@ -1,6 +1,7 @@
 // The estate window on the screen: the run goes beside the window, the table
 // sorts by the figures' values, a double-click opens the row under the mouse
 // whatever the order, rows not grown are marked, and the chart stacks species.
+#include "estate/resulttable.hpp"
 #include "guifixture.hpp"
 
 #include "document/documentcontroller.hpp"
@@ -56,8 +57,13 @@ TEST_F(EstateWindowGuiTest, SortedTableOpensTheRowDoubleClickedAndMarksTheRefuse
     table->sortByColumn(EstateResultsModel::kNpvColumn, Qt::DescendingOrder);
     double best = 0.0;
     QString bestId;
+    const auto &columns = estate::figureColumns();
+    const auto npvColumn = static_cast<std::size_t>(
+        std::find_if(columns.begin(), columns.end(),
+                     [](const estate::ResultColumn &c) { return c.name == "npv_ha"; }) -
+        columns.begin());
     for (const auto &row : estate.model().rows()) {
-        const double npv = QString::fromStdString(row.figures[11]).toDouble();
+        const double npv = QString::fromStdString(row.figures.at(npvColumn)).toDouble();
         if (row.grown && npv > best) {
             best = npv;
             bestId = row.id;
