@@ -18,4 +18,18 @@ QStringList SubCompartment::heading() const {
     return lines;
 }
 
+std::vector<QStringList> SubCompartment::headed(std::vector<QStringList> grid) const {
+    const QStringList lines = heading();
+    if (lines.isEmpty()) {
+        return grid;
+    }
+    std::vector<QStringList> top;
+    for (const QString &line : lines) {
+        top.push_back({line});
+    }
+    top.push_back({QString()});
+    grid.insert(grid.begin(), top.begin(), top.end());
+    return grid;
+}
+
 } // namespace arbolex::work

@@ -3,6 +3,8 @@
 #include <QString>
 #include <QStringList>
 
+#include <vector>
+
 namespace arbolex::work {
 
 /// Which piece of ground a document describes: the forest, the compartment
@@ -29,6 +31,9 @@ struct SubCompartment {
     /// The lines that head a report: "Forest: Kilbrack", "Compartment: 12",
     /// "Sub-compartment: b", then the note; a part left empty is left out.
     QStringList heading() const;
+    /// `grid` with the heading above it, one line a row and a blank row
+    /// below it (as the clipboard copy carries it); `grid` alone without one.
+    std::vector<QStringList> headed(std::vector<QStringList> grid) const;
 };
 
 } // namespace arbolex::work

@@ -1,11 +1,9 @@
 // The main window's load and unload, the model menu and its information
-// boxes, the price commands, the summary and putting back a whole work.
+// boxes, the price commands and putting back a whole work.
 #include "engine/grow.hpp"
-#include "prices/assortmentpricefile.hpp"
-#include "prices/pricedata.hpp"
+#include "prices/pricefiles.hpp"
 #include "prices/prices.hpp"
 #include "shell/apperror.hpp"
-#include "shell/datahistory.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/interactive.hpp"
 #include "shell/settings.hpp"
@@ -17,20 +15,9 @@
 #include "workflow/mainwindowlogic.hpp"
 #include "workflow/modelnotes.hpp"
 
-#include <QDir>
 #include <QSettings>
 
 namespace arbolex::workflow {
-
-namespace {
-
-/// The price lists, categories and assortment prices from the data folder.
-void readPriceFiles(const QString &dataFolder, prices::Prices &prices, shell::ErrorLog &log) {
-    prices::GetPricesFromFiles(dataFolder, prices.data(), log);
-    prices::GetAssortmentPricesFromFile(dataFolder, prices.data(), log);
-}
-
-} // namespace
 
 void MainWindowLogic::Form_Load(QSettings &settings, const QRect &screen) {
     shell::guard(errorLog(), QStringLiteral(" in frmMain.Load()"), [&] {
@@ -48,9 +35,9 @@ void MainWindowLogic::Form_Load(QSettings &settings, const QRect &screen) {
         }
         m_fields.ChkGrowFromBD();
         m_fields.showSiteIndex(stored.age, stored.topHeight);
-        readPriceFiles(m_dataFolder, prices(), errorLog());
+        prices::readPriceFiles(m_dataFolder, prices(), errorLog());
         prices().selectPriceSet(prices::kCurrentPrices);
-        showSummary(false);
+        m_summary.show(false);
         m_view.setText(MainControl::cmdShowTimberPrice, text::showTimberPrices());
     });
 }
@@ -75,27 +62,12 @@ void MainWindowLogic::Form_Unload(QSettings &settings) {
         values.netArea = m_work.netArea();
         shell::writeStartupFile(m_dataFolder, values, errorLog());
     });
-    if (m_dataHistory != nullptr) {
-        for (const char *name : prices::kFilesWrittenAtExit) {
-            shell::guard(errorLog(), label, [&] {
-                if (!m_dataHistory->keep(QDir(m_dataFolder).filePath(QLatin1String(name)))) {
-                    shell::raiseAppFault(shell::RuntimeError::pathFileAccessError());
-                }
-            });
-        }
-    }
-    prices::WritePricesInFiles(3, m_dataFolder, prices().data(), errorLog());
-    prices::WriteUserDefinedAssortmentsInFile(m_dataFolder, prices().data(), errorLog());
-    prices::WriteAssortmentPricesInFile(m_dataFolder, prices().data(), errorLog());
+    prices::writePriceFilesAtExit(m_dataFolder, prices(), m_dataHistory, label, errorLog());
 }
 
 void MainWindowLogic::reloadDataFiles() {
-    shell::guard(errorLog(), QStringLiteral(" in frmMain.reloadDataFiles()"), [&] {
-        const std::int16_t inUse = prices().priceSetInUse();
-        prices().data() = prices::PriceData{};
-        readPriceFiles(m_dataFolder, prices(), errorLog());
-        prices().selectPriceSet(inUse);
-    });
+    shell::guard(errorLog(), QStringLiteral(" in frmMain.reloadDataFiles()"),
+                 [&] { prices::rereadPriceFiles(m_dataFolder, prices(), errorLog()); });
 }
 
 void MainWindowLogic::cmdChangePrices_Click() {
@@ -133,68 +105,6 @@ void MainWindowLogic::mnuModel_Click(int index) {
 void MainWindowLogic::updateCaption() {
     m_view.setCaption(text::titleArbolex() + text::captionModelInUse() +
                       QString::fromStdString(grow().label()) + m_work.documentCaption());
-}
-
-void MainWindowLogic::TrhesholdInfo() {
-    shell::guard(errorLog(), QStringLiteral(" in frmMain.TrhesholdInfo()"), [&] {
-        const QString threshold = thresholdText(grow());
-        if (threshold.isEmpty()) {
-            message(text::titleArbolex(), text::speciesNotFound(), shell::kExclamation);
-            return;
-        }
-        message(text::titleArbolex(), threshold, shell::kInformation);
-    });
-}
-
-void MainWindowLogic::Warn() {
-    shell::guard(errorLog(), QStringLiteral(" in frmMain.Warn()"),
-                 [&] { message(text::titleArbolex(), warnText(grow()), shell::kInformation); });
-}
-
-bool MainWindowLogic::FillSummary() {
-    bool filled = false;
-    shell::guard(errorLog(), QStringLiteral(" in frmMain.FillSummary()"), [&] {
-        if (m_work.table().rowCount() < 2) {
-            message(text::titleArbolex(), text::nothingToSummarize(), shell::kInformation);
-            return;
-        }
-        m_summary = {};
-        showSummary(true);
-        const auto summary = m_work.summary();
-        if (!summary) {
-            message(text::titleArbolex(), text::nothingToSummarize(), shell::kInformation);
-            return;
-        }
-        m_summary = *summary;
-        filled = true;
-    });
-    m_view.tableChanged(1);
-    return filled;
-}
-
-std::vector<QStringList> MainWindowLogic::summaryGrid() const {
-    return m_work.summaryGrid(m_summary);
-}
-
-QStringList MainWindowLogic::summaryGroups() const {
-    return m_work.summaryGroups();
-}
-
-void MainWindowLogic::showSummary(bool summary) {
-    m_showingSummary = summary;
-    m_view.showSummary(summary);
-    m_view.setText(MainControl::lblTableTitle,
-                   summary ? text::summary() : text::standProjections());
-    m_view.setText(MainControl::cmdSummary,
-                   summary ? text::gotoStandProjections() : text::gotoSummary());
-}
-
-void MainWindowLogic::cmdSummary_Click() {
-    if (m_showingSummary) {
-        showSummary(false);
-    } else {
-        FillSummary();
-    }
 }
 
 void MainWindowLogic::restore(const work::WorkSnapshot &s) {

@@ -41,7 +41,8 @@ QString wholeAge(float age) {
 MainWindowLogic::MainWindowLogic(work::StandWork &work, QString dataFolder, IMainView &view,
                                  shell::IInteractive &interactive, IWorkWindows &windows)
     : m_work(work), m_dataFolder(std::move(dataFolder)), m_view(view), m_interactive(interactive),
-      m_windows(windows), m_fields(work, work.grow(), work.errorLog(), view, interactive) {
+      m_windows(windows), m_fields(work, work.grow(), work.errorLog(), view, interactive),
+      m_summary(work, view, interactive) {
     m_tableShown = QObject::connect(&work, &work::StandWork::tableChanged, [this](int firstRow) {
         updateYieldClassLabel();
         m_view.tableChanged(firstRow);
@@ -221,8 +222,8 @@ void MainWindowLogic::cmdAssort_Click() {
 void MainWindowLogic::afterClear(work::HeaderLayout layout) {
     m_work.clear(layout);
     m_windows.closeNpv();
-    if (m_showingSummary) {
-        showSummary(false);
+    if (m_summary.showing()) {
+        m_summary.show(false);
     }
     // A thinning window open on the old rows has nothing left to thin.
     m_windows.closeThinning();
@@ -332,8 +333,8 @@ void MainWindowLogic::cmdDeleteRows_Click() {
         }
         m_windows.closeNpv();
         m_windows.closeThinning();
-        if (m_showingSummary) {
-            showSummary(false);
+        if (m_summary.showing()) {
+            m_summary.show(false);
         }
         m_work.removeRowsFrom(first);
         const bool felled = m_work.felled();
@@ -351,17 +352,8 @@ void MainWindowLogic::CopyTable(bool summary) {
         if (m_clipboard == nullptr) {
             return;
         }
-        std::vector<QStringList> grid = summary ? summaryGrid() : m_work.table().exportGrid();
-        // The sub-compartment's identification heads the copy, a blank line below it.
-        const QStringList heading = m_work.identification().heading();
-        if (!heading.isEmpty()) {
-            std::vector<QStringList> top;
-            for (const QString &line : heading) {
-                top.push_back({line});
-            }
-            top.push_back({QString()});
-            grid.insert(grid.begin(), top.begin(), top.end());
-        }
+        const std::vector<QStringList> grid =
+            m_work.identification().headed(summary ? summaryGrid() : m_work.table().exportGrid());
         copied = m_clipboard->setTable(shell::tabSeparated(grid), shell::htmlTable(grid));
     });
     if (!copied) {

@@ -12,6 +12,8 @@
 #include "workflow/growfrompanel.hpp"
 #include "workflow/imainview.hpp"
 #include "workflow/iworkwindows.hpp"
+#include "workflow/modelnotes.hpp"
+#include "workflow/summarypanel.hpp"
 
 #include <QString>
 
@@ -76,18 +78,18 @@ public:
     /// Show Timber Prices: opens the timber prices window.
     void cmdShowTimberPrice_Click();
     /// Tells the threshold basal area of the active species.
-    void TrhesholdInfo();
+    void TrhesholdInfo() { tellThreshold(grow(), m_interactive, errorLog()); }
     /// Notes on the valid use of the active model.
-    void Warn();
+    void Warn() { tellNotes(grow(), m_interactive, errorLog()); }
 
     /// Final cut: the last stand of the table becomes the clear-fell row,
     /// valued, with the yield class of the rotation; offers the net present value.
     void cmdFinalCut_Click() override;
     /// Fills the summary `flxSummary` and shows it; false when there was
     /// nothing to summarise.
-    bool FillSummary();
+    bool FillSummary() { return m_summary.fill(); }
     /// Toggles between "Stand Projections" and "Summary".
-    void cmdSummary_Click();
+    void cmdSummary_Click() { m_summary.toggle(); }
     /// Opens the net present value window on the rotation.
     void cmdNPV_Click();
     /// Deletes the rows from the first selected one to the end, after a question.
@@ -109,15 +111,12 @@ public:
     const work::ProjectionTable &table() const { return m_work.table(); }
     /// Sets the current row and the end of the selection of `flxMain`.
     void select(int row, int endRow) { m_work.select(row, endRow); }
-    /// The summary as last filled: its rows, in the projection table's shape.
-    const std::vector<work::TableRow> &summaryRows() const { return m_summary.rows; }
-    /// Index in summaryRows() of the first row of the rotation's totals.
-    int summaryTotalsFrom() const { return m_summary.totalsFrom; }
-    /// The summary as shown: captions first, then its rows.
-    std::vector<QStringList> summaryGrid() const;
-    /// The group above each column of the summary ("Thinning" …).
-    QStringList summaryGroups() const;
-    bool showingSummary() const { return m_showingSummary; }
+    /// The summary as last filled (SummaryPanel).
+    const std::vector<work::TableRow> &summaryRows() const { return m_summary.rows(); }
+    int summaryTotalsFrom() const { return m_summary.totalsFrom(); }
+    std::vector<QStringList> summaryGrid() const { return m_summary.grid(); }
+    QStringList summaryGroups() const { return m_summary.groups(); }
+    bool showingSummary() const { return m_summary.showing(); }
 
     /// The clipboard that the copy commands fill.
     void attachClipboard(shell::IClipboard *clipboard) { m_clipboard = clipboard; }
@@ -141,7 +140,6 @@ private:
     void afterClear(work::HeaderLayout layout);
     void updateCaption();
     void updateYieldClassLabel();
-    void showSummary(bool summary);
 
     work::StandWork &m_work;
     QString m_dataFolder;
@@ -151,8 +149,7 @@ private:
     GrowFromPanel m_fields;
     shell::IClipboard *m_clipboard = nullptr;
     const shell::DataHistory *m_dataHistory = nullptr;
-    work::Summary m_summary;
-    bool m_showingSummary = false;
+    SummaryPanel m_summary;
     QMetaObject::Connection m_tableShown;
     QMetaObject::Connection m_captionShown;
 };

@@ -2,6 +2,8 @@
 
 #include "engine/grow.hpp"
 #include "rotation/rotation.hpp"
+#include "shell/apperror.hpp"
+#include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
 #include "workflow/mainmessages.hpp"
 
@@ -77,6 +79,24 @@ QString warnText(const engine::Grow &grow) {
                 : QStringLiteral("- This model follows an un-thinned crop: it offers no "
                                  "thinning.")) +
            crlf + QStringLiteral("- Volumes are merchantable volumes to 7 cm top diameter.");
+}
+
+void tellThreshold(const engine::Grow &grow, shell::IInteractive &interactive,
+                   shell::ErrorLog &log) {
+    shell::guard(log, QStringLiteral(" in frmMain.TrhesholdInfo()"), [&] {
+        const QString threshold = thresholdText(grow);
+        if (threshold.isEmpty()) {
+            interactive.message(text::titleArbolex(), text::speciesNotFound(), shell::kExclamation);
+            return;
+        }
+        interactive.message(text::titleArbolex(), threshold, shell::kInformation);
+    });
+}
+
+void tellNotes(const engine::Grow &grow, shell::IInteractive &interactive, shell::ErrorLog &log) {
+    shell::guard(log, QStringLiteral(" in frmMain.Warn()"), [&] {
+        interactive.message(text::titleArbolex(), warnText(grow), shell::kInformation);
+    });
 }
 
 } // namespace arbolex::workflow

@@ -9,6 +9,11 @@ namespace arbolex::engine {
 class Grow;
 }
 
+namespace arbolex::shell {
+class ErrorLog;
+class IInteractive;
+} // namespace arbolex::shell
+
 namespace arbolex::workflow {
 
 /// Species code of a model label ("SS", "NS", "DF", "LP", "SP"), "" when the
@@ -26,5 +31,12 @@ QString thresholdText(const engine::Grow &grow);
 
 /// The notes `Warn` shows on the valid use of the active model of `grow`.
 QString warnText(const engine::Grow &grow);
+
+/// `TrhesholdInfo`: tells the threshold of the active model, or that its
+/// species is not known; a failure is logged.
+void tellThreshold(const engine::Grow &grow, shell::IInteractive &interactive,
+                   shell::ErrorLog &log);
+/// `Warn`: tells the notes on the valid use of the active model.
+void tellNotes(const engine::Grow &grow, shell::IInteractive &interactive, shell::ErrorLog &log);
 
 } // namespace arbolex::workflow
