@@ -1,8 +1,12 @@
 #include "charts/reportcontent.hpp"
 #include "work/worktexts.hpp"
 
+#include "charts/economicscharts.hpp"
 #include "charts/reportmessages.hpp"
 #include "charts/standcharts.hpp"
+#include "economics/economicsmessages.hpp"
+#include "economics/economicswindowlogic.hpp"
+#include "economics/tableregime.hpp"
 #include "engine/grow.hpp"
 #include "shell/vbformat.hpp"
 #include "work/mdlnpv.hpp"
@@ -102,6 +106,34 @@ QString yieldClassText(const work::StandWork &work) {
     return work.felled() || yc > 0 ? QString::number(yc) : QString();
 }
 
+/// The economics window's figures as it shows them now.
+EconomicsPage economicsPage(economics::EconomicsWindowLogic &logic) {
+    namespace et = economics::economicstext;
+    using economics::EconomicsControl;
+    const economics::IEconomicsView &view = logic.view();
+    const QString rate = QLatin1Char(' ') + et::atRate(logic.rateText());
+    EconomicsPage page;
+    page.title = et::economicsCaption() + rate;
+    page.stand = view.text(EconomicsControl::lblStand);
+    page.regime = view.text(EconomicsControl::lblRegime);
+    page.money = view.text(EconomicsControl::lblRate);
+    for (const auto &[caption, label] : economics::valueFigures()) {
+        page.figures.emplace_back(caption, view.text(label));
+    }
+    page.rotations = economicsCharts(logic).rotations;
+    if (!logic.regimes().empty()) {
+        std::vector<QStringList> grid = logic.regimeGrid();
+        // Captions in two lines on screen run on in print.
+        for (QString &caption : grid.front()) {
+            caption.replace(QLatin1Char('\n'), QLatin1Char(' '));
+        }
+        page.regimesTitle = et::panelOptimiser() + rate;
+        page.regimes = fromGrid(std::move(grid), {});
+        page.regimesNote = view.text(EconomicsControl::lblOptimiser);
+    }
+    return page;
+}
+
 } // namespace
 
 RotationCharts rotationCharts(work::StandWork &work) {
@@ -138,6 +170,21 @@ ReportContent reportContent(work::StandWork &work) {
     content.standChart = standDevelopment(work.table());
     content.incrementChart = increments(work.table());
     content.cashFlowChart = cashFlowChart(computed.flow, computed.years);
+    return content;
+}
+
+ReportContent reportContent(work::StandWork &work, economics::EconomicsWindowLogic &economics) {
+    ReportContent content = reportContent(work);
+    if (!economics::standFromTable(work.table(), work.grow().modelId())) {
+        return content; // no stand: the window would value the fields as typed
+    }
+    // A rate of 0 % has no land expectation value: the window would refuse it.
+    if (!economics.optimising() && work.cashFlow().interestRate() > 0.0) {
+        economics.Form_Load();
+    }
+    if (economics.valued()) {
+        content.economics = economicsPage(economics);
+    }
     return content;
 }
 

@@ -66,8 +66,8 @@ int runReport(CommandContext &context) {
         context.err << "arbolex-cli report: " << fault << '\n';
         return kExitBadArguments;
     }
-    const int pages = report::writeReportPdf(charts::reportContent(session.work()), outPath,
-                                             report::printedNow());
+    const int pages = report::writeReportPdf(
+        charts::reportContent(session.work(), session.economics()), outPath, report::printedNow());
     if (pages == 0) {
         context.err << "arbolex-cli report: cannot write " << outPath << '\n';
         return kExitEngineFailure;
@@ -89,8 +89,11 @@ Command reportCommand() {
                 "`arbolex-cli run` does (messages go to stderr), then writes its report\n"
                 "as an A4 landscape PDF: the identification, the\n"
                 "model, the stand at the start, site index and yield class, the projection\n"
-                "table, the summary, the cash flow with its net present value, and the\n"
-                "charts of stand development, increments and cash flow. Nothing in the\n"
+                "table, the summary, the cash flow with its net present value, the\n"
+                "charts of stand development, increments and cash flow, and the\n"
+                "economics of the rotation at the interest rate of its cash flow (NPV,\n"
+                "LEV and MAI by rotation age, and the optimiser's best regimes when a\n"
+                "script ran it). Nothing in the\n"
                 "data folder is changed. Prints REPORT.pdf<TAB>N pages.\n"
                 "Exit status: 0 written, 1 the PDF cannot be written, 2 the command line,\n"
                 "the document or the script is wrong.\n"),

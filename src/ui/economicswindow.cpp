@@ -1,9 +1,10 @@
 #include "ui/economicswindow.hpp"
 
+#include "charts/economicscharts.hpp"
 #include "economics/economicsformat.hpp"
 #include "economics/economicsmessages.hpp"
 #include "economics/economicswindowlogic.hpp"
-#include "ui/economicscharts.hpp"
+#include "report/chartbuilder.hpp"
 #include "ui/fieldinput.hpp"
 #include "ui/stringgridmodel.hpp"
 
@@ -148,20 +149,7 @@ QWidget *EconomicsWindow::buildRotationTab() {
     form->setLabelAlignment(Qt::AlignLeft);
     form->setRowWrapPolicy(QFormLayout::DontWrapRows);
     form->setVerticalSpacing(9);
-    const std::pair<QString, C> rows[] = {
-        {et::figureNpv(), C::lblNPV},
-        {et::figureLev(), C::lblLEV},
-        {et::figureEaa(), C::lblEAA},
-        {et::figureForestValue(), C::lblForestValue},
-        {et::figureIrr(), C::lblIRR},
-        {et::figureBreakEven(), C::lblBreakEven},
-        {et::figureRotation(), C::lblRotation},
-        {et::figureBiological(), C::lblBiological},
-        {et::figureEconomic(), C::lblEconomic},
-        {et::figureMai(), C::lblMAI},
-        {et::figureYieldClass(), C::lblYieldClass},
-    };
-    for (const auto &[caption, c] : rows) {
+    for (const auto &[caption, c] : economics::valueFigures()) {
         QLabel *value = label(c);
         value->setWordWrap(true);
         value->setMinimumWidth(230);
@@ -370,9 +358,9 @@ void EconomicsWindow::focus(EconomicsControl c) {
     focusControl(control(c));
 }
 
-void EconomicsWindow::showChart(QChartView *view, QChart *chart) {
+void EconomicsWindow::showChart(QChartView *view, const charts::ChartData &data) {
     QChart *old = view->chart();
-    view->setChart(chart);
+    view->setChart(report::buildChart(data, report::ChartLook::Window));
     delete old;
 }
 
@@ -380,20 +368,11 @@ void EconomicsWindow::figuresChanged() {
     if (m_logic == nullptr) {
         return;
     }
-    const QString rate = et::atRate(m_logic->rateText());
-    m_valueBox->setTitle(et::panelValue() + QLatin1Char(' ') + rate);
-    showChart(m_rotationChart,
-              rotationChart(m_logic->explorer(), et::panelRotations() + QLatin1Char(' ') + rate));
-    const auto &value = m_logic->value();
-    if (value && value->npv && value->lev) {
-        showChart(m_tornadoNpv, tornadoChart(m_logic->tornado(), *value->npv, false,
-                                             et::panelTornadoNpv() + QLatin1Char(' ') + rate));
-        showChart(m_tornadoLev, tornadoChart(m_logic->tornado(), *value->lev, true,
-                                             et::panelTornadoLev() + QLatin1Char(' ') + rate));
-    } else {
-        showChart(m_tornadoNpv, new QChart);
-        showChart(m_tornadoLev, new QChart);
-    }
+    m_valueBox->setTitle(et::panelValue() + QLatin1Char(' ') + et::atRate(m_logic->rateText()));
+    const charts::EconomicsCharts drawn = charts::economicsCharts(*m_logic);
+    showChart(m_rotationChart, drawn.rotations);
+    showChart(m_tornadoNpv, drawn.tornadoNpv);
+    showChart(m_tornadoLev, drawn.tornadoLev);
     regimesChanged();
 }
 
@@ -411,19 +390,8 @@ void EconomicsWindow::regimesChanged() {
 }
 
 void EconomicsWindow::monteCarloChanged() {
-    if (m_logic == nullptr) {
-        return;
-    }
-    if (const auto &result = m_logic->monteCarlo()) {
-        showChart(m_histogram, histogramChart(*result, et::panelMonteCarlo() +
-                                                           QStringLiteral(" (rate drawn "
-                                                                          "from ") +
-                                                           m_logic->view().text(C::txtRateLow) +
-                                                           QStringLiteral(" to ") +
-                                                           m_logic->view().text(C::txtRateHigh) +
-                                                           QStringLiteral(" % a year)")));
-    } else {
-        showChart(m_histogram, new QChart);
+    if (m_logic != nullptr) {
+        showChart(m_histogram, charts::economicsCharts(*m_logic).draws);
     }
 }
 

@@ -6,7 +6,6 @@
 
 #include <array>
 
-class QChart;
 class QChartView;
 class QGroupBox;
 class QLabel;
@@ -15,6 +14,9 @@ class QTabWidget;
 class QTableView;
 class QThread;
 
+namespace arbolex::charts {
+struct ChartData;
+}
 namespace arbolex::economics {
 class EconomicsWindowLogic;
 }
@@ -67,8 +69,8 @@ private:
     /// The choice cboValuation: standing price of the mean tree or assortments.
     QWidget *valuationChoice();
     QWidget *button(economics::EconomicsControl control, const QString &caption);
-    /// Shows `chart` in `view`, deleting the chart it showed before.
-    static void showChart(QChartView *view, QChart *chart);
+    /// Shows `data` drawn in `view`, deleting the chart it showed before.
+    static void showChart(QChartView *view, const charts::ChartData &data);
 
     economics::EconomicsWindowLogic *m_logic = nullptr;
     std::array<QWidget *, economics::kEconomicsControlCount> m_controls{};

@@ -5,6 +5,8 @@
 
 #include "charts/reportcontent.hpp"
 #include "document/documentwriter.hpp"
+#include "economics/economicsmessages.hpp"
+#include "economics/economicswindowlogic.hpp"
 #include "prices/pricedata.hpp"
 #include "report/chartexport.hpp"
 #include "report/reportwriter.hpp"
@@ -91,6 +93,51 @@ TEST_F(ReportTest, PdfHoldsTheTextPagesThenOnePagePerChart) {
     EXPECT_EQ(youngPages, 3) << "one page of text, stand and increments";
 }
 
+TEST_F(ReportTest, EconomicsPageValuesTheTableAsTheEconomicsButtonDoes) {
+    closeRotation();
+    economics::EconomicsWindowLogic &economics = session.economics();
+    ASSERT_FALSE(economics.valued()) << "the window was never opened";
+    charts::ReportContent content = charts::reportContent(work, economics);
+    ASSERT_TRUE(content.economics.has_value());
+    const charts::EconomicsPage &page = *content.economics;
+    // The program's interest rate, and the figures as the window shows them.
+    EXPECT_TRUE(page.title.endsWith(QStringLiteral("at 5.00 % a year")));
+    ASSERT_EQ(page.figures.size(), 11U);
+    EXPECT_EQ(page.figures[0].first, economics::economicstext::figureNpv());
+    EXPECT_EQ(page.figures[0].second, economicsView.text(economics::EconomicsControl::lblNPV));
+    EXPECT_TRUE(page.figures[0].second.endsWith(QStringLiteral(" €/ha")));
+    EXPECT_FALSE(page.rotations.empty());
+    EXPECT_FALSE(page.rotations.markers.empty());
+    EXPECT_TRUE(page.regimes.empty()) << "the optimiser has not run";
+    EXPECT_FALSE(economicsView.isShown()) << "valued without showing the window";
+
+    // The optimiser's regimes and the user's own, captions on one line.
+    economics.cmdOptimise_Click();
+    content = charts::reportContent(work, economics);
+    ASSERT_TRUE(content.economics.has_value());
+    EXPECT_EQ(content.economics->regimes.rows.size(), economics.regimes().size() + 1);
+    EXPECT_EQ(content.economics->regimes.rows.back().first(),
+              economics::economicstext::regimeYours());
+    for (const QString &caption : content.economics->regimes.captions) {
+        EXPECT_FALSE(caption.contains(u'\n')) << caption.toStdString();
+    }
+    EXPECT_FALSE(content.economics->regimesNote.isEmpty());
+
+    const QString pdf = path(QStringLiteral("economics.pdf"));
+    const int pages = report::writeReportPdf(content, pdf, QStringLiteral("today"));
+    EXPECT_EQ(pages, report::writeReportPdf(charts::reportContent(work), pdf, QString()) + 1);
+    EXPECT_TRUE(interactive.messages.isEmpty());
+}
+
+TEST_F(ReportTest, NoEconomicsPageWithoutAStandOrAnInterestRate) {
+    economics::EconomicsWindowLogic &economics = session.economics();
+    EXPECT_FALSE(charts::reportContent(work, economics).economics.has_value()) << "empty table";
+    closeRotation();
+    work.cashFlow().setInterestRate(0.0);
+    EXPECT_FALSE(charts::reportContent(work, economics).economics.has_value());
+    EXPECT_TRUE(interactive.messages.isEmpty()) << "no questions about a page left out";
+}
+
 TEST_F(ReportTest, UnwritableFilesAreRefused) {
     closeRotation();
     const charts::ReportContent content = charts::reportContent(work);
@@ -143,7 +190,7 @@ TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
     const auto [status, out] =
         run({QStringLiteral("--script"), script, QStringLiteral("--out"), pdf});
     ASSERT_EQ(status, 0) << out.toStdString();
-    EXPECT_GE(pdfPages(pdf), 4);
+    EXPECT_GE(pdfPages(pdf), 5) << "text, three charts and the economics page";
     EXPECT_EQ(out, pdf + QStringLiteral("\t%1 pages\n").arg(pdfPages(pdf)));
 
     // A sub-compartment saved by the windows, with its identification.
@@ -158,7 +205,8 @@ TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
         << reason.toStdString();
     EXPECT_EQ(charts::reportContent(work).forest, QStringLiteral("Kilbrack"));
     EXPECT_EQ(run({saved, QStringLiteral("--out"), pdf}).first, 0);
-    EXPECT_EQ(pdfPages(pdf), 3) << "text, stand and increments: no cash flow yet";
+    EXPECT_EQ(pdfPages(pdf), 4)
+        << "text, stand, increments and the economics of the economic rotation: no cash flow yet";
 
     EXPECT_EQ(run({QStringLiteral("--script"), script}).first, 2) << "no --out";
     EXPECT_EQ(run({saved, QStringLiteral("--script"), script, QStringLiteral("--out"), pdf}).first,
