@@ -1,11 +1,15 @@
 // The work of one estate row (read, check, grow a thinned rotation to its
-// final cut at 50, value it, write its results line) and the same rows
-// through the estate's thread pool: the estate's speed without the files.
+// final cut at 50, value it, write its results line) against its floor: the
+// growth of the same stands under the same regimes to the same final cut,
+// which no estate can do without. scripts/bench.sh prints the ratio.
 #include "plantingeconomics.hpp"
 
+#include "estate/csvfile.hpp"
 #include "estate/estaterun.hpp"
 #include "estate/resulttable.hpp"
 #include "estate/rowevaluator.hpp"
+
+#include "dirtystate.hpp"
 
 #include <benchmark/benchmark.h>
 
@@ -51,11 +55,54 @@ void BM_EstateRowGrown(benchmark::State &state) {
     estate::RowEvaluator evaluator(l, d);
     std::size_t i = 0;
     for (auto _ : state) {
+        dirtyIfAsked();
         benchmark::DoNotOptimize(evaluator.evaluate(input[i]));
         i = (i + 1) % input.size();
     }
 }
-BENCHMARK(BM_EstateRowGrown)->Unit(benchmark::kMicrosecond);
+ARBOLEX_BENCHMARK(BM_EstateRowGrown, ->Unit(benchmark::kMicrosecond));
+
+// A whole row as an estate's thread does it: evaluated, then its results
+// line made.
+void BM_EstateRow(benchmark::State &state) {
+    const estate::Layout l = layout();
+    const estate::EstateDefaults d = defaults();
+    const std::vector<estate::RowValues> input = rows();
+    estate::RowEvaluator evaluator(l, d);
+    std::vector<std::string> values;
+    std::size_t i = 0;
+    for (auto _ : state) {
+        dirtyIfAsked();
+        const estate::RowResult result = evaluator.evaluate(input[i]);
+        estate::resultValues(l, static_cast<long long>(i) + 2, input[i], result, values);
+        benchmark::DoNotOptimize(estate::csvLine(values));
+        i = (i + 1) % input.size();
+    }
+}
+ARBOLEX_BENCHMARK(BM_EstateRow, ->Unit(benchmark::kMicrosecond));
+
+// The floor of the same rows: their stands grown by the engine under their
+// regimes to the final cut at 50 (projection year by year and the thinnings'
+// Newton solves), nothing read, valued or written.
+void BM_EstateRowGrowth(benchmark::State &state) {
+    const estate::Layout l = layout();
+    const estate::EstateDefaults d = defaults();
+    std::vector<estate::RowPlan> plans;
+    for (const estate::RowValues &row : rows()) {
+        plans.push_back(std::get<estate::RowPlan>(estate::planRow(l, row, d)));
+    }
+    engine::Grow grow;
+    std::size_t i = 0;
+    for (auto _ : state) {
+        dirtyIfAsked();
+        const estate::RowPlan &plan = plans[i];
+        rotation::GrowthFailure failure;
+        benchmark::DoNotOptimize(
+            rotation::growPath(grow, plan.stand, plan.regime, failure, nullptr, plan.rotation));
+        i = (i + 1) % plans.size();
+    }
+}
+ARBOLEX_BENCHMARK(BM_EstateRowGrowth, ->Unit(benchmark::kMicrosecond));
 
 void BM_EstateRowWritten(benchmark::State &state) {
     const estate::Layout l = layout();

@@ -7,6 +7,7 @@
 #include "cli/gridoutput.hpp"
 #include "shell/tableexport.hpp"
 
+#include <QElapsedTimer>
 #include <QFile>
 #include <QRegularExpression>
 #include <QSettings>
@@ -152,6 +153,21 @@ QString ScriptRunner::runLine(const QString &rawLine) {
             return QStringLiteral("answer needs yes or no");
         }
         m_session.queueAnswer(rest == QLatin1String("yes"));
+        return {};
+    }
+    if (command == QLatin1String("time")) {
+        // Runs the rest of the line and prints how long it took, the windows
+        // drawn: "TIME<TAB>line<TAB>milliseconds".
+        QElapsedTimer timer;
+        timer.start();
+        const QString error = runLine(rest);
+        m_session.settle();
+        const double ms = static_cast<double>(timer.nsecsElapsed()) / 1e6;
+        m_out << "TIME\t" << rest << '\t' << QString::number(ms, 'f', 1) << '\n';
+        return error;
+    }
+    if (command == QLatin1String("quit")) {
+        m_session.quitAfterScript();
         return {};
     }
     if (command == QLatin1String("wait")) {

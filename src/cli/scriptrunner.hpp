@@ -8,6 +8,8 @@
 //   answer yes|no            the answer to the next question
 //   wait                     until the work away from the window's thread is done
 //   show WINDOW PAGE         a page of a window to the front (on the screen only)
+//   time LINE                runs LINE, then prints "TIME<TAB>LINE<TAB>ms", the windows drawn
+//   quit                     ends the desktop program once the script has run
 //   print flxMain | CONTROL  the grid (header row first) or the text of a control;
 //                            flxSummary, frmNPV.NPV_Grid and clipboard print tab-separated
 //   set frmNPV.NPV_Grid(ROW,COL) TEXT  types TEXT into a cell of the cash flow

@@ -23,6 +23,12 @@ public:
     /// Waits until the work the windows run away from the window's thread
     /// (the optimiser, an estate) is done; headless work is done at once.
     virtual void waitForWork() {}
+    /// Lets the windows catch up with what the script did (draws them on the
+    /// screen; nothing to do without one).
+    virtual void settle() {}
+    /// Ends the program once the script has run (the desktop program; the
+    /// runner ends at the script's end anyway).
+    virtual void quitAfterScript() {}
     /// Brings page `page` of window `window` to the front ("charts cashflow",
     /// "frmEconomics optimiser"); an error text, or empty when it was shown.
     virtual QString show(const QString &window, const QString &page) {

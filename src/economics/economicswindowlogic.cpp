@@ -11,6 +11,7 @@
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
 #include "shell/vbtext.hpp"
+#include "work/regimereplay.hpp"
 #include "work/standwork.hpp"
 #include "workflow/iworkwindows.hpp"
 
@@ -91,9 +92,8 @@ std::optional<long long> wholeNumber(const QString &typed) {
 } // namespace
 
 EconomicsWindowLogic::EconomicsWindowLogic(work::StandWork &work, workflow::IMainCommands &main,
-                                           thinning::ThinWindowLogic &thin, IEconomicsView &view,
-                                           shell::IInteractive &interactive)
-    : m_standWork(work), m_main(main), m_thin(thin), m_view(view), m_interactive(interactive) {}
+                                           IEconomicsView &view, shell::IInteractive &interactive)
+    : m_standWork(work), m_main(main), m_view(view), m_interactive(interactive) {}
 
 void EconomicsWindowLogic::message(const QString &text, EconomicsControl focus) {
     m_interactive.message(economicstext::titleEconomics(), text, shell::kExclamation);
@@ -501,6 +501,32 @@ bool EconomicsWindowLogic::press(EconomicsControl control) {
     default:
         return false;
     }
+}
+
+void EconomicsWindowLogic::cmdApply_Click(int rank) {
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in frmEconomics.cmdApply_Click()"), [&] {
+        if (m_optimising) {
+            return;
+        }
+        if (rank < 1 || rank > static_cast<int>(m_best.size())) {
+            message(economicstext::nothingToApply(), C::cmdOptimise);
+            return;
+        }
+        // The regime written as the window writes it when it is typed in, on
+        // a copy of the work; the main window then takes the copy whole.
+        const rotation::Candidate chosen = m_best[static_cast<std::size_t>(rank - 1)];
+        work::StandWork applied(m_standWork.grow(), m_standWork.prices(), m_standWork.errorLog());
+        applied.restore(m_standWork.snapshot());
+        const auto failed =
+            work::replayRegime(applied, m_stand, chosen.regime, chosen.rotation, m_interactive);
+        m_main.restore(applied.snapshot());
+        if (failed) {
+            m_interactive.message(economicstext::titleEconomics(),
+                                  economicstext::applyStopped() + *failed, shell::kExclamation);
+        }
+        // The figures of the table as it now stands.
+        cmdCompute_Click();
+    });
 }
 
 } // namespace arbolex::economics

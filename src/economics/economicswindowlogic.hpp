@@ -23,10 +23,6 @@ namespace arbolex::shell {
 class IInteractive;
 }
 
-namespace arbolex::thinning {
-class ThinWindowLogic;
-}
-
 namespace arbolex::work {
 class StandWork;
 }
@@ -39,10 +35,9 @@ namespace arbolex::economics {
 
 class EconomicsWindowLogic {
 public:
-    /// The economics of `work`; "Apply" writes a regime through the commands
-    /// of `main` and `thin`.
-    EconomicsWindowLogic(work::StandWork &work, workflow::IMainCommands &main,
-                         thinning::ThinWindowLogic &thin, IEconomicsView &view,
+    /// The economics of `work`; "Apply" writes a regime into a copy of the
+    /// work and gives it to the main window through `main`.
+    EconomicsWindowLogic(work::StandWork &work, workflow::IMainCommands &main, IEconomicsView &view,
                          shell::IInteractive &interactive);
 
     /// The main window's "Economics…": loads the window and shows it.
@@ -107,7 +102,6 @@ private:
 
     work::StandWork &m_standWork;
     workflow::IMainCommands &m_main;
-    thinning::ThinWindowLogic &m_thin;
     IEconomicsView &m_view;
     shell::IInteractive &m_interactive;
 

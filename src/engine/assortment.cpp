@@ -10,6 +10,7 @@
 #include "engine/assortment.hpp"
 #include "engine/checkedmath.hpp"
 #include "engine/grow.hpp"
+#include "engine/vectorstate.hpp"
 
 #include <algorithm>
 #include <cmath>
@@ -218,6 +219,7 @@ bool Grow::AsmtG(std::span<const AssortmentCategory> categories, AssortmentBound
 }
 
 bool Grow::AsmtH(float G, float N, const AssortmentBounds &bounds, AssortmentRatios &ratios) {
+    clearUpperVectorState();
     const std::optional<AssortmentRatios> found = StandRatios(G, N, bounds, VolumeRatioFor(m_a));
     ratios = found.value_or(AssortmentRatios{});
     if (!found) {
@@ -229,6 +231,7 @@ bool Grow::AsmtH(float G, float N, const AssortmentBounds &bounds, AssortmentRat
 
 bool Grow::AsmtB(float G, float N, float H, std::span<const AssortmentCategory> categories,
                  Assortment &result) {
+    clearUpperVectorState();
     result = {};
     AssortmentBounds bounds;
     AssortmentRatios ratios;

@@ -79,6 +79,7 @@ public:
     explicit Grow(IEngineReport *report = nullptr) : m_report(report) {}
 
     void setReport(IEngineReport *report) { m_report = report; }
+    IEngineReport *report() const { return m_report; }
 
     // ---- Model catalogue -------------------------------------------------
 

@@ -1,6 +1,7 @@
 // Model selection: the active model's label and coefficient sets.
 #include "engine/checkedmath.hpp"
 #include "engine/grow.hpp"
+#include "engine/vectorstate.hpp"
 
 #include <cmath>
 #include <string>
@@ -41,6 +42,7 @@ bool Grow::GetModel(std::int16_t modelId, std::int16_t part) {
 }
 
 float Grow::maxTopHeight() const {
+    clearUpperVectorState();
     return static_cast<float>(std::pow(static_cast<double>(S(6)), 1.0 / S(1)));
 }
 

@@ -5,6 +5,7 @@
 // step into two eigen-directions (rates S2, S3) and the height direction.
 #include "engine/checkedmath.hpp"
 #include "engine/grow.hpp"
+#include "engine/vectorstate.hpp"
 
 #include <array>
 #include <charconv>
@@ -33,6 +34,7 @@ bool isSiteScaled(int modelId) {
 } // namespace
 
 bool Grow::SiteIndex(float A, float H) {
+    clearUpperVectorState();
     try {
         const double b = S(1);
         const double K = S(6);
@@ -60,6 +62,7 @@ float Grow::rateOf(float siteIndex) const {
 }
 
 float Grow::rate(float siteIndex) const {
+    clearUpperVectorState();
     try {
         return rateOf(siteIndex);
     } catch (const RuntimeFault &) {
@@ -68,6 +71,7 @@ float Grow::rate(float siteIndex) const {
 }
 
 void Grow::TM(float SI) {
+    clearUpperVectorState();
     try {
         const double rho = rateOf(SI);
         const double e[2] = {checked::exp(S(2) * rho), checked::exp(S(3) * rho)};
@@ -140,6 +144,7 @@ StandState Grow::inverseComplete(const State3 &z, float age) {
 }
 
 void Grow::STATEYR(float &A, float &G, float &N, float &H, float &A2, float &SI) {
+    clearUpperVectorState();
     try {
         A2 = std::nearbyint(A2); // the default rounding mode sends halves to even
         if (A == std::trunc(A)) {
@@ -175,6 +180,7 @@ void Grow::STATEYR(float &A, float &G, float &N, float &H, float &A2, float &SI)
 
 bool Grow::PROJ(float A, float G, float N, float H, float targetAge, float step,
                 std::vector<StandState> &states) {
+    clearUpperVectorState();
     try {
         const float startAge = std::nearbyint(A);
         states.push_back({startAge, G, N, H, GetV7(G, N, H)});

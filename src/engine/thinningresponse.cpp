@@ -4,6 +4,7 @@
 #include "engine/checkedmath.hpp"
 #include "engine/grow.hpp"
 #include "engine/trapped.hpp"
+#include "engine/vectorstate.hpp"
 
 #include <cmath>
 
@@ -88,6 +89,7 @@ double Grow::PARFB2(float H, float N, float G, float Nr, float Gr) {
 }
 
 bool Grow::NEWTON(float N, float G, float H, float Vt, float &Nr, float &Gr) {
+    clearUpperVectorState();
     // The procedures called here report their own failures; the iteration
     // stops at the first one, so a failure is shown once, not once a step.
     const unsigned faultsBefore = m_faultCount;

@@ -1,5 +1,6 @@
 #include "estate/estaterun.hpp"
 
+#include "engine/vectorstate.hpp"
 #include "estate/rowevaluator.hpp"
 
 #include <condition_variable>
@@ -46,6 +47,9 @@ private:
 };
 
 void evaluate(RowEvaluator &evaluator, const IRowSink &sink, Chunk &chunk) {
+    // The source and the sink (a GIS library) ran on this thread since the
+    // last chunk, on the caller's thread.
+    engine::clearUpperVectorState();
     chunk.results.clear();
     chunk.results.reserve(chunk.rows.size());
     for (const EstateRow &row : chunk.rows) {
@@ -61,6 +65,8 @@ public:
         : m_sink(sink), m_summary(summary), m_progress(progress) {}
 
     bool operator()(const Chunk &chunk) {
+        // Writing formats every figure; the source's library ran just before.
+        engine::clearUpperVectorState();
         for (std::size_t i = 0; i < chunk.rows.size(); ++i) {
             const RowResult &r = chunk.results[i];
             m_sink.write(chunk.rows[i], r);
@@ -88,8 +94,12 @@ class Pool {
 public:
     Pool(int threads, const Layout &layout, const EstateDefaults &defaults, const IRowSink &sink) {
         for (int t = 0; t < threads; ++t) {
-            m_threads.emplace_back(
-                [this, &layout, &defaults, &sink] { work(layout, defaults, sink); });
+            m_threads.emplace_back([this, &layout, &defaults, &sink] {
+                // A thread starts with the vector state of the thread that
+                // started it, which a library may have left dirty.
+                engine::clearUpperVectorState();
+                work(layout, defaults, sink);
+            });
         }
     }
     Pool(const Pool &) = delete;
@@ -160,6 +170,7 @@ constexpr std::size_t kChunksPerThread = 4;
 RunSummary runEstate(IRowSource &source, IRowSink &sink, const Layout &layout,
                      const EstateDefaults &defaults, const RunSettings &settings,
                      const EstateProgress &progress) {
+    engine::clearUpperVectorState();
     RunSummary summary;
     ShareReader reader(source, settings);
     Delivery deliver(sink, summary, progress);

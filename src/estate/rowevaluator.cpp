@@ -2,6 +2,7 @@
 
 #include "engine/catalogue.hpp"
 #include "engine/modeldescription.hpp"
+#include "engine/vectorstate.hpp"
 #include "rotation/standchecks.hpp"
 
 #include <cmath>
@@ -45,6 +46,7 @@ RowEvaluator::RowEvaluator(const Layout &layout, const EstateDefaults &defaults)
     : m_layout(layout), m_defaults(defaults), m_grow(&m_report) {}
 
 RowResult RowEvaluator::evaluate(const RowValues &values) {
+    engine::clearUpperVectorState();
     RowResult result;
     auto planned = planRow(m_layout, values, m_defaults);
     if (auto *fault = std::get_if<std::string>(&planned)) {

@@ -2,13 +2,13 @@
 
 #include "document/documentcontroller.hpp"
 #include "document/opendocument.hpp"
-#include "economics/regimereplay.hpp"
 #include "estate/resulttable.hpp"
 #include "estateio/gdallayer.hpp"
 #include "estatewindow/estatemessages.hpp"
 #include "prices/prices.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
+#include "work/regimereplay.hpp"
 #include "work/standwork.hpp"
 #include "workflow/iworkwindows.hpp"
 
@@ -25,7 +25,7 @@ namespace arbolex::estatewindow {
 namespace {
 
 /// Grow step of an opened sub-compartment, years.
-constexpr int kOpenedStep = 5;
+constexpr int kOpenedStep = 1;
 /// Rows handed to a thread at a time: small enough that the progress moves.
 constexpr std::size_t kChunkRows = 64;
 
@@ -101,10 +101,9 @@ charts::HarvestForecast chartOf(const estate::Forecast &forecast, int firstYear)
 } // namespace
 
 EstateWindowLogic::EstateWindowLogic(work::StandWork &work, workflow::IMainCommands &main,
-                                     thinning::ThinWindowLogic &thin,
                                      document::DocumentController &documents, IEstateView &view,
                                      shell::IInteractive &interactive)
-    : m_standWork(work), m_main(main), m_thin(thin), m_documents(documents), m_view(view),
+    : m_standWork(work), m_main(main), m_documents(documents), m_view(view),
       m_interactive(interactive) {
     m_settings.threads = static_cast<int>(std::max(1U, std::thread::hardware_concurrency()));
     m_settings.chunkRows = kChunkRows;
@@ -236,10 +235,15 @@ void EstateWindowLogic::openSubCompartment(int row) {
         id.subCompartment = r.id;
         id.notes =
             QFileInfo(m_file).fileName() + QStringLiteral(", line ") + QString::number(r.line);
-        m_main.restore(document::documentForStand(m_standWork, plan.stand, id, r.finalCutAge,
+        // The sub-compartment written on a copy of the work, as the main
+        // window writes its regime when it is typed in; the window then takes
+        // the copy whole.
+        work::StandWork opened(m_standWork.grow(), m_standWork.prices(), m_standWork.errorLog());
+        opened.restore(document::documentForStand(m_standWork, plan.stand, id, r.finalCutAge,
                                                   kOpenedStep, plan.areaHa));
-        const std::optional<QString> failed = economics::replayRegime(
-            m_standWork, m_main, m_thin, plan.stand, plan.regime, r.finalCutAge);
+        const std::optional<QString> failed =
+            work::replayRegime(opened, plan.stand, plan.regime, r.finalCutAge, m_interactive);
+        m_main.restore(opened.snapshot());
         m_documents.adoptNew(r.id);
         if (failed) {
             m_interactive.message(text::titleEstate(), text::openStopped(r.id, *failed),

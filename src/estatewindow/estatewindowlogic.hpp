@@ -31,10 +31,6 @@ namespace arbolex::work {
 class StandWork;
 }
 
-namespace arbolex::thinning {
-class ThinWindowLogic;
-}
-
 namespace arbolex::workflow {
 class IMainCommands;
 }
@@ -44,8 +40,8 @@ namespace arbolex::estatewindow {
 class EstateWindowLogic {
 public:
     EstateWindowLogic(work::StandWork &work, workflow::IMainCommands &main,
-                      thinning::ThinWindowLogic &thin, document::DocumentController &documents,
-                      IEstateView &view, shell::IInteractive &interactive);
+                      document::DocumentController &documents, IEstateView &view,
+                      shell::IInteractive &interactive);
 
     /// File → Open Estate…: the table the user chooses, run.
     void mnuOpenEstate_Click();
@@ -80,7 +76,6 @@ public:
 private:
     work::StandWork &m_standWork;
     workflow::IMainCommands &m_main;
-    thinning::ThinWindowLogic &m_thin;
     document::DocumentController &m_documents;
     IEstateView &m_view;
     shell::IInteractive &m_interactive;

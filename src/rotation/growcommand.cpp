@@ -35,4 +35,28 @@ Growth growStand(engine::Grow &grow, float age, float basalArea, float stocking,
     return g;
 }
 
+VolumeThinningStep thinByVolume(engine::Grow &grow, const engine::StandState &pre, double removal) {
+    VolumeThinningStep step;
+    // The window checks the removal against the volume it shows.
+    if (!(format::shownValue(pre.volume, kThinningVolumeShown) - removal > 0.0)) {
+        step.refusal = std::string(engine::thinningtext::kRemovalLeavesNoVolume);
+        step.thinned.outcome = engine::VolumeThinningOutcome::kNothingLeft;
+        return step;
+    }
+    step.thinned = grow.thinToVolume(pre.stocking, pre.basalArea, pre.topHeight,
+                                     engine::residualVolume(pre.volume, removal));
+    switch (step.thinned.outcome) {
+    case engine::VolumeThinningOutcome::kNoThinningResponse:
+        step.refusal = std::string(engine::thinningtext::kNoThinningResponse);
+        break;
+    case engine::VolumeThinningOutcome::kNothingLeft:
+        step.refusal = std::string(engine::thinningtext::kNothingLeft);
+        break;
+    case engine::VolumeThinningOutcome::kSolverFailed:
+    case engine::VolumeThinningOutcome::kDone:
+        break;
+    }
+    return step;
+}
+
 } // namespace arbolex::rotation

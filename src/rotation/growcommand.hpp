@@ -10,10 +10,15 @@
 #include "engine/standstate.hpp"
 #include "rotation/standchecks.hpp"
 
+#include <optional>
+#include <string>
 #include <string_view>
 #include <vector>
 
 namespace arbolex::rotation {
+
+/// Pattern of the volumes the thinning window shows (before, removed, after), m³/ha.
+inline constexpr std::string_view kThinningVolumeShown = "###0.00";
 
 /// Patterns of the cells that the grow-from fields take a row's top height
 /// and basal area from (its age is shown as its plain text and its stocking
@@ -44,6 +49,19 @@ struct Growth {
     /// The start state, then one state per step.
     std::vector<engine::StandState> states;
 };
+
+/// The thinning window's volume method on its last growth row `pre`: the
+/// removal (m³/ha) checked against the volume the window shows before the
+/// thinning, then the engine's thinning to the residual volume. `refusal` is
+/// the window's message when it refuses; it is empty when the engine's solver
+/// failed, which has shown its own message.
+struct VolumeThinningStep {
+    engine::VolumeThinning thinned;
+    std::optional<std::string> refusal;
+
+    bool done() const { return !refusal && thinned.done(); }
+};
+VolumeThinningStep thinByVolume(engine::Grow &grow, const engine::StandState &pre, double removal);
 
 /// Grows the stand (age, years; basal area, m²/ha; stocking, stems/ha; top
 /// height, m) to `targetAge` by `step` years with the active model of `grow`,

@@ -1,5 +1,7 @@
 #include "rotation/optimiser.hpp"
 
+#include "engine/vectorstate.hpp"
+
 #include <algorithm>
 #include <limits>
 #include <set>
@@ -132,6 +134,14 @@ std::optional<OptimiserResult> optimise(engine::Grow &grow, const Stand &stand,
                                         const Economics &economics,
                                         const OptimiserSettings &settings, GrowthFailure &failure,
                                         const Progress &progress) {
+    engine::clearUpperVectorState();
+    // The caller's progress callback may run any library's code (a window's
+    // progress bar): the search goes on from a clean vector state.
+    auto goOn = [&progress](double fraction) {
+        const bool more = progress(fraction);
+        engine::clearUpperVectorState();
+        return more;
+    };
     const std::optional<GrowthPath> unthinned = growPath(grow, stand, {}, failure);
     if (!unthinned) {
         return std::nullopt;
@@ -161,7 +171,7 @@ std::optional<OptimiserResult> optimise(engine::Grow &grow, const Stand &stand,
     const double shares = static_cast<double>(grid.size()) + (settings.refine ? kRefineRounds : 0);
     for (std::size_t i = 0; i < grid.size(); ++i) {
         search.grow(grid[i]);
-        if (progress && !progress(static_cast<double>(i + 1) / shares)) {
+        if (progress && !goOn(static_cast<double>(i + 1) / shares)) {
             OptimiserResult r = search.result();
             r.completed = false;
             return r;
@@ -185,7 +195,7 @@ std::optional<OptimiserResult> optimise(engine::Grow &grow, const Stand &stand,
                 }
             }
         }
-        if (progress && !progress((static_cast<double>(grid.size()) + round + 1) / shares)) {
+        if (progress && !goOn((static_cast<double>(grid.size()) + round + 1) / shares)) {
             OptimiserResult r = search.result();
             r.completed = false;
             return r;

@@ -1,13 +1,15 @@
 #include "rotation/rotation.hpp"
 
+#include "engine/vectorstate.hpp"
 #include "format/displayformat.hpp"
+#include "rotation/growcommand.hpp"
 #include "rotation/optimiser.hpp"
+#include "rotation/standchecks.hpp"
 #include "rotation/yieldclass.hpp"
 #include "valuation/discounting.hpp"
 
 #include <algorithm>
 #include <cmath>
-#include <cstdio>
 #include <limits>
 
 namespace arbolex::rotation {
@@ -16,13 +18,6 @@ namespace {
 
 std::string ageText(int age) {
     return std::to_string(age);
-}
-
-/// Volume, m³, written with two decimals as the thinning window shows it.
-std::string volumeText(float volume) {
-    char text[32];
-    std::snprintf(text, sizeof text, "%.2f", static_cast<double>(volume));
-    return text;
 }
 
 /// Last thinning age the regime names below `ageLimit`, or std::nullopt.
@@ -93,7 +88,10 @@ Figures figures(const Flows &f, int presentAge, double ratePercent) {
     out.npv = valuation::netPresentValue(fromPresent, ratePercent);
     out.lev = valuation::landExpectationValue(f.net, ratePercent);
     if (out.lev) {
-        out.forestValue = valuation::forestValue(fromPresent, *out.lev, ratePercent);
+        // The forest value adds the LEV to the same net present value.
+        const int yearsToFinalCut =
+            fromPresent.empty() ? 0 : static_cast<int>(fromPresent.size()) - 1;
+        out.forestValue = valuation::forestValue(out.npv, yearsToFinalCut, *out.lev, ratePercent);
     }
     return out;
 }
@@ -183,6 +181,10 @@ std::optional<std::string> rotationProblem(const GrowthPath &path, const Regime 
         return "the rotation (age " + ageText(rotation) + ") is past the model's age limit " +
                ageText(path.ageLimit);
     }
+    if (rotation > path.lastAge() && path.stop && !path.stop->text.empty()) {
+        // The window refuses to go on where the path stops.
+        return path.stop->text;
+    }
     if (rotation < path.presentAge || rotation < 1) {
         return "the rotation (age " + ageText(rotation) + ") is before the present age " +
                ageText(path.presentAge);
@@ -202,114 +204,158 @@ std::optional<std::string> rotationProblem(const GrowthPath &path, const Regime 
     return std::nullopt;
 }
 
+namespace {
+
+/// The engine's reports passed on as they are, the text of the last message
+/// kept: a rotation refused because the engine failed says what the window
+/// would have shown.
+class KeepingLastMessage : public engine::IEngineReport {
+public:
+    explicit KeepingLastMessage(engine::Grow &grow) : m_grow(grow), m_next(grow.report()) {
+        m_grow.setReport(this);
+    }
+    ~KeepingLastMessage() override { m_grow.setReport(m_next); }
+    KeepingLastMessage(const KeepingLastMessage &) = delete;
+    KeepingLastMessage &operator=(const KeepingLastMessage &) = delete;
+
+    void showMessage(std::string_view title, std::string_view text, int style) override {
+        m_last = text;
+        if (m_next != nullptr) {
+            m_next->showMessage(title, text, style);
+        }
+    }
+    void logError(std::string_view message) override {
+        if (m_last.empty()) {
+            m_last = message;
+        }
+        if (m_next != nullptr) {
+            m_next->logError(message);
+        }
+    }
+    /// The last message, or `otherwise` when the engine showed none.
+    std::string lastOr(std::string_view otherwise) const {
+        return m_last.empty() ? std::string(otherwise) : m_last;
+    }
+
+private:
+    engine::Grow &m_grow;
+    engine::IEngineReport *m_next;
+    std::string m_last;
+};
+
+} // namespace
+
 std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const Regime &regime,
                                    GrowthFailure &failure, const ThinningLimits *limits,
                                    std::optional<int> finalCut) {
+    engine::clearUpperVectorState();
+    KeepingLastMessage messages(grow);
     const unsigned faultsBefore = grow.faultCount();
-    auto engineFailed = [&](std::string text) {
-        failure = {false, std::move(text)};
+    const auto engineFailed = [&](std::string_view text) {
+        failure = {false, messages.lastOr(text)};
         return std::nullopt;
     };
+    // The model chosen with the stand's site index in force, as the window
+    // does when the model is chosen again after the stand is typed: the
+    // correction factor follows the site index current at selection.
     grow.GetModel(stand.model);
-    // The correction factor follows the site index current at selection.
+    grow.SiteIndex(stand.age, stand.height);
     grow.GetVCF();
     GrowthPath path;
     path.ageLimit = modelAgeLimit(stand.model);
-    if (!grow.SiteIndex(stand.age, stand.height) || grow.faultCount() != faultsBefore) {
-        return engineFailed("the site index of the stand could not be computed");
-    }
-    float siteIndex = grow.siteIndex();
-    path.siteIndex = siteIndex;
     path.volumeRatio = grow.volumeRatio();
-    grow.TM(siteIndex);
-    float age = stand.age;
-    float basalArea = stand.basalArea;
-    float stocking = stand.stocking;
-    float height = stand.height;
-    auto target = static_cast<float>(path.ageLimit);
-    grow.STATEYR(age, basalArea, stocking, height, target, siteIndex);
-    path.presentAge = static_cast<int>(age);
-    if (path.presentAge > path.ageLimit) {
-        failure = {true, "the stand (age " + ageText(path.presentAge) +
+    if (auto fault = standFault(stand, grow.maxTopHeight())) {
+        failure = {true, std::move(*fault)};
+        return std::nullopt;
+    }
+    const auto presentAge = static_cast<int>(std::nearbyint(stand.age));
+    if (presentAge > path.ageLimit) {
+        failure = {true, "the stand (age " + ageText(presentAge) +
                              ") is past the model's age limit " + ageText(path.ageLimit)};
         return std::nullopt;
     }
-    if (const auto problem = regimeProblem(regime, path.presentAge, path.ageLimit)) {
+    if (const auto problem = regimeProblem(regime, presentAge, path.ageLimit)) {
         failure = {true, *problem};
         return std::nullopt;
     }
-    if (regime.thins() && grow.T(1) == 0.0) {
+    if (regime.thins() && !grow.isThinnedModel()) {
         failure = {true, "model " + ageText(stand.model) + " (" + grow.label() +
                              ") has no thinning response: it cannot be thinned"};
         return std::nullopt;
     }
-    path.years.push_back(
-        {age, basalArea, stocking, height, grow.GetV7(basalArea, stocking, height)});
 
     const int growTo = finalCut ? std::min(*finalCut, path.ageLimit) : path.ageLimit;
     const std::optional<int> lastThinning = lastThinningAge(regime, growTo);
     int nextThinning = regime.thinFrom;
-    // Where growth goes on from: the last state recorded, or the stand just
-    // thinned (the record of a thinning age keeps the crop before it).
-    engine::StandState current = path.years.back();
-    std::vector<engine::StandState> states;
+    // Each press of Grow: from its stand (the typed one, then each thinned
+    // one, exact as the table keeps it) to the next thinning or the end.
+    engine::StandState from{stand.age, stand.basalArea, stand.stocking, stand.height, 0.0f};
+    bool first = true;
     while (true) {
         const bool thinning = lastThinning && nextThinning <= *lastThinning;
-        const int stop = thinning ? nextThinning : growTo;
-        if (stop > static_cast<int>(current.age)) {
-            states.clear();
-            if (!grow.PROJ(current.age, current.basalArea, current.stocking, current.topHeight,
-                           static_cast<float>(stop), 1.0f, states) ||
-                grow.faultCount() != faultsBefore) {
-                return engineFailed("the projection to age " + ageText(stop) +
-                                    " could not be completed");
+        const int target = thinning ? nextThinning : growTo;
+        if (!first) {
+            // The window checks what its fields show of the thinned stand.
+            if (auto fault = growFromFault(shownGrowFrom(from, static_cast<float>(target)),
+                                           grow.maxTopHeight(), path.ageLimit)) {
+                path.stop = GrowthPath::Stop{static_cast<int>(from.age), std::move(fault->text)};
+                break;
             }
-            // The first state is where the projection started from.
-            path.years.insert(path.years.end(), states.begin() + 1, states.end());
-            current = path.years.back();
         }
+        Growth growth = growStand(grow, from.age, from.basalArea, from.stocking, from.topHeight,
+                                  static_cast<float>(target), 1.0f);
+        if (!growth.projected || grow.faultCount() != faultsBefore) {
+            return engineFailed(standtext::kProjectionFailed);
+        }
+        if (first) {
+            path.presentAge = static_cast<int>(growth.age);
+            path.siteIndex = growth.siteIndex;
+            path.years.push_back(growth.states.front());
+            first = false;
+        }
+        // The first state is where the projection started from.
+        path.years.insert(path.years.end(), growth.states.begin() + 1, growth.states.end());
         if (!thinning) {
             break;
         }
+        const engine::StandState pre = path.years.back();
         if (limits != nullptr &&
-            double{regime.thinVolume} > limits->maxRemovalShare * double{current.volume}) {
+            double{regime.thinVolume} > limits->maxRemovalShare * double{pre.volume}) {
+            path.stop = GrowthPath::Stop{target, {}, true};
             break;
         }
-        const float residualVolume = current.volume - regime.thinVolume;
-        if (!(residualVolume > 0.0f)) {
-            failure = {true, "the thinning at age " + ageText(stop) + " removes " +
-                                 volumeText(regime.thinVolume) + " m3/ha of the " +
-                                 volumeText(current.volume) + " m3/ha standing"};
-            return std::nullopt;
+        const VolumeThinningStep step = thinByVolume(grow, pre, double{regime.thinVolume});
+        if (step.thinned.outcome == engine::VolumeThinningOutcome::kSolverFailed ||
+            grow.faultCount() != faultsBefore) {
+            path.stop = GrowthPath::Stop{target, messages.lastOr(standtext::kProjectionFailed)};
+            break;
         }
-        float residualStocking = 0.0f;
-        float residualBasalArea = 0.0f;
-        if (!grow.NEWTON(current.stocking, current.basalArea, current.topHeight, residualVolume,
-                         residualStocking, residualBasalArea) ||
-            grow.faultCount() != faultsBefore || !(residualStocking > 0.0f) ||
-            !(residualBasalArea > 0.0f)) {
-            return engineFailed("the thinning response could not remove " +
-                                volumeText(regime.thinVolume) + " m3/ha at age " + ageText(stop));
+        if (step.refusal) {
+            path.stop = GrowthPath::Stop{target, *step.refusal};
+            break;
         }
-        if (limits != nullptr && residualStocking < limits->minStocking) {
+        if (limits != nullptr && step.thinned.stocking < limits->minStocking) {
+            path.stop = GrowthPath::Stop{target, {}, true};
             break;
         }
         Harvest t;
-        t.age = stop;
-        t.volume = current.volume - residualVolume;
-        t.stocking = current.stocking - residualStocking;
-        t.basalArea = current.basalArea - residualBasalArea;
+        t.age = target;
+        t.volume = std::fabs(pre.volume - step.thinned.volume);
+        t.stocking = pre.stocking - step.thinned.stocking;
+        t.basalArea = pre.basalArea - step.thinned.basalArea;
         t.meanTreeVolume = removedMeanTree(t.volume, t.stocking);
         t.priceClass = priceClassOf(t.meanTreeVolume);
+        t.residual = {pre.age, step.thinned.basalArea, step.thinned.stocking, pre.topHeight,
+                      step.thinned.volume};
         path.thinnings.push_back(t);
-        current = {current.age, residualBasalArea, residualStocking, current.topHeight,
-                   residualVolume};
+        from = t.residual;
         nextThinning += regime.thinEvery;
     }
     return path;
 }
 
 void divideThinnings(GrowthPath &path) {
+    engine::clearUpperVectorState();
     for (Harvest &t : path.thinnings) {
         t.assortments = divideHarvest(t.volume, t.basalArea, t.stocking, path.volumeRatio);
     }
@@ -318,6 +364,7 @@ void divideThinnings(GrowthPath &path) {
 
 RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics,
                             Appraisal appraisal) {
+    engine::clearUpperVectorState();
     RotationValue v;
     v.rotation = rotation;
     std::vector<Harvest> all = harvests(path, rotation, economics, v.finalCut);
@@ -359,6 +406,7 @@ int firstRotation(const GrowthPath &path, const Regime &regime) {
 
 RotationExplorer exploreRotations(const GrowthPath &path, const Regime &regime,
                                   const Economics &economics) {
+    engine::clearUpperVectorState();
     RotationExplorer e;
     double bestMai = -std::numeric_limits<double>::infinity();
     double bestLev = -std::numeric_limits<double>::infinity();
@@ -387,12 +435,18 @@ RotationChoice chooseRotation(const GrowthPath &path, const Regime &regime,
                               const Economics &economics, std::optional<int> rotation) {
     RotationChoice choice;
     choice.age = rotation ? *rotation : exploreRotations(path, regime, economics).economicRotation;
+    if (!rotation && choice.age == 0 && path.stop && !path.stop->text.empty()) {
+        // No rotation to value: the window refuses the regime before any.
+        choice.problem = path.stop->text;
+        return choice;
+    }
     choice.problem = rotationProblem(path, regime, choice.age);
     return choice;
 }
 
 Candidate scoreRotation(const GrowthPath &path, const Regime &regime, int rotation,
                         const Economics &economics, Objective objective) {
+    engine::clearUpperVectorState();
     Candidate c;
     c.rotation = rotation;
     Harvest finalCut;

@@ -94,6 +94,9 @@ struct Harvest {
     /// Revenue, euro/ha: volume × standing price of the mean tree's class, or
     /// the sum of the classes' volumes × their prices.
     double revenue = 0.0;
+    /// The stand a thinning leaves (the record of its row in the table); the
+    /// final cut leaves none.
+    engine::StandState residual{};
 };
 
 /// Pattern of a mean tree volume in the projection table, m³.
@@ -134,6 +137,15 @@ struct GrowthPath {
     std::vector<Harvest> thinnings;
     /// True once divideThinnings has divided the thinnings into assortments.
     bool thinningsDivided = false;
+    /// Why the path ends before the age it was grown to, when it does: the
+    /// window refuses to go on from there (a thinning, or the grow from the
+    /// thinned stand) with `text`, or the optimiser's limits stop it.
+    struct Stop {
+        int age = 0;
+        std::string text;
+        bool byLimits = false;
+    };
+    std::optional<Stop> stop;
 
     /// Last age grown, years: the age limit, or the age of a thinning the
     /// limits did not allow.
@@ -170,17 +182,24 @@ struct ThinningLimits {
     float minStocking = 0.0f;
 };
 
-/// Grows `stand` under `regime` to the model's age limit with `grow` (the
-/// model is made active with its volume correction factor and the site index
-/// computed, as the model menu and the grow command do). Each thinning is the
-/// thinning window's volume method: the residual volume is the standing
-/// volume less `thinVolume`, and NEWTON gives the residual basal area and
-/// stocking. With `limits`, the path ends at the first thinning they do not
-/// allow (its crop recorded, the thinning not made). With `finalCut`, the
-/// path ends at that age (the age limit still bounds it): enough for the one
-/// rotation felled there, and no thinning after it can stop the path; the
-/// explorer needs a path grown to the limit. Returns std::nullopt and fills
-/// `failure` when it cannot.
+/// Grows `stand` under `regime` to the model's age limit with `grow`, as the
+/// main window does when the regime is typed into it: the model chosen with
+/// the stand's site index in force (so its volume correction factor is the
+/// window's), the stand grown by one-year steps to the first thinning, each
+/// thinning the thinning window's volume method (the volume removal checked
+/// against the volume the window shows, then Grow::thinToVolume), and the
+/// thinned stand grown on to the next one. Every stand the window grows from
+/// passes the grow command's range checks on what its fields show
+/// (shownGrowFrom); every projection starts with the site index of its stand
+/// and age, as each press of Grow does. A thinning or a grow the window would
+/// refuse ends the path there (`stop`, with the window's message); a
+/// rotation past it is refused with that message. With `limits`, the path
+/// also ends at the first thinning they do not allow (its crop recorded, the
+/// thinning not made). With `finalCut`, the path ends at that age (the age
+/// limit still bounds it): enough for the one rotation felled there, and no
+/// thinning after it can stop the path; the explorer needs a path grown to
+/// the limit. Returns std::nullopt and fills `failure` when the stand itself
+/// is refused or the engine fails.
 std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const Regime &regime,
                                    GrowthFailure &failure, const ThinningLimits *limits = nullptr,
                                    std::optional<int> finalCut = std::nullopt);

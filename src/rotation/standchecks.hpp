@@ -35,6 +35,9 @@ inline constexpr std::string_view kRangeBasalArea =
 /// Followed by the oldest age the model may be grown to and "]".
 inline constexpr std::string_view kRangeToAgeLead =
     "FAULT - Grow To AGE not in acceptable range [10,";
+/// The grow command's message when a projection fails part-way.
+inline constexpr std::string_view kProjectionFailed =
+    "Error - unable to complete Projection (state inversion problem).";
 /// The height field's own refusal, misspelt as it always was.
 inline constexpr std::string_view kMaximumHeight = "Maximum height alowed is 49";
 } // namespace standtext

@@ -1,5 +1,6 @@
 #include "rotation/uncertainty.hpp"
 
+#include "engine/vectorstate.hpp"
 #include "valuation/discounting.hpp"
 
 #include <algorithm>
@@ -99,6 +100,7 @@ Percentiles percentiles(std::vector<double> values) {
 } // namespace
 
 std::vector<TornadoBar> tornado(const GrowthPath &path, int rotation, const Economics &economics) {
+    engine::clearUpperVectorState();
     Flows flows(path, rotation, economics);
     const double r = economics.ratePercent;
     struct Move {
@@ -123,6 +125,7 @@ std::vector<TornadoBar> tornado(const GrowthPath &path, int rotation, const Econ
 
 MonteCarloResult monteCarlo(const GrowthPath &path, int rotation, const Economics &economics,
                             const MonteCarloSettings &settings) {
+    engine::clearUpperVectorState();
     Flows flows(path, rotation, economics);
     std::mt19937_64 engine(settings.seed);
     std::vector<double> npv;

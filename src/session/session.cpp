@@ -11,10 +11,10 @@ Session::Session(const QString &dataFolder, const SessionViews &views)
       m_timberPrices(m_prices, m_log, views.timberPrices),
       m_assort(m_work, views.assort, views.interactive),
       m_assortUser(m_prices.data(), m_assort.session(), views.assortUser, views.interactive),
-      m_economics(m_work, m_main, m_thin, views.economics, views.interactive),
+      m_economics(m_work, m_main, views.economics, views.interactive),
       m_assortPrices(m_prices.data(), m_log, views.assortPrices, views.interactive),
       m_documents(m_work, m_main, views.interactive, views.settings, views.documentDialogs),
-      m_estate(m_work, m_main, m_thin, m_documents, views.estate, views.interactive) {
+      m_estate(m_work, m_main, m_documents, views.estate, views.interactive) {
     m_main.attachClipboard(&views.clipboard);
     m_timberPrices.attachAssortmentPrices(&m_assortPrices);
     m_thin.attachAssortments(&m_assort);

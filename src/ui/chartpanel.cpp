@@ -83,14 +83,20 @@ ChartPanel::ChartPanel(QWidget *parent) : QWidget(parent) {
     layout->addLayout(buttons);
     connect(png, &QPushButton::clicked, this, [this] { exportAs(QStringLiteral("png")); });
     connect(svg, &QPushButton::clicked, this, [this] { exportAs(QStringLiteral("svg")); });
+    // A chart is laid out only when its tab is in view: laying out the three
+    // after every grow cost more than the grow.
+    connect(m_tabs, &QTabWidget::currentChanged, this, [this](int tab) {
+        if (tab >= 0 && tab < kChartCount && !m_drawn.at(static_cast<std::size_t>(tab))) {
+            draw(static_cast<Chart>(tab));
+        }
+    });
 }
 
 void ChartPanel::showCharts(const charts::ChartData &stand, const charts::ChartData &increments,
                             const charts::ChartData &cashFlow) {
     m_data = {stand, increments, cashFlow};
-    for (int c = 0; c < kChartCount; ++c) {
-        draw(static_cast<Chart>(c));
-    }
+    m_drawn.fill(false);
+    draw(current());
 }
 
 const charts::ChartData &ChartPanel::data(Chart chart) const {
@@ -110,6 +116,7 @@ void ChartPanel::setCurrent(Chart chart) {
 }
 
 void ChartPanel::draw(Chart chart) {
+    m_drawn.at(slot(chart)) = true;
     QChartView *view = m_views.at(slot(chart));
     const charts::ChartData &data = m_data.at(slot(chart));
     auto *stack = static_cast<QStackedLayout *>(view->parentWidget()->layout());

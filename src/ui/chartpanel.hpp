@@ -24,7 +24,8 @@ public:
 
     explicit ChartPanel(QWidget *parent = nullptr);
 
-    /// Draws the three charts again.
+    /// Takes the three charts' data and draws the chart in view; the others
+    /// are drawn when their tab is first shown.
     void showCharts(const charts::ChartData &stand, const charts::ChartData &increments,
                     const charts::ChartData &cashFlow);
     const charts::ChartData &data(Chart chart) const;
@@ -52,6 +53,8 @@ private:
     std::array<QChartView *, kChartCount> m_views{};
     std::array<QLabel *, kChartCount> m_empty{};
     std::array<charts::ChartData, kChartCount> m_data;
+    /// The view shows m_data (drawn since the data last changed).
+    std::array<bool, kChartCount> m_drawn{};
     std::function<void(const QString &, bool)> m_exported;
 };
 

@@ -17,6 +17,7 @@
 #include <QScreen>
 #include <QTabWidget>
 #include <QTextStream>
+#include <QTimer>
 
 namespace arbolex::ui {
 
@@ -95,6 +96,10 @@ void Desktop::waitForWork() {
     }
 }
 
+void Desktop::settle() {
+    QCoreApplication::processEvents();
+}
+
 QString Desktop::clipboardText() const {
     return QGuiApplication::clipboard()->text();
 }
@@ -144,6 +149,10 @@ bool Desktop::runScript(const QString &path) {
         runner.run(QString::fromUtf8(file.readAll()).split(QLatin1Char('\n')));
     if (!outcome.ok()) {
         err << path << ':' << outcome.line << ": " << outcome.error << '\n';
+    }
+    err.flush();
+    if (m_quitAfterScript) {
+        QTimer::singleShot(0, QCoreApplication::instance(), &QCoreApplication::quit);
     }
     return outcome.ok();
 }

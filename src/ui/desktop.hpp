@@ -61,6 +61,8 @@ public:
     QString clipboardText() const override;
     /// Waits for the work the windows run away from the window's thread.
     void waitForWork() override;
+    void settle() override;
+    void quitAfterScript() override { m_quitAfterScript = true; }
     /// "charts stand|increments|cashflow", "frmEconomics rotation|optimiser|
     /// sensitivity|montecarlo", "frmEstate table|chart|closed".
     QString show(const QString &window, const QString &page) override;
@@ -94,6 +96,7 @@ private:
     DocumentMenu m_documentMenu;
     shell::DataHistory m_history;
     session::Session m_session;
+    bool m_quitAfterScript = false;
 };
 
 } // namespace arbolex::ui

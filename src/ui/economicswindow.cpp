@@ -4,6 +4,7 @@
 #include "economics/economicsformat.hpp"
 #include "economics/economicsmessages.hpp"
 #include "economics/economicswindowlogic.hpp"
+#include "engine/vectorstate.hpp"
 #include "report/chartbuilder.hpp"
 #include "ui/fieldinput.hpp"
 #include "ui/stringgridmodel.hpp"
@@ -99,6 +100,7 @@ EconomicsWindow::EconomicsWindow(QWidget *main) : QDialog(main) {
     m_tabs->addTab(buildOptimiserTab(), et::tabOptimiser());
     m_tabs->addTab(buildSensitivityTab(), et::tabSensitivity());
     m_tabs->addTab(buildMonteCarloTab(), et::tabMonteCarlo());
+    connect(m_tabs, &QTabWidget::currentChanged, this, [this] { showPendingCharts(); });
     layout->addWidget(m_tabs, 1);
 
     auto *bottom = new QHBoxLayout;
@@ -358,10 +360,35 @@ void EconomicsWindow::focus(EconomicsControl c) {
     focusControl(control(c));
 }
 
-void EconomicsWindow::showChart(QChartView *view, const charts::ChartData &data) {
+void EconomicsWindow::showChart(QChartView *view, charts::ChartData chart) {
+    // A chart on a tab out of view is drawn when its tab is shown: laying out
+    // the sensitivity and Monte Carlo charts at every computation cost more
+    // than all the figures.
+    if (!m_tabs->currentWidget()->isAncestorOf(view)) {
+        m_pendingCharts[view] = std::move(chart);
+        return;
+    }
+    m_pendingCharts.erase(view);
+    draw(view, chart);
+}
+
+void EconomicsWindow::draw(QChartView *view, const charts::ChartData &chart) {
     QChart *old = view->chart();
-    view->setChart(report::buildChart(data, report::ChartLook::Window));
+    view->setChart(report::buildChart(chart, report::ChartLook::Window));
     delete old;
+}
+
+void EconomicsWindow::showPendingCharts() {
+    for (auto pending = m_pendingCharts.begin(); pending != m_pendingCharts.end();) {
+        QChartView *view = pending->first;
+        if (!m_tabs->currentWidget()->isAncestorOf(view)) {
+            ++pending;
+            continue;
+        }
+        const charts::ChartData chart = std::move(pending->second);
+        pending = m_pendingCharts.erase(pending);
+        draw(view, chart);
+    }
 }
 
 void EconomicsWindow::figuresChanged() {
@@ -369,10 +396,10 @@ void EconomicsWindow::figuresChanged() {
         return;
     }
     m_valueBox->setTitle(et::panelValue() + QLatin1Char(' ') + et::atRate(m_logic->rateText()));
-    const charts::EconomicsCharts drawn = charts::economicsCharts(*m_logic);
-    showChart(m_rotationChart, drawn.rotations);
-    showChart(m_tornadoNpv, drawn.tornadoNpv);
-    showChart(m_tornadoLev, drawn.tornadoLev);
+    charts::EconomicsCharts drawn = charts::economicsCharts(*m_logic);
+    showChart(m_rotationChart, std::move(drawn.rotations));
+    showChart(m_tornadoNpv, std::move(drawn.tornadoNpv));
+    showChart(m_tornadoLev, std::move(drawn.tornadoLev));
     regimesChanged();
 }
 
@@ -403,7 +430,12 @@ void EconomicsWindow::setProgress(double fraction) {
 }
 
 void EconomicsWindow::runInBackground(std::function<void()> work, std::function<void()> done) {
-    m_worker = QThread::create(std::move(work));
+    // The thread starts with the window thread's vector state, which Qt
+    // leaves dirty (engine/vectorstate.hpp).
+    m_worker = QThread::create([work = std::move(work)] {
+        engine::clearUpperVectorState();
+        work();
+    });
     connect(m_worker, &QThread::finished, this, [this, done = std::move(done)] {
         m_worker->deleteLater();
         m_worker = nullptr;

@@ -1,10 +1,13 @@
 #pragma once
 
+#include "charts/chartdata.hpp"
 #include "economics/ieconomicsview.hpp"
 
 #include <QDialog>
 
 #include <array>
+#include <functional>
+#include <map>
 
 class QChartView;
 class QGroupBox;
@@ -14,9 +17,6 @@ class QTabWidget;
 class QTableView;
 class QThread;
 
-namespace arbolex::charts {
-struct ChartData;
-}
 namespace arbolex::economics {
 class EconomicsWindowLogic;
 }
@@ -69,8 +69,12 @@ private:
     /// The choice cboValuation: standing price of the mean tree or assortments.
     QWidget *valuationChoice();
     QWidget *button(economics::EconomicsControl control, const QString &caption);
-    /// Shows `data` drawn in `view`, deleting the chart it showed before.
-    static void showChart(QChartView *view, const charts::ChartData &data);
+    /// Draws `chart` in `view` now when its tab is in view, or when its tab is
+    /// next shown, deleting the chart it showed before.
+    void showChart(QChartView *view, charts::ChartData chart);
+    /// Draws `chart` in `view`, deleting the chart it showed before.
+    static void draw(QChartView *view, const charts::ChartData &chart);
+    void showPendingCharts();
 
     economics::EconomicsWindowLogic *m_logic = nullptr;
     std::array<QWidget *, economics::kEconomicsControlCount> m_controls{};
@@ -81,6 +85,8 @@ private:
     QChartView *m_tornadoNpv = nullptr;
     QChartView *m_tornadoLev = nullptr;
     QChartView *m_histogram = nullptr;
+    /// Charts waiting for their tab to be shown.
+    std::map<QChartView *, charts::ChartData> m_pendingCharts;
     QProgressBar *m_progress = nullptr;
     QTableView *m_regimes = nullptr;
     StringGridModel *m_regimeModel = nullptr;

@@ -1,6 +1,7 @@
 #include "ui/estatewindow.hpp"
 
 #include "charts/estatecharts.hpp"
+#include "engine/vectorstate.hpp"
 #include "estatewindow/estatemessages.hpp"
 #include "estatewindow/estatewindowlogic.hpp"
 #include "report/chartbuilder.hpp"
@@ -169,7 +170,12 @@ void EstateWindow::runInBackground(std::function<void()> work, std::function<voi
             m_logic->cancel();
         }
     });
-    m_worker = QThread::create(std::move(work));
+    // The thread starts with the window thread's vector state, which Qt
+    // leaves dirty (engine/vectorstate.hpp).
+    m_worker = QThread::create([work = std::move(work)] {
+        engine::clearUpperVectorState();
+        work();
+    });
     connect(m_worker, &QThread::finished, this, [this, done = std::move(done)] {
         m_worker->deleteLater();
         m_worker = nullptr;

@@ -2,6 +2,8 @@
 
 #include "valuation/discounting.hpp"
 
+#include "engine/vectorstate.hpp"
+
 #include <cmath>
 
 namespace arbolex::valuation {
@@ -28,6 +30,7 @@ constexpr double kIrrTolerancePercent = 1e-10;
 
 std::optional<double> landExpectationValue(const std::vector<double> &cashFlowByAge,
                                            double ratePercent) {
+    engine::clearUpperVectorState();
     if (cashFlowByAge.size() < 2 || !(ratePercent > 0.0)) {
         return std::nullopt;
     }
@@ -51,17 +54,23 @@ double equivalentAnnualAnnuity(double landExpectationValue, double ratePercent) 
 
 std::optional<double> forestValue(const std::vector<double> &cashFlowFromPresent,
                                   double landExpectationValue, double ratePercent) {
-    const std::optional<double> npv = netPresentValue(cashFlowFromPresent, ratePercent);
     const int yearsToFinalCut =
         cashFlowFromPresent.empty() ? 0 : static_cast<int>(cashFlowFromPresent.size()) - 1;
+    return forestValue(netPresentValue(cashFlowFromPresent, ratePercent), yearsToFinalCut,
+                       landExpectationValue, ratePercent);
+}
+
+std::optional<double> forestValue(std::optional<double> netPresentValue, int yearsToFinalCut,
+                                  double landExpectationValue, double ratePercent) {
     const std::optional<double> factor = discountFactor(ratePercent, yearsToFinalCut);
-    if (!npv || !factor) {
+    if (!netPresentValue || !factor) {
         return std::nullopt;
     }
-    return *npv + landExpectationValue / *factor;
+    return *netPresentValue + landExpectationValue / *factor;
 }
 
 InternalRate internalRateOfReturn(const std::vector<double> &cashFlowByAge) {
+    engine::clearUpperVectorState();
     bool positive = false;
     bool negative = false;
     for (const double cf : cashFlowByAge) {

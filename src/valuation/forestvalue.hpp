@@ -31,6 +31,12 @@ double equivalentAnnualAnnuity(double landExpectationValue, double ratePercent);
 std::optional<double> forestValue(const std::vector<double> &cashFlowFromPresent,
                                   double landExpectationValue, double ratePercent);
 
+/// The same from the net present value of those cash flows, already computed
+/// (std::nullopt when it overflowed), the final cut `yearsToFinalCut` after
+/// the present.
+std::optional<double> forestValue(std::optional<double> netPresentValue, int yearsToFinalCut,
+                                  double landExpectationValue, double ratePercent);
+
 /// What the search for the internal rate of return found.
 enum class IrrOutcome {
     /// One rate makes the value 0: `ratePercent`.

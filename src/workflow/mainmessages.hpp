@@ -80,7 +80,7 @@ inline QString changesNotAllowed() {
            QStringLiteral("use the Clear All button and enter the new informations.");
 }
 inline QString projectionFailed() {
-    return QStringLiteral("Error - unable to complete Projection (state inversion problem).");
+    return stand(rotation::standtext::kProjectionFailed);
 }
 inline QString transferFailed() {
     return QStringLiteral("ERROR - difficulty in transferring data.");

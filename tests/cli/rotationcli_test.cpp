@@ -147,7 +147,7 @@ INSTANTIATE_TEST_SUITE_P(
         BadRotation{"--format xml", "--format takes tsv, csv or json"},
         BadRotation{"--thin-from 20 --thin-volume 40", "--thin-every is required"},
         BadRotation{"--thin-from 20 --thin-every 5 --thin-volume 900",
-                    "the thinning at age 20 removes 900.00 m3/ha"},
+                    "FAULT - Proposed thinning leads to negative or zero Volume."},
         BadRotation{"--thin-from 10 --thin-every 5 --thin-volume 40", "before the present age 15"},
         BadRotation{"--valuation price", "--valuation takes stand or assortment"},
         BadRotation{"--assortment-prices p.qdm",

@@ -20,10 +20,10 @@ protected:
     /// then grows to `finalCut` and fells there (0: no final cut).
     void typeRotation(const std::vector<int> &ages, const std::vector<QString> &volumes,
                       int finalCut) {
-        // A step of 5 years, or the whole span when it is shorter.
-        const auto growTo = [&](int from, int to) {
+        // By one-year steps, as a regime is written into the table.
+        const auto growTo = [&](int /*from*/, int to) {
             type(MainControl::txtToA, QString::number(to));
-            type(MainControl::txtByA, QString::number(std::min(5, to - from)));
+            type(MainControl::txtByA, QStringLiteral("1"));
             logic.cmdGrow_Click();
         };
         logic.cmdClear_Click();

@@ -85,7 +85,7 @@ INSTANTIATE_TEST_SUITE_P(
         BadRow{"un-thinned model with a regime", with(sitkaRow(), "model", "1"), kRefused,
                "model 1 (SS - (Un-thinned)) has no thinning response"},
         BadRow{"thinning more than stands", with(sitkaRow(), "thin_volume", "900"), kRefused,
-               "the thinning at age 20 removes 900.00 m3/ha"},
+               "FAULT - Proposed thinning leads to negative or zero Volume."},
         BadRow{"first thinning before the present", with(sitkaRow(), "thin_from", "12"), kRefused,
                "the first thinning (age 12) is before the present age 15"},
         BadRow{"rotation past the age limit", with(sitkaRow(), "rotation", "61"), kRefused,
@@ -164,17 +164,19 @@ TEST_F(EstateRowTest, DiameterStandsInForAMissingBasalAreaAndEmptyValuesTakeTheD
 
 TEST_F(EstateRowTest, AThinningTheRegimeWouldMakeAfterTheFinalCutDoesNotStopTheRow) {
     RowEvaluator evaluator(m_layout, m_defaults);
-    // A Scots pine stand too poor for a 40 m3 thinning at 40: felled at 38,
-    // it never meets that thinning.
-    const RowValues poor =
-        with(with(with(with(sitkaRow(), "model", "8"), "age", "18"), "top_height", "7"), "rotation",
-             "38");
-    const RowResult felled = evaluator.evaluate(poor);
+    // Douglas fir thinned by 40 m3/ha every 5 years: the grow from the stand
+    // a thinning after 50 leaves is refused (too few stems), but felled at 50
+    // the row never meets it.
+    const RowValues fir =
+        with(with(with(with(with(sitkaRow(), "model", "4"), "thin_from", "20"), "thin_every", "5"),
+                  "thin_volume", "40"),
+             "rotation", "50");
+    const RowResult felled = evaluator.evaluate(fir);
     EXPECT_EQ(felled.status, RowStatus::kOk) << felled.message;
-    EXPECT_EQ(felled.thinningCount, 4);
-    const RowResult later = evaluator.evaluate(with(poor, "rotation", "45"));
+    EXPECT_EQ(felled.thinningCount, 6);
+    const RowResult later = evaluator.evaluate(with(fir, "rotation", "56"));
     EXPECT_EQ(later.status, RowStatus::kRefused);
-    EXPECT_EQ(later.message.substr(0, 34), "the thinning at age 40 removes 40.");
+    EXPECT_EQ(later.message, "FAULT - Grow From STOCKING not in acceptable range [100, 5000]");
 }
 
 TEST_F(EstateRowTest, WithoutARotationAnywhereFellsAtTheEconomicRotation) {

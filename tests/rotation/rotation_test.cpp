@@ -151,9 +151,15 @@ INSTANTIATE_TEST_SUITE_P(
                     ProblemCase{"before today", {}, 14, true}));
 
 TEST_F(RotationTest, RegimesTheStandCannotCarryAreRefused) {
+    // The thinning window refuses to remove more than stands: the path ends
+    // at the first thinning, and a rotation past it gets the window's message.
     Regime heavy = m_thinning;
     heavy.thinVolume = 5000.0f;
-    EXPECT_TRUE(refused(kSitka, heavy).badInput);
+    const GrowthPath stopped = grown(kSitka, heavy);
+    ASSERT_TRUE(stopped.stop.has_value());
+    EXPECT_EQ(stopped.lastAge(), 20);
+    EXPECT_EQ(rotationProblem(stopped, heavy, 40),
+              "FAULT - Proposed thinning leads to negative or zero Volume.");
     Regime early = m_thinning;
     early.thinFrom = 12;
     EXPECT_TRUE(refused(kSitka, early).badInput);

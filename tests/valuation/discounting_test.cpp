@@ -6,6 +6,9 @@
 
 #include <cmath>
 #include <limits>
+#include <random>
+#include <thread>
+#include <vector>
 
 namespace arbolex::valuation {
 namespace {
@@ -40,6 +43,82 @@ TEST(DiscountingTest, FactorsThatCannotBeComputedAreRefused) {
     EXPECT_FALSE(discountFactor(-100.0, 3).has_value());
     EXPECT_FALSE(discountedCashFlow(1.0, std::numeric_limits<double>::infinity(), 1));
     EXPECT_FALSE(netPresentValue({1.0, 1.0, 1.0}, 1.0e200).has_value());
+}
+
+/// The factor as computed without any table, or std::nullopt where refused.
+std::optional<double> untabled(double ratePercent, int years) {
+    const double f = std::pow(1.0 + ratePercent / 100.0, static_cast<double>(years));
+    return std::isfinite(f) && f > 0.0 ? std::optional<double>(f) : std::nullopt;
+}
+
+/// Every factor of `rates` over ages past either end of a table, asked in an
+/// order that switches the rate often and comes back to earlier ones.
+void expectSameAsUntabled(const std::vector<double> &rates) {
+    for (const int years : {0, 1, 2, 37, 50, 1, 255, 256, 300, -1, -40, 50}) {
+        for (const double r : rates) {
+            SCOPED_TRACE(testing::Message() << r << " % over " << years << " years");
+            EXPECT_EQ(discountFactor(r, years), untabled(r, years));
+        }
+    }
+}
+
+TEST(DiscountingTest, FactorsAreThePowersWhateverWasAskedBefore) {
+    expectSameAsUntabled({3.0, 3.5, 3.0, -2.0, 0.0, -0.0, 1e-9, 250.0, 1.0e9, -100.0, -150.0,
+                          std::numeric_limits<double>::quiet_NaN(), 3.0});
+}
+
+TEST(DiscountingTest, ThreadsAtDifferentRatesGetTheirOwnFactors) {
+    std::vector<std::thread> threads;
+    for (const double r : {2.0, 4.0}) {
+        threads.emplace_back([r] {
+            for (int pass = 0; pass < 200; ++pass) {
+                expectSameAsUntabled({r, r + 0.5});
+            }
+        });
+    }
+    for (std::thread &t : threads) {
+        t.join();
+    }
+}
+
+/// The net present value as its definition reads: every year's cash flow over
+/// std::pow's factor, rounded to cents, summed from the first year.
+std::optional<double> byPowers(const std::vector<double> &cashFlows, double ratePercent) {
+    double sum = 0.0;
+    for (std::size_t i = 0; i < cashFlows.size(); ++i) {
+        const auto factor = untabled(ratePercent, static_cast<int>(i));
+        if (!factor) {
+            return std::nullopt;
+        }
+        sum += roundToCents(cashFlows[i] / *factor);
+    }
+    return sum;
+}
+
+TEST(DiscountingTest, NetPresentValueIsTheSumOfPowersToTheBit) {
+    std::mt19937_64 draw(20260101);
+    std::uniform_real_distribution<double> rate(-20.0, 30.0);
+    std::uniform_real_distribution<double> money(-5000.0, 50000.0);
+    std::uniform_int_distribution<int> years(1, 120);
+    std::uniform_int_distribution<int> cents(-500000, 5000000);
+    for (int c = 0; c < 3000; ++c) {
+        const double r = c % 7 == 0 ? std::nearbyint(rate(draw)) : rate(draw);
+        std::vector<double> flows(static_cast<std::size_t>(years(draw)));
+        for (std::size_t i = 0; i < flows.size(); ++i) {
+            // One flow in three lands on half a cent once discounted: its
+            // cents are decided by the last bits of the factor.
+            const double q = 1.0 + r / 100.0;
+            flows[i] =
+                i % 3 == 1 ? (cents(draw) + 0.5) / 100.0 * std::pow(q, double(i)) : money(draw);
+        }
+        SCOPED_TRACE(testing::Message() << "rate " << r << ", " << flows.size() << " years");
+        EXPECT_EQ(netPresentValue(flows, r), byPowers(flows, r));
+    }
+    for (const double r : {-100.0, -150.0, 1.0e9, 1.0e200, 0.0}) {
+        EXPECT_EQ(netPresentValue({1.0, -2.5, 1e300, 0.125}, r),
+                  byPowers({1.0, -2.5, 1e300, 0.125}, r))
+            << r;
+    }
 }
 
 } // namespace

@@ -4,9 +4,9 @@
 #include "mainwindowfixture.hpp"
 #include "work/worktexts.hpp"
 
+#include "rotation/yieldclass.hpp"
 #include "shell/vbformat.hpp"
 #include "workflow/mainmessages.hpp"
-#include "workflow/yieldclass.hpp"
 
 namespace arbolex::testing {
 namespace {
@@ -150,6 +150,7 @@ TEST_F(MainWindowTest, ClearAndClearAllShowTheirHeaderLayouts) {
 }
 
 TEST(YieldClassTest, CulminationAndEvenClasses) {
+    using rotation::yieldClass;
     EXPECT_EQ(yieldClass({}), 0);
     EXPECT_EQ(yieldClass({5, 8, 11, 12.9}), 0) << "still rising";
     EXPECT_EQ(yieldClass({5, 13, 12}), 14);

@@ -4,9 +4,9 @@
 
 #include "economics/npvwindowlogic.hpp"
 #include "prices/pricelookup.hpp"
+#include "rotation/yieldclass.hpp"
 #include "shell/iclipboard.hpp"
 #include "workflow/mainmessages.hpp"
-#include "workflow/yieldclass.hpp"
 
 namespace arbolex::testing {
 namespace {
@@ -102,7 +102,7 @@ TEST_F(RotationTest, FinalCutFixesAnEvenYieldClassAndOffersTheNetPresentValue) {
         }
     }
     logic.cmdFinalCut_Click();
-    const int yc = workflow::yieldClass(mai);
+    const int yc = rotation::yieldClass(mai);
     EXPECT_GT(yc, 0);
     EXPECT_EQ(yc % 2, 0);
     EXPECT_EQ(view.text(MainControl::lblYC), QString::number(yc));
