@@ -6,7 +6,6 @@
 #include "charts/standcharts.hpp"
 #include "economics/economicsmessages.hpp"
 #include "economics/economicswindowlogic.hpp"
-#include "economics/tableregime.hpp"
 #include "engine/grow.hpp"
 #include "shell/vbformat.hpp"
 #include "work/mdlnpv.hpp"
@@ -120,7 +119,7 @@ EconomicsPage economicsPage(economics::EconomicsWindowLogic &logic) {
     for (const auto &[caption, label] : economics::valueFigures()) {
         page.figures.emplace_back(caption, view.text(label));
     }
-    page.rotations = economicsCharts(logic).rotations;
+    page.rotations = rotationChart(logic.explorer(), et::panelRotations() + rate);
     if (!logic.regimes().empty()) {
         std::vector<QStringList> grid = logic.regimeGrid();
         // Captions in two lines on screen run on in print.
@@ -175,14 +174,7 @@ ReportContent reportContent(work::StandWork &work) {
 
 ReportContent reportContent(work::StandWork &work, economics::EconomicsWindowLogic &economics) {
     ReportContent content = reportContent(work);
-    if (!economics::standFromTable(work.table(), work.grow().modelId())) {
-        return content; // no stand: the window would value the fields as typed
-    }
-    // A rate of 0 % has no land expectation value: the window would refuse it.
-    if (!economics.optimising() && work.cashFlow().interestRate() > 0.0) {
-        economics.Form_Load();
-    }
-    if (economics.valued()) {
+    if (economics.figuresOfTable()) {
         content.economics = economicsPage(economics);
     }
     return content;

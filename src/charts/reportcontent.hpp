@@ -77,7 +77,8 @@ struct ReportContent {
     ChartData incrementChart;
     ChartData cashFlowChart;
 
-    /// The economics of the rotation; none when the table could not be valued.
+    /// The economics of the rotation; none unless the economics window has
+    /// valued the table as it stands.
     std::optional<EconomicsPage> economics;
 };
 
@@ -85,11 +86,10 @@ struct ReportContent {
 /// cash flow computed on a copy with the costs and revenues typed so far.
 ReportContent reportContent(work::StandWork &work);
 
-/// The report with its economics page: the rotation of the table valued as
-/// the economics window's Economics… values it (the program's interest rate,
-/// the costs the window holds). No page for an empty table, at a rate of 0 %
-/// or when the rotation cannot be valued; while the optimiser runs, the
-/// figures it started from.
+/// The report with the economics page when the economics window has valued
+/// the rotation the table holds now: its figures, rate and costs as the
+/// window shows them, and the optimiser's regimes once it has run. No page
+/// before the window has valued the table, nor after the table has changed.
 ReportContent reportContent(work::StandWork &work, economics::EconomicsWindowLogic &economics);
 
 /// The three charts of the main window now (the panel beside the table).

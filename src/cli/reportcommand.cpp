@@ -89,12 +89,12 @@ Command reportCommand() {
                 "`arbolex-cli run` does (messages go to stderr), then writes its report\n"
                 "as an A4 landscape PDF: the identification, the\n"
                 "model, the stand at the start, site index and yield class, the projection\n"
-                "table, the summary, the cash flow with its net present value, the\n"
-                "charts of stand development, increments and cash flow, and the\n"
-                "economics of the rotation at the interest rate of its cash flow (NPV,\n"
-                "LEV and MAI by rotation age, and the optimiser's best regimes when a\n"
-                "script ran it). Nothing in the\n"
-                "data folder is changed. Prints REPORT.pdf<TAB>N pages.\n"
+                "table, the summary, the cash flow with its net present value, and the\n"
+                "charts of stand development, increments and cash flow. When SCRIPT\n"
+                "valued the rotation in the economics window (press cmdEconomics or\n"
+                "frmEconomics.cmdCompute), a last page holds its figures, NPV, LEV and MAI\n"
+                "by rotation age and, once it ran the optimiser, the best regimes.\n"
+                "Nothing in the data folder is changed. Prints REPORT.pdf<TAB>N pages.\n"
                 "Exit status: 0 written, 1 the PDF cannot be written, 2 the command line,\n"
                 "the document or the script is wrong.\n"),
             &runReport};

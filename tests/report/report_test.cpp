@@ -15,6 +15,7 @@
 #include <QImage>
 #include <QProcess>
 #include <QRegularExpression>
+#include <QStandardPaths>
 
 namespace arbolex::testing {
 namespace {
@@ -93,49 +94,49 @@ TEST_F(ReportTest, PdfHoldsTheTextPagesThenOnePagePerChart) {
     EXPECT_EQ(youngPages, 3) << "one page of text, stand and increments";
 }
 
-TEST_F(ReportTest, EconomicsPageValuesTheTableAsTheEconomicsButtonDoes) {
+TEST_F(ReportTest, EconomicsPageOnlyWhileTheEconomicsWindowShowsTheTablesFigures) {
     closeRotation();
     economics::EconomicsWindowLogic &economics = session.economics();
-    ASSERT_FALSE(economics.valued()) << "the window was never opened";
+    const QString pdf = path(QStringLiteral("economics.pdf"));
+    const int plainPages = report::writeReportPdf(charts::reportContent(work), pdf, QString());
+    EXPECT_FALSE(charts::reportContent(work, economics).economics)
+        << "the economics window never valued the rotation";
+
+    economics.cmdEconomics_Click();
     charts::ReportContent content = charts::reportContent(work, economics);
     ASSERT_TRUE(content.economics.has_value());
     const charts::EconomicsPage &page = *content.economics;
-    // The program's interest rate, and the figures as the window shows them.
-    EXPECT_TRUE(page.title.endsWith(QStringLiteral("at 5.00 % a year")));
+    EXPECT_EQ(page.title, QStringLiteral("Economics of the rotation at 5.00 % a year"));
+    // The figures as the window shows them, in its order.
     ASSERT_EQ(page.figures.size(), 11U);
-    EXPECT_EQ(page.figures[0].first, economics::economicstext::figureNpv());
-    EXPECT_EQ(page.figures[0].second, economicsView.text(economics::EconomicsControl::lblNPV));
-    EXPECT_TRUE(page.figures[0].second.endsWith(QStringLiteral(" €/ha")));
+    EXPECT_EQ(page.figures.front().first, economics::economicstext::figureNpv());
+    EXPECT_EQ(page.figures.front().second, economicsView.text(economics::EconomicsControl::lblNPV));
+    EXPECT_EQ(page.figures.back().second,
+              economicsView.text(economics::EconomicsControl::lblYieldClass));
     EXPECT_FALSE(page.rotations.empty());
-    EXPECT_FALSE(page.rotations.markers.empty());
     EXPECT_TRUE(page.regimes.empty()) << "the optimiser has not run";
-    EXPECT_FALSE(economicsView.isShown()) << "valued without showing the window";
 
-    // The optimiser's regimes and the user's own, captions on one line.
+    // The optimiser's regimes, then the user's own; captions on one line.
     economics.cmdOptimise_Click();
     content = charts::reportContent(work, economics);
     ASSERT_TRUE(content.economics.has_value());
-    EXPECT_EQ(content.economics->regimes.rows.size(), economics.regimes().size() + 1);
-    EXPECT_EQ(content.economics->regimes.rows.back().first(),
-              economics::economicstext::regimeYours());
-    for (const QString &caption : content.economics->regimes.captions) {
+    const charts::ReportTable &regimes = content.economics->regimes;
+    ASSERT_EQ(regimes.rows.size(), economics.regimes().size() + 1);
+    EXPECT_EQ(regimes.rows.back().first(), economics::economicstext::regimeYours());
+    for (const QString &caption : regimes.captions) {
         EXPECT_FALSE(caption.contains(u'\n')) << caption.toStdString();
     }
-    EXPECT_FALSE(content.economics->regimesNote.isEmpty());
+    EXPECT_EQ(report::writeReportPdf(content, pdf, QString()), plainPages + 1);
+    EXPECT_EQ(pdfPages(pdf), plainPages + 1);
 
-    const QString pdf = path(QStringLiteral("economics.pdf"));
-    const int pages = report::writeReportPdf(content, pdf, QStringLiteral("today"));
-    EXPECT_EQ(pages, report::writeReportPdf(charts::reportContent(work), pdf, QString()) + 1);
+    // A table changed since is not the one valued: no page until Compute.
+    work.removeRowsFrom(logic.table().lastRow());
+    EXPECT_FALSE(charts::reportContent(work, economics).economics);
+    economics.cmdCompute_Click();
+    EXPECT_TRUE(charts::reportContent(work, economics).economics);
+    logic.ClearAll();
+    EXPECT_FALSE(charts::reportContent(work, economics).economics);
     EXPECT_TRUE(interactive.messages.isEmpty());
-}
-
-TEST_F(ReportTest, NoEconomicsPageWithoutAStandOrAnInterestRate) {
-    economics::EconomicsWindowLogic &economics = session.economics();
-    EXPECT_FALSE(charts::reportContent(work, economics).economics.has_value()) << "empty table";
-    closeRotation();
-    work.cashFlow().setInterestRate(0.0);
-    EXPECT_FALSE(charts::reportContent(work, economics).economics.has_value());
-    EXPECT_TRUE(interactive.messages.isEmpty()) << "no questions about a page left out";
 }
 
 TEST_F(ReportTest, UnwritableFilesAreRefused) {
@@ -166,17 +167,27 @@ TEST_F(ReportTest, ChartsExportAsPngAndSvg) {
 }
 
 #ifdef ARBOLEX_CLI_PATH
-TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
-    ASSERT_TRUE(copyShippedData(dir.path()));
-    const QString script = path(QStringLiteral("rotation.txt"));
-    QFile file(script);
-    ASSERT_TRUE(file.open(QIODevice::WriteOnly));
-    file.write("model 0\nset txtFromA 15\nset txtFromN 2500\nset txtFromH 7\n"
-               "set txtFromB 20\nset txtNetArea 10\nset txtToA 60\nset txtByA 5\n"
-               "press cmdGrow\nanswer yes\npress cmdFinalCut\n");
-    file.close();
-    const QString pdf = path(QStringLiteral("cli.pdf"));
-    const auto run = [&](const QStringList &arguments) {
+/// The Sitka spruce rotation of closeRotation() as a script of the runner.
+constexpr char kRotationScript[] =
+    "model 0\nset txtFromA 15\nset txtFromN 2500\nset txtFromH 7\n"
+    "set txtFromB 20\nset txtNetArea 10\nset txtToA 60\nset txtByA 5\n"
+    "press cmdGrow\nanswer yes\npress cmdFinalCut\n";
+
+class ReportCommandTest : public ReportTest {
+protected:
+    ReportCommandTest() { EXPECT_TRUE(copyShippedData(dir.path())); }
+
+    QString writeScript(const QString &name, const QByteArray &lines) const {
+        const QString script = path(name);
+        QFile file(script);
+        EXPECT_TRUE(file.open(QIODevice::WriteOnly));
+        file.write(lines);
+        return script;
+    }
+
+    /// `arbolex-cli report ARGUMENTS` on the test's data folder: its exit
+    /// status and standard output.
+    std::pair<int, QString> run(const QStringList &arguments) const {
         QProcess process;
         QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
         environment.remove(QStringLiteral("QT_QPA_PLATFORM")); // it must not need a screen
@@ -184,13 +195,32 @@ TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
         process.start(QStringLiteral(ARBOLEX_CLI_PATH),
                       QStringList{QStringLiteral("report")} + arguments +
                           QStringList{QStringLiteral("--data-dir"), dir.path()});
-        EXPECT_TRUE(process.waitForFinished(60000));
+        EXPECT_TRUE(process.waitForFinished(120000));
         return std::pair{process.exitCode(), QString::fromUtf8(process.readAllStandardOutput())};
-    };
+    }
+};
+
+/// The text of pages `first` to `last` of a PDF, through poppler's pdftotext;
+/// empty without it.
+QString pdfText(const QString &pdf, int first, int last) {
+    const QString tool = QStandardPaths::findExecutable(QStringLiteral("pdftotext"));
+    if (tool.isEmpty()) {
+        return {};
+    }
+    QProcess process;
+    process.start(tool, {QStringLiteral("-f"), QString::number(first), QStringLiteral("-l"),
+                         QString::number(last), pdf, QStringLiteral("-")});
+    process.waitForFinished(60000);
+    return QString::fromUtf8(process.readAllStandardOutput());
+}
+
+TEST_F(ReportCommandTest, CommandLineWritesTheSamePdfWithoutAScreen) {
+    const QString script = writeScript(QStringLiteral("rotation.txt"), kRotationScript);
+    const QString pdf = path(QStringLiteral("cli.pdf"));
     const auto [status, out] =
         run({QStringLiteral("--script"), script, QStringLiteral("--out"), pdf});
     ASSERT_EQ(status, 0) << out.toStdString();
-    EXPECT_GE(pdfPages(pdf), 5) << "text, three charts and the economics page";
+    EXPECT_GE(pdfPages(pdf), 4);
     EXPECT_EQ(out, pdf + QStringLiteral("\t%1 pages\n").arg(pdfPages(pdf)));
 
     // A sub-compartment saved by the windows, with its identification.
@@ -205,8 +235,7 @@ TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
         << reason.toStdString();
     EXPECT_EQ(charts::reportContent(work).forest, QStringLiteral("Kilbrack"));
     EXPECT_EQ(run({saved, QStringLiteral("--out"), pdf}).first, 0);
-    EXPECT_EQ(pdfPages(pdf), 4)
-        << "text, stand, increments and the economics of the economic rotation: no cash flow yet";
+    EXPECT_EQ(pdfPages(pdf), 3) << "text, stand and increments: no cash flow yet";
 
     EXPECT_EQ(run({QStringLiteral("--script"), script}).first, 2) << "no --out";
     EXPECT_EQ(run({saved, QStringLiteral("--script"), script, QStringLiteral("--out"), pdf}).first,
@@ -217,6 +246,42 @@ TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
                    QStringLiteral("--out"), pdf})
                   .first,
               2);
+}
+
+TEST_F(ReportCommandTest, ScriptThatValuedTheRotationAddsTheEconomicsPage) {
+    if (QStandardPaths::findExecutable(QStringLiteral("pdftotext")).isEmpty()) {
+        GTEST_SKIP() << "no pdftotext (poppler-utils) to read the pages";
+    }
+    const QString plain = path(QStringLiteral("plain.pdf"));
+    const QString valued = path(QStringLiteral("valued.pdf"));
+    ASSERT_EQ(
+        run({QStringLiteral("--script"), writeScript(QStringLiteral("plain.txt"), kRotationScript),
+             QStringLiteral("--out"), plain})
+            .first,
+        0);
+    const QByteArray economics = QByteArray(kRotationScript) +
+                                 "press cmdEconomics\n"
+                                 "set frmEconomics.txtInterestRate 3.00\n"
+                                 "press frmEconomics.cmdCompute\n"
+                                 "press frmEconomics.cmdOptimise\n";
+    ASSERT_EQ(
+        run({QStringLiteral("--script"), writeScript(QStringLiteral("economics.txt"), economics),
+             QStringLiteral("--out"), valued})
+            .first,
+        0);
+    const int pages = pdfPages(valued);
+    ASSERT_EQ(pages, pdfPages(plain) + 1);
+    EXPECT_FALSE(pdfText(plain, 1, pdfPages(plain)).contains(QStringLiteral("Economics of")));
+    const QString last = pdfText(valued, pages, pages);
+    for (const QString &shown :
+         {QStringLiteral("Economics of the rotation at 3.00 % a year"),
+          QStringLiteral("Land expectation value"),
+          QStringLiteral("NPV, LEV and MAI by rotation age"),
+          QStringLiteral("regimes of the largest LEV at 3.00 % a year"),
+          economics::economicstext::regimeYours(), QStringLiteral("Page %1 of %1").arg(pages)}) {
+        EXPECT_TRUE(last.contains(shown)) << shown.toStdString() << " not in\n"
+                                          << last.toStdString();
+    }
 }
 #endif
 
