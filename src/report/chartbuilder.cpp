@@ -139,6 +139,8 @@ QValueAxis *valueAxis(const ChartAxis &a, ChartLook look) {
         axis->setTitleFont(sized(9));
         axis->setLabelsFont(sized(8));
         axis->setGridLineColor(QColor(0xdd, 0xdd, 0xdd));
+        // Years between the labelled ages: faint, or the plot turns grey on paper.
+        axis->setMinorGridLineColor(QColor(0xf0, 0xf0, 0xf0));
     }
     return axis;
 }
