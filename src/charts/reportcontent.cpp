@@ -1,8 +1,11 @@
 #include "charts/reportcontent.hpp"
 #include "work/worktexts.hpp"
 
+#include "charts/economicscharts.hpp"
 #include "charts/reportmessages.hpp"
 #include "charts/standcharts.hpp"
+#include "economics/economicsmessages.hpp"
+#include "economics/economicswindowlogic.hpp"
 #include "engine/grow.hpp"
 #include "shell/vbformat.hpp"
 #include "work/mdlnpv.hpp"
@@ -102,6 +105,34 @@ QString yieldClassText(const work::StandWork &work) {
     return work.felled() || yc > 0 ? QString::number(yc) : QString();
 }
 
+/// The economics window's figures as it shows them now.
+EconomicsPage economicsPage(economics::EconomicsWindowLogic &logic) {
+    namespace et = economics::economicstext;
+    using economics::EconomicsControl;
+    const economics::IEconomicsView &view = logic.view();
+    const QString rate = QLatin1Char(' ') + et::atRate(logic.rateText());
+    EconomicsPage page;
+    page.title = et::economicsCaption() + rate;
+    page.stand = view.text(EconomicsControl::lblStand);
+    page.regime = view.text(EconomicsControl::lblRegime);
+    page.money = view.text(EconomicsControl::lblRate);
+    for (const auto &[caption, label] : economics::valueFigures()) {
+        page.figures.emplace_back(caption, view.text(label));
+    }
+    page.rotations = rotationChart(logic.explorer(), et::panelRotations() + rate);
+    if (!logic.regimes().empty()) {
+        std::vector<QStringList> grid = logic.regimeGrid();
+        // Captions in two lines on screen run on in print.
+        for (QString &caption : grid.front()) {
+            caption.replace(QLatin1Char('\n'), QLatin1Char(' '));
+        }
+        page.regimesTitle = et::panelOptimiser() + rate;
+        page.regimes = fromGrid(std::move(grid), {});
+        page.regimesNote = view.text(EconomicsControl::lblOptimiser);
+    }
+    return page;
+}
+
 } // namespace
 
 RotationCharts rotationCharts(work::StandWork &work) {
@@ -138,6 +169,14 @@ ReportContent reportContent(work::StandWork &work) {
     content.standChart = standDevelopment(work.table());
     content.incrementChart = increments(work.table());
     content.cashFlowChart = cashFlowChart(computed.flow, computed.years);
+    return content;
+}
+
+ReportContent reportContent(work::StandWork &work, economics::EconomicsWindowLogic &economics) {
+    ReportContent content = reportContent(work);
+    if (economics.figuresOfTable()) {
+        content.economics = economicsPage(economics);
+    }
     return content;
 }
 

@@ -45,11 +45,11 @@ ChartSeries series(const QString &name, const QString &unit, int axis) {
 ChartData standDevelopment(const work::ProjectionTable &table) {
     ChartData chart;
     chart.title = text::titleStand();
-    chart.xTitle = text::axisAge();
+    chart.x.title = text::axisAge();
     chart.note = text::noteStand();
-    chart.axes = {{text::axisVolume(), false},
-                  {text::axisHeightBasalArea(), false},
-                  {text::axisStocking(), true}};
+    chart.axes = {{.title = text::axisVolume()},
+                  {.title = text::axisHeightBasalArea()},
+                  {.title = text::axisStocking(), .right = true}};
     ChartSeries height = series(text::seriesTopHeight(), QStringLiteral("m"), kAxisHeightBasalArea);
     ChartSeries stocking =
         series(text::seriesStocking(), QStringLiteral("stems/ha"), kAxisStocking);
@@ -95,8 +95,8 @@ ChartData standDevelopment(const work::ProjectionTable &table) {
 ChartData increments(const work::ProjectionTable &table) {
     ChartData chart;
     chart.title = text::titleIncrements();
-    chart.xTitle = text::axisAge();
-    chart.axes = {{text::axisIncrement(), false}};
+    chart.x.title = text::axisAge();
+    chart.axes = {{.title = text::axisIncrement()}};
     ChartSeries cai = series(text::seriesCai(), QStringLiteral("m³/ha/yr"), 0);
     ChartSeries mai = series(text::seriesMai(), QStringLiteral("m³/ha/yr"), 0);
     std::vector<double> maiValues;
@@ -131,10 +131,11 @@ ChartData increments(const work::ProjectionTable &table) {
 ChartData cashFlowChart(const work::CashFlow &computed, int years) {
     ChartData chart;
     chart.title = text::titleCashFlow();
-    chart.xTitle = text::axisYear();
+    chart.x.title = text::axisYear();
     // Two axes with their zeros level: the final cut's revenue would flatten
     // the discounted sums on a common axis.
-    chart.axes = {{text::axisCashFlow(), false}, {text::axisCumulative(), true}};
+    chart.axes = {{.title = text::axisCashFlow()},
+                  {.title = text::axisCumulative(), .right = true}};
     ChartSeries bars = series(text::seriesCashFlow(), text::unitMoney(), 0);
     bars.style = ChartSeries::Style::Bars;
     ChartSeries cumulative = series(text::seriesCumulative(), text::unitMoney(), 1);

@@ -244,6 +244,19 @@ void EconomicsWindowLogic::cmdCompute_Click() {
                  });
 }
 
+bool EconomicsWindowLogic::figuresOfTable() const {
+    if (!m_value) {
+        return false;
+    }
+    const auto stand = standFromTable(m_standWork.table(), m_standWork.grow().modelId());
+    if (!stand || !sameStand(*stand, m_stand)) {
+        return false;
+    }
+    const TableRegime now = regimeFromTable(m_standWork.table());
+    return now.ages == m_table.ages && now.volumes == m_table.volumes &&
+           now.finalCut == m_table.finalCut;
+}
+
 QString EconomicsWindowLogic::rateText() const {
     return percentText(m_economics.ratePercent);
 }

@@ -72,6 +72,10 @@ public:
 
     /// True once the figures of a rotation are shown.
     bool valued() const { return m_value.has_value(); }
+    /// True when the figures shown are those of the table as it stands: the
+    /// stand of its first row, its thinnings and its final cut are the ones
+    /// valued (the table may have changed since).
+    bool figuresOfTable() const;
     const rotation::Stand &stand() const { return m_stand; }
     const rotation::Regime &regime() const { return m_table.regime; }
     int rotationAge() const { return m_rotation; }

@@ -70,8 +70,8 @@ struct Job {
     QString failure;
 };
 
-ForecastChart chartOf(const estate::Forecast &forecast, int firstYear) {
-    ForecastChart chart;
+charts::HarvestForecast chartOf(const estate::Forecast &forecast, int firstYear) {
+    charts::HarvestForecast chart;
     const std::vector<estate::Forecast::Line> lines = forecast.lines(firstYear);
     for (const estate::Forecast::Line &line : lines) {
         const QString species = QString::fromStdString(line.species);

@@ -49,6 +49,7 @@ Desktop::Desktop(const QString &dataFolder, const QString &programFolder,
     m_assortWindow.attach(s.assort());
     m_assortUserWindow.attach(s.assortUser());
     m_economicsWindow.attach(s.economics());
+    m_window.reportMenu()->attachEconomics(s.economics());
     m_assortPricesWindow.attach(s.assortPrices());
     m_estateWindow.attach(s.estate());
     // The charts beside the table follow the cash flow typed in its window.

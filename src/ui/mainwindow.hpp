@@ -105,8 +105,6 @@ private:
     void buildSummaryGrid();
     /// Reads the summary again and sizes its columns to captions and values.
     void fitSummary();
-    /// Connects a command button to its handler of the logic.
-    void onClick(workflow::MainControl control, void (workflow::MainWindowLogic::*handler)());
     QLineEdit *addField(workflow::MainControl control);
     QLabel *addResult(workflow::MainControl control);
     QPushButton *addButton(workflow::MainControl control, const QString &caption);

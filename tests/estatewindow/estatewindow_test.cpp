@@ -112,7 +112,7 @@ TEST_F(EstateWindowTest, RowsAndForecastAreTheCommandLinesAndTheInputIsOnlyRead)
     // The chart's bars are the forecast's lines by species.
     const auto forecast =
         estateio::readTable(QDir(out).filePath(QStringLiteral("forecast.csv")).toStdString());
-    const estatewindow::ForecastChart &chart = estateLogic.forecast();
+    const charts::HarvestForecast &chart = estateLogic.forecast();
     ASSERT_FALSE(chart.empty());
     std::map<std::pair<int, QString>, double> cliBars;
     for (const auto &line : forecast) {

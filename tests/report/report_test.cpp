@@ -5,6 +5,8 @@
 
 #include "charts/reportcontent.hpp"
 #include "document/documentwriter.hpp"
+#include "economics/economicsmessages.hpp"
+#include "economics/economicswindowlogic.hpp"
 #include "prices/pricedata.hpp"
 #include "report/chartexport.hpp"
 #include "report/reportwriter.hpp"
@@ -13,6 +15,7 @@
 #include <QImage>
 #include <QProcess>
 #include <QRegularExpression>
+#include <QStandardPaths>
 
 namespace arbolex::testing {
 namespace {
@@ -91,6 +94,51 @@ TEST_F(ReportTest, PdfHoldsTheTextPagesThenOnePagePerChart) {
     EXPECT_EQ(youngPages, 3) << "one page of text, stand and increments";
 }
 
+TEST_F(ReportTest, EconomicsPageOnlyWhileTheEconomicsWindowShowsTheTablesFigures) {
+    closeRotation();
+    economics::EconomicsWindowLogic &economics = session.economics();
+    const QString pdf = path(QStringLiteral("economics.pdf"));
+    const int plainPages = report::writeReportPdf(charts::reportContent(work), pdf, QString());
+    EXPECT_FALSE(charts::reportContent(work, economics).economics)
+        << "the economics window never valued the rotation";
+
+    economics.cmdEconomics_Click();
+    charts::ReportContent content = charts::reportContent(work, economics);
+    ASSERT_TRUE(content.economics.has_value());
+    const charts::EconomicsPage &page = *content.economics;
+    EXPECT_EQ(page.title, QStringLiteral("Economics of the rotation at 5.00 % a year"));
+    // The figures as the window shows them, in its order.
+    ASSERT_EQ(page.figures.size(), 11U);
+    EXPECT_EQ(page.figures.front().first, economics::economicstext::figureNpv());
+    EXPECT_EQ(page.figures.front().second, economicsView.text(economics::EconomicsControl::lblNPV));
+    EXPECT_EQ(page.figures.back().second,
+              economicsView.text(economics::EconomicsControl::lblYieldClass));
+    EXPECT_FALSE(page.rotations.empty());
+    EXPECT_TRUE(page.regimes.empty()) << "the optimiser has not run";
+
+    // The optimiser's regimes, then the user's own; captions on one line.
+    economics.cmdOptimise_Click();
+    content = charts::reportContent(work, economics);
+    ASSERT_TRUE(content.economics.has_value());
+    const charts::ReportTable &regimes = content.economics->regimes;
+    ASSERT_EQ(regimes.rows.size(), economics.regimes().size() + 1);
+    EXPECT_EQ(regimes.rows.back().first(), economics::economicstext::regimeYours());
+    for (const QString &caption : regimes.captions) {
+        EXPECT_FALSE(caption.contains(u'\n')) << caption.toStdString();
+    }
+    EXPECT_EQ(report::writeReportPdf(content, pdf, QString()), plainPages + 1);
+    EXPECT_EQ(pdfPages(pdf), plainPages + 1);
+
+    // A table changed since is not the one valued: no page until Compute.
+    work.removeRowsFrom(logic.table().lastRow());
+    EXPECT_FALSE(charts::reportContent(work, economics).economics);
+    economics.cmdCompute_Click();
+    EXPECT_TRUE(charts::reportContent(work, economics).economics);
+    logic.ClearAll();
+    EXPECT_FALSE(charts::reportContent(work, economics).economics);
+    EXPECT_TRUE(interactive.messages.isEmpty());
+}
+
 TEST_F(ReportTest, UnwritableFilesAreRefused) {
     closeRotation();
     const charts::ReportContent content = charts::reportContent(work);
@@ -119,17 +167,27 @@ TEST_F(ReportTest, ChartsExportAsPngAndSvg) {
 }
 
 #ifdef ARBOLEX_CLI_PATH
-TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
-    ASSERT_TRUE(copyShippedData(dir.path()));
-    const QString script = path(QStringLiteral("rotation.txt"));
-    QFile file(script);
-    ASSERT_TRUE(file.open(QIODevice::WriteOnly));
-    file.write("model 0\nset txtFromA 15\nset txtFromN 2500\nset txtFromH 7\n"
-               "set txtFromB 20\nset txtNetArea 10\nset txtToA 60\nset txtByA 5\n"
-               "press cmdGrow\nanswer yes\npress cmdFinalCut\n");
-    file.close();
-    const QString pdf = path(QStringLiteral("cli.pdf"));
-    const auto run = [&](const QStringList &arguments) {
+/// The Sitka spruce rotation of closeRotation() as a script of the runner.
+constexpr char kRotationScript[] =
+    "model 0\nset txtFromA 15\nset txtFromN 2500\nset txtFromH 7\n"
+    "set txtFromB 20\nset txtNetArea 10\nset txtToA 60\nset txtByA 5\n"
+    "press cmdGrow\nanswer yes\npress cmdFinalCut\n";
+
+class ReportCommandTest : public ReportTest {
+protected:
+    ReportCommandTest() { EXPECT_TRUE(copyShippedData(dir.path())); }
+
+    QString writeScript(const QString &name, const QByteArray &lines) const {
+        const QString script = path(name);
+        QFile file(script);
+        EXPECT_TRUE(file.open(QIODevice::WriteOnly));
+        file.write(lines);
+        return script;
+    }
+
+    /// `arbolex-cli report ARGUMENTS` on the test's data folder: its exit
+    /// status and standard output.
+    std::pair<int, QString> run(const QStringList &arguments) const {
         QProcess process;
         QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
         environment.remove(QStringLiteral("QT_QPA_PLATFORM")); // it must not need a screen
@@ -137,9 +195,28 @@ TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
         process.start(QStringLiteral(ARBOLEX_CLI_PATH),
                       QStringList{QStringLiteral("report")} + arguments +
                           QStringList{QStringLiteral("--data-dir"), dir.path()});
-        EXPECT_TRUE(process.waitForFinished(60000));
+        EXPECT_TRUE(process.waitForFinished(120000));
         return std::pair{process.exitCode(), QString::fromUtf8(process.readAllStandardOutput())};
-    };
+    }
+};
+
+/// The text of pages `first` to `last` of a PDF, through poppler's pdftotext;
+/// empty without it.
+QString pdfText(const QString &pdf, int first, int last) {
+    const QString tool = QStandardPaths::findExecutable(QStringLiteral("pdftotext"));
+    if (tool.isEmpty()) {
+        return {};
+    }
+    QProcess process;
+    process.start(tool, {QStringLiteral("-f"), QString::number(first), QStringLiteral("-l"),
+                         QString::number(last), pdf, QStringLiteral("-")});
+    process.waitForFinished(60000);
+    return QString::fromUtf8(process.readAllStandardOutput());
+}
+
+TEST_F(ReportCommandTest, CommandLineWritesTheSamePdfWithoutAScreen) {
+    const QString script = writeScript(QStringLiteral("rotation.txt"), kRotationScript);
+    const QString pdf = path(QStringLiteral("cli.pdf"));
     const auto [status, out] =
         run({QStringLiteral("--script"), script, QStringLiteral("--out"), pdf});
     ASSERT_EQ(status, 0) << out.toStdString();
@@ -169,6 +246,42 @@ TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
                    QStringLiteral("--out"), pdf})
                   .first,
               2);
+}
+
+TEST_F(ReportCommandTest, ScriptThatValuedTheRotationAddsTheEconomicsPage) {
+    if (QStandardPaths::findExecutable(QStringLiteral("pdftotext")).isEmpty()) {
+        GTEST_SKIP() << "no pdftotext (poppler-utils) to read the pages";
+    }
+    const QString plain = path(QStringLiteral("plain.pdf"));
+    const QString valued = path(QStringLiteral("valued.pdf"));
+    ASSERT_EQ(
+        run({QStringLiteral("--script"), writeScript(QStringLiteral("plain.txt"), kRotationScript),
+             QStringLiteral("--out"), plain})
+            .first,
+        0);
+    const QByteArray economics = QByteArray(kRotationScript) +
+                                 "press cmdEconomics\n"
+                                 "set frmEconomics.txtInterestRate 3.00\n"
+                                 "press frmEconomics.cmdCompute\n"
+                                 "press frmEconomics.cmdOptimise\n";
+    ASSERT_EQ(
+        run({QStringLiteral("--script"), writeScript(QStringLiteral("economics.txt"), economics),
+             QStringLiteral("--out"), valued})
+            .first,
+        0);
+    const int pages = pdfPages(valued);
+    ASSERT_EQ(pages, pdfPages(plain) + 1);
+    EXPECT_FALSE(pdfText(plain, 1, pdfPages(plain)).contains(QStringLiteral("Economics of")));
+    const QString last = pdfText(valued, pages, pages);
+    for (const QString &shown :
+         {QStringLiteral("Economics of the rotation at 3.00 % a year"),
+          QStringLiteral("Land expectation value"),
+          QStringLiteral("NPV, LEV and MAI by rotation age"),
+          QStringLiteral("regimes of the largest LEV at 3.00 % a year"),
+          economics::economicstext::regimeYours(), QStringLiteral("Page %1 of %1").arg(pages)}) {
+        EXPECT_TRUE(last.contains(shown)) << shown.toStdString() << " not in\n"
+                                          << last.toStdString();
+    }
 }
 #endif
 

@@ -1,6 +1,6 @@
 // The main window wired to its logic: typing in the fields, leaving them, the
-// grow and clear commands through their buttons, the grid and its selection,
-// the model menu and closing the window.
+// grow and clear commands through their buttons, the other commands of the
+// panel, the grid and its selection, the model menu and closing the window.
 #include "guifixture.hpp"
 #include "work/worktexts.hpp"
 
@@ -135,6 +135,40 @@ TEST_F(MainWindowGuiTest, ClearAllAndClearSwitchTheHeaderLayout) {
     click(window.control(MainControl::cmdClear));
     EXPECT_EQ(model.columnCount(), work::kColumnCount);
     EXPECT_EQ(model.headerData(13, Qt::Horizontal).toString(), QStringLiteral(" \u20ac / ha"));
+}
+
+TEST_F(MainWindowGuiTest, EveryCommandButtonRunsItsOwnHandler) {
+    window.show();
+    field(MainControl::txtToA)->setText(QStringLiteral("60"));
+    click(window.control(MainControl::cmdGrow));
+    click(window.control(MainControl::cmdThin));
+    EXPECT_TRUE(desktop.thinWindow().isVisible());
+    desktop.thinWindow().reject();
+    click(window.control(MainControl::cmdAssort));
+    EXPECT_TRUE(desktop.assortWindow().isVisible());
+    desktop.assortWindow().hide();
+    click(window.control(MainControl::cmdShowTimberPrice));
+    EXPECT_TRUE(desktop.pricesWindow().isVisible());
+    desktop.pricesWindow().reject();
+
+    // Final Cut, its net present value accepted: NPV… opens the cash flow.
+    click(window.control(MainControl::cmdFinalCut));
+    EXPECT_TRUE(logic.table().row(logic.table().lastRow()).finalCut);
+    ASSERT_TRUE(window.control(MainControl::cmdNPV)->isEnabled());
+    click(window.control(MainControl::cmdNPV));
+    EXPECT_TRUE(desktop.npvWindow().isVisible());
+
+    click(window.control(MainControl::cmdSummary));
+    EXPECT_TRUE(logic.showingSummary());
+    click(window.control(MainControl::cmdSummary));
+    EXPECT_FALSE(logic.showingSummary());
+
+    // Delete Rows asks first; No keeps the rows.
+    const int rows = logic.table().lastRow();
+    interactive.answers = {false};
+    click(window.control(MainControl::cmdDeleteRows));
+    EXPECT_EQ(interactive.questions.size(), 2) << "the NPV question, then this one";
+    EXPECT_EQ(logic.table().lastRow(), rows);
 }
 
 TEST_F(MainWindowGuiTest, ModelMenuListsTheCatalogueAndSwitchesTheModel) {
