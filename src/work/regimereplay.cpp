@@ -65,6 +65,8 @@ std::optional<QString> replayRegime(StandWork &work, const rotation::Stand &stan
             ++nextThinning;
         }
     }
+    // The site index of the last grow: each grow reads it from its stand.
+    work.showSiteIndex(true);
     if (work.grow().isThinnedModel()) {
         // The grow command of a thinned model leaves its last stand in the fields.
         work.copyRowToFields(work.lastStandRow());

@@ -64,6 +64,10 @@ void StandWork::setSiteIndexText(const QString &text) {
     emit changed();
 }
 
+void StandWork::showSiteIndex(bool known) {
+    setSiteIndexText(known ? shell::formatNumber(m_grow.siteIndex(), u"#.0") : QString());
+}
+
 void StandWork::SetGrowFrom(float age, float basalArea, float stocking, float topHeight,
                             float targetAge, float step) {
     using shell::formatNumber;

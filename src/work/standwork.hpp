@@ -68,6 +68,9 @@ public:
     /// The site index as `lblSI` shows it.
     const QString &siteIndexText() const { return m_siteIndexText; }
     void setSiteIndexText(const QString &text);
+    /// Shows the engine's site index (to a tenth) when `known`, else nothing,
+    /// as the grow command and the stand's fields leave it.
+    void showSiteIndex(bool known);
 
     /// SetGrowFrom: writes the grow-from fields in their display formats, the
     /// age only forward and each value only when it is above 0 (the step when

@@ -88,7 +88,7 @@ void GrowFromPanel::showSiteIndex(float age, float topHeight) {
 }
 
 void GrowFromPanel::showSiteIndex(bool known) {
-    m_work.setSiteIndexText(known ? formatNumber(m_grow.siteIndex(), u"#.0") : QString());
+    m_work.showSiteIndex(known);
 }
 
 void GrowFromPanel::txtFromA_LostFocus() {

@@ -229,6 +229,8 @@ TEST_F(EstateWindowTest, AnOpenedRowIsItsRegimeTypedByHandAsANewUnsavedDocument)
     logic.cmdFinalCut_Click();
     ASSERT_TRUE(work.felled());
     const auto byHand = tableCells();
+    const QString siteIndexByHand = work.siteIndexText();
+    ASSERT_FALSE(siteIndexByHand.isEmpty());
 
     // Unsaved work: the question, and Cancel keeps it.
     const auto asked = interactive.questions.size();
@@ -240,6 +242,7 @@ TEST_F(EstateWindowTest, AnOpenedRowIsItsRegimeTypedByHandAsANewUnsavedDocument)
     estateLogic.openSubCompartment(row);
     EXPECT_TRUE(interactive.messages.isEmpty());
     EXPECT_EQ(tableCells(), byHand);
+    EXPECT_EQ(work.siteIndexText(), siteIndexByHand);
     EXPECT_TRUE(work.felled());
     EXPECT_EQ(work.identification().subCompartment, QStringLiteral("GL-01"));
     EXPECT_TRUE(documents.path().isEmpty());
