@@ -2,6 +2,7 @@
 // boxes, the price commands, the summary and putting back a whole work.
 #include "engine/grow.hpp"
 #include "prices/assortmentpricefile.hpp"
+#include "prices/costfile.hpp"
 #include "prices/pricedata.hpp"
 #include "prices/prices.hpp"
 #include "shell/apperror.hpp"
@@ -24,10 +25,12 @@ namespace arbolex::workflow {
 
 namespace {
 
-/// The price lists, categories and assortment prices from the data folder.
+/// The price lists, categories, assortment prices and default costs from the
+/// data folder.
 void readPriceFiles(const QString &dataFolder, prices::Prices &prices, shell::ErrorLog &log) {
     prices::GetPricesFromFiles(dataFolder, prices.data(), log);
     prices::GetAssortmentPricesFromFile(dataFolder, prices.data(), log);
+    prices::GetCostsFromFile(dataFolder, prices.data(), log);
 }
 
 } // namespace
@@ -50,6 +53,8 @@ void MainWindowLogic::Form_Load(QSettings &settings, const QRect &screen) {
         m_fields.showSiteIndex(stored.age, stored.topHeight);
         readPriceFiles(m_dataFolder, prices(), errorLog());
         prices().selectPriceSet(prices::kCurrentPrices);
+        // The work starts with the data folder's costs.
+        m_work.resetCosts();
         showSummary(false);
         m_view.setText(MainControl::cmdShowTimberPrice, text::showTimberPrices());
     });
