@@ -122,6 +122,10 @@ TEST_F(DocumentTest, CostsAreSavedAndAnOlderFileOpensWithTheDefaults) {
     EXPECT_EQ(opened.establishmentCost, 3045.0);
     EXPECT_EQ(opened.annualCost, 0.0);
     EXPECT_FALSE(third->session.session().documents().isModified());
+    // Its figures: the stand today is worth what its cash flow says.
+    third->run(QStringLiteral("press cmdNPV\npress frmNPV.cmdNPV\npress cmdEconomics"));
+    ASSERT_TRUE(third->session.economics().valued());
+    EXPECT_EQ(*third->session.economics().value()->npv, third->session.work().cashFlow().SumNPV());
 }
 
 TEST_F(DocumentTest, ANumberJsonCannotHoldComesBack) {
