@@ -2,6 +2,7 @@
 
 #include "cli/command.hpp"
 #include "prices/assortmentpricefile.hpp"
+#include "prices/costfile.hpp"
 #include "prices/prices.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/settings.hpp"
@@ -80,15 +81,32 @@ void recordPriceFiles(RunRecord &run, const QString &dataFolder) {
 }
 
 double cost(const Options &options, const char *name) {
-    if (!options.has(name)) {
-        return 0.0;
-    }
     const double c = options.number(name);
     if (c < 0.0) {
         throw UsageError{QStringLiteral("--") + QLatin1String(name) +
                          QStringLiteral(" must not be negative")};
     }
     return c;
+}
+
+/// --establishment-cost and --annual-cost, each the data folder's cost file's
+/// without its option. The file is read whenever it is there, so that the run
+/// record lists it however the costs were given; a file that is refused stops
+/// the command when a cost is taken from it, and without a file the costs are
+/// 0, as the program starts without it. True when the file is there.
+bool readCosts(const Options &options, const QString &dataFolder, rotation::Economics &economics) {
+    const prices::CostsReading read =
+        prices::readCosts(QDir(dataFolder).filePath(QLatin1String(prices::kCostsFile)));
+    const bool establishmentGiven = options.has("establishment-cost");
+    const bool annualGiven = options.has("annual-cost");
+    if (!read.costs && !read.missing && !(establishmentGiven && annualGiven)) {
+        throw UsageError{QStringLiteral("costs ") + read.fault};
+    }
+    const prices::CostDefaults costs = read.costs.value_or(prices::CostDefaults{});
+    economics.establishmentCost =
+        establishmentGiven ? cost(options, "establishment-cost") : costs.establishment;
+    economics.annualCost = annualGiven ? cost(options, "annual-cost") : costs.annual;
+    return !read.missing;
 }
 
 /// --valuation and --assortment-prices: how harvests are valued, and with
@@ -167,8 +185,10 @@ QString economicsOptionsHelp() {
            QString::number(shell::kDefaultInterestRate) +
            QStringLiteral(
                ")\n"
-               "  --establishment-cost C    cost at age 0, euro/ha (default 0)\n"
-               "  --annual-cost C           cost of every year, euro/ha (default 0)\n"
+               "  --establishment-cost C    cost at age 0, euro/ha (default: Costs.qdm of\n"
+               "                            the data folder)\n"
+               "  --annual-cost C           cost of every year, euro/ha (default: Costs.qdm\n"
+               "                            of the data folder)\n"
                "  --prices current|user|longterm|private\n"
                "                            price list (default longterm: the long-term\n"
                "                            average prices the net present value uses)\n"
@@ -201,8 +221,7 @@ rotation::Economics readEconomics(const Options &options, const QString &dataFol
         throw UsageError{
             QStringLiteral("--rate must be above 0: the land expectation value needs interest")};
     }
-    economics.establishmentCost = cost(options, "establishment-cost");
-    economics.annualCost = cost(options, "annual-cost");
+    const bool costsFile = readCosts(options, dataFolder, economics);
     prices::PriceSet set = prices::kLongTermPrices;
     if (options.has("prices")) {
         const QString word = options.text("prices");
@@ -224,6 +243,10 @@ rotation::Economics readEconomics(const Options &options, const QString &dataFol
                 {QStringLiteral("annual_cost"), Value::exact(economics.annualCost)},
                 {QStringLiteral("prices"), Value::word(QLatin1String(priceListWord(set)))}});
     recordPriceFiles(run, dataFolder);
+    if (costsFile) {
+        run.fileRead(QLatin1String(prices::kCostsFile),
+                     QDir(dataFolder).filePath(QLatin1String(prices::kCostsFile)));
+    }
     readValuation(options, dataFolder, economics, run);
     run.insert(QStringLiteral("prices_used"), pricesUsed(economics, set));
     return economics;

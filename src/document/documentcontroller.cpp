@@ -112,6 +112,9 @@ Document DocumentController::emptyWork() const {
     empty.standingVolume = 0.0;
     empty.felled = false;
     empty.cashFlow.clear();
+    // A new sub-compartment starts with the data folder's costs.
+    empty.establishmentCost = m_work.defaultEstablishmentCost();
+    empty.annualCost = m_work.defaultAnnualCost();
     return empty;
 }
 

@@ -11,6 +11,7 @@
 
 #include <cmath>
 #include <limits>
+#include <optional>
 
 namespace arbolex::document {
 
@@ -36,6 +37,8 @@ constexpr double kMaxBasalArea = 1000.0;
 constexpr double kMaxVolume = 100000.0;
 constexpr double kMaxInterestRate = 1000.0;
 constexpr double kMaxPrice = 1.0e6;
+/// Highest establishment or yearly cost, euro/ha.
+constexpr double kMaxCost = 1.0e6;
 
 /// Why a document was refused; thrown only inside this file.
 struct Refused {
@@ -78,6 +81,15 @@ public:
                            QStringLiteral(" characters"));
         }
         return v.toString();
+    }
+
+    /// A number in [low, high] when the field is there; std::nullopt when it
+    /// is not (a field a document of an older version does not have).
+    std::optional<double> optionalNumber(const char *key, double low, double high) const {
+        if (!m_object.contains(name(key))) {
+            return std::nullopt;
+        }
+        return number(key, low, high);
     }
 
     bool boolean(const char *key) const {
@@ -289,6 +301,9 @@ void readCashFlow(const ObjectReader &top, Document &d) {
     const ObjectReader r(top.object(key::cashFlow), QStringLiteral("the cash flow"));
     d.interestRate = r.number(key::interestRate, 0.0, kMaxInterestRate);
     d.cashFlowFirstYear = r.integer(key::firstYear, 0, std::numeric_limits<std::int16_t>::max());
+    // Written since version 2; without them the work takes the default costs.
+    d.establishmentCost = r.optionalNumber(key::establishmentCost, 0.0, kMaxCost);
+    d.annualCost = r.optionalNumber(key::annualCost, 0.0, kMaxCost);
     const QJsonArray years = r.array(key::years, 0, kMaxCashFlowYears);
     if (!years.isEmpty() && !d.felled) {
         r.wrong(key::years, QStringLiteral("are laid out before the final cut"));

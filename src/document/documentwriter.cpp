@@ -86,9 +86,16 @@ QJsonObject cashFlowJson(const Document &d) {
                                  {name(key::cashFlowValue), number(y.cashFlow)},
                                  {name(key::discountedCashFlow), number(y.discountedCashFlow)}});
     }
-    return {{name(key::interestRate), number(d.interestRate)},
-            {name(key::firstYear), d.cashFlowFirstYear},
-            {name(key::years), years}};
+    QJsonObject cashFlow{{name(key::interestRate), number(d.interestRate)},
+                         {name(key::firstYear), d.cashFlowFirstYear},
+                         {name(key::years), years}};
+    if (d.establishmentCost) {
+        cashFlow.insert(name(key::establishmentCost), number(*d.establishmentCost));
+    }
+    if (d.annualCost) {
+        cashFlow.insert(name(key::annualCost), number(*d.annualCost));
+    }
+    return cashFlow;
 }
 
 } // namespace

@@ -34,6 +34,9 @@ Document documentForStand(const work::StandWork &work, const rotation::Stand &st
     d.cashFlow.clear();
     d.siteIndex = 0.0f;
     d.siteIndexText.clear();
+    // A new sub-compartment: the data folder's costs, as the estate counts them.
+    d.establishmentCost = work.defaultEstablishmentCost();
+    d.annualCost = work.defaultAnnualCost();
     // The fields as SetGrowFrom writes them.
     d.fields = {shell::formatNumber(stand.age, u"##0"),
                 shell::formatNumber(stand.stocking, u"#####0"),

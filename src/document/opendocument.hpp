@@ -30,7 +30,8 @@ bool openDocumentInto(const QString &path, workflow::IMainCommands &main, QStrin
 
 /// A new document for `stand` under `id`: the model and the grow-from fields
 /// of the stand as the window formats them, target age, step and net area,
-/// an empty table, and the prices and interest rate that `work` uses now.
+/// an empty table, the prices and interest rate that `work` uses now, and the
+/// data folder's costs.
 /// Put it back into a window (IMainCommands::restore), replay a regime, then
 /// take StandWork::snapshot() to have the grown document.
 Document documentForStand(const work::StandWork &work, const rotation::Stand &stand,

@@ -11,12 +11,15 @@
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
 #include "shell/vbtext.hpp"
+#include "work/incrementrows.hpp"
 #include "work/regimereplay.hpp"
 #include "work/standwork.hpp"
 #include "workflow/iworkwindows.hpp"
 
+#include <algorithm>
 #include <cmath>
 #include <exception>
+#include <limits>
 
 namespace arbolex::economics {
 
@@ -50,8 +53,48 @@ QString pricesText(const rotation::Economics &e) {
 
 bool sameMoney(const rotation::Economics &a, const rotation::Economics &b) {
     return a.ratePercent == b.ratePercent && a.establishmentCost == b.establishmentCost &&
-           a.annualCost == b.annualCost && a.prices == b.prices && a.valuation == b.valuation &&
-           a.assortmentPrices == b.assortmentPrices;
+           a.annualCost == b.annualCost && a.entries == b.entries && a.prices == b.prices &&
+           a.valuation == b.valuation && a.assortmentPrices == b.assortmentPrices;
+}
+
+/// What the cash flow typed into the net present value window adds, for the
+/// line of the money: "" when nothing.
+QString entriesText(const std::vector<rotation::CashFlowEntry> &entries) {
+    double costs = 0.0;
+    double revenues = 0.0;
+    for (const rotation::CashFlowEntry &e : entries) {
+        costs += e.cost;
+        revenues += e.otherRevenue;
+    }
+    QStringList parts;
+    if (costs != 0.0) {
+        parts << QStringLiteral("costs ") + euroText(costs) + QStringLiteral(" €/ha");
+    }
+    if (revenues != 0.0) {
+        parts << QStringLiteral("other revenues ") + euroText(revenues) + QStringLiteral(" €/ha");
+    }
+    return parts.isEmpty()
+               ? QString()
+               : QStringLiteral(" · the cash flow's ") + parts.join(QStringLiteral(" and "));
+}
+
+/// A cost as its field shows it.
+QString costText(double euro) {
+    return shell::generalNumber(euro);
+}
+
+/// The rotation of the table valued, as the optimiser scores a candidate.
+rotation::Candidate candidateOf(const rotation::Regime &regime,
+                                const rotation::RotationValue &value) {
+    constexpr double kNone = -std::numeric_limits<double>::infinity();
+    rotation::Candidate c;
+    c.regime = regime;
+    c.rotation = value.rotation;
+    c.npv = value.npv.value_or(kNone);
+    c.lev = value.lev.value_or(kNone);
+    c.volume = value.mai * value.rotation;
+    c.score = c.lev;
+    return c;
 }
 
 QString irrText(const valuation::InternalRate &irr) {
@@ -93,7 +136,16 @@ std::optional<long long> wholeNumber(const QString &typed) {
 
 EconomicsWindowLogic::EconomicsWindowLogic(work::StandWork &work, workflow::IMainCommands &main,
                                            IEconomicsView &view, shell::IInteractive &interactive)
-    : m_standWork(work), m_main(main), m_view(view), m_interactive(interactive) {}
+    : m_standWork(work), m_main(main), m_view(view), m_interactive(interactive) {
+    // The costs are the work's: the fields follow it (a document opened, a
+    // new one begun).
+    QObject::connect(&work, &work::StandWork::costsChanged, [this] { showCosts(); });
+}
+
+void EconomicsWindowLogic::showCosts() {
+    m_view.setText(C::txtEstablishmentCost, costText(m_standWork.establishmentCost()));
+    m_view.setText(C::txtAnnualCost, costText(m_standWork.annualCost()));
+}
 
 void EconomicsWindowLogic::message(const QString &text, EconomicsControl focus) {
     m_interactive.message(economicstext::titleEconomics(), text, shell::kExclamation);
@@ -114,8 +166,7 @@ void EconomicsWindowLogic::Form_Load() {
                 m_view.setText(c, value);
             }
         };
-        fill(C::txtEstablishmentCost, QStringLiteral("0"));
-        fill(C::txtAnnualCost, QStringLiteral("0"));
+        showCosts();
         fill(C::txtDraws, QString::number(draws.draws));
         fill(C::txtSeed, QString::number(draws.seed));
         fill(C::txtPriceSpread, shell::generalNumber(draws.priceSpread * 100.0));
@@ -144,6 +195,8 @@ bool EconomicsWindowLogic::readEconomics() {
         }
         (c == C::txtEstablishmentCost ? e.establishmentCost : e.annualCost) = shell::val(typed);
     }
+    // The costs and other revenues typed into the net present value window.
+    e.entries = m_standWork.cashFlowEntries();
     // The cash flow's own prices: the long-term averages, as their absolute values.
     prices::Prices longTerm;
     longTerm.data() = m_standWork.prices().data();
@@ -157,8 +210,9 @@ bool EconomicsWindowLogic::readEconomics() {
         e.valuation = rotation::Valuation::kAssortments;
         e.assortmentPrices = m_standWork.prices().data().assortmentPrices;
     }
-    // One interest rate for the program: the cash flow's.
+    // One interest rate for the program: the cash flow's; the costs are the work's.
     m_standWork.cashFlow().setInterestRate(e.ratePercent);
+    m_standWork.setCosts(e.establishmentCost, e.annualCost);
     m_economics = e;
     return true;
 }
@@ -189,6 +243,7 @@ bool EconomicsWindowLogic::readStand() {
 
 void EconomicsWindowLogic::clearFigures(const QString &why) {
     m_path.reset();
+    m_own.reset();
     m_value.reset();
     m_yours.reset();
     m_explorer = {};
@@ -228,16 +283,12 @@ void EconomicsWindowLogic::cmdCompute_Click() {
                          return;
                      }
                      m_explorer = rotation::exploreRotations(*m_path, m_table.regime, m_economics);
-                     m_rotation = m_table.finalCut.value_or(m_explorer.economicRotation);
-                     if (const auto problem =
-                             rotation::rotationProblem(*m_path, m_table.regime, m_rotation)) {
-                         clearFigures(QString::fromStdString(*problem));
+                     m_own = harvestsFromTable(m_standWork.table(), m_path->volumeRatio);
+                     if (m_own) {
+                         valueTable();
+                     } else if (!valueEconomicRotation()) {
                          return;
                      }
-                     m_value = rotation::valueRotation(*m_path, m_rotation, m_economics);
-                     m_tornado = rotation::tornado(*m_path, m_rotation, m_economics);
-                     m_yours = rotation::scoreRotation(*m_path, m_table.regime, m_rotation,
-                                                       m_economics, rotation::Objective::kLev);
                      showFigures();
                      m_view.regimesChanged();
                      cmdMonteCarlo_Click();
@@ -257,6 +308,35 @@ bool EconomicsWindowLogic::figuresOfTable() const {
            now.finalCut == m_table.finalCut;
 }
 
+void EconomicsWindowLogic::valueTable() {
+    // The harvests as the table holds them: the figures of the stand today
+    // are the net present value window's.
+    m_rotation = m_own->rotation;
+    m_value = rotation::valueHarvests(*m_own, m_economics);
+    // The growth figures as the main window shows them.
+    std::vector<double> mai;
+    for (const int r : work::incrementRows(m_standWork.table())) {
+        mai.push_back(m_standWork.table().row(r).numbers[work::kNumMai]);
+    }
+    m_value->maxMai = mai.empty() ? 0.0 : *std::max_element(mai.begin(), mai.end());
+    m_value->yieldClass = m_standWork.yieldClass();
+    m_tornado = rotation::tornado(*m_own, m_economics);
+    m_yours = candidateOf(m_table.regime, *m_value);
+}
+
+bool EconomicsWindowLogic::valueEconomicRotation() {
+    m_rotation = m_explorer.economicRotation;
+    if (const auto problem = rotation::rotationProblem(*m_path, m_table.regime, m_rotation)) {
+        clearFigures(QString::fromStdString(*problem));
+        return false;
+    }
+    m_value = rotation::valueRotation(*m_path, m_rotation, m_economics);
+    m_tornado = rotation::tornado(*m_path, m_rotation, m_economics);
+    m_yours = rotation::scoreRotation(*m_path, m_table.regime, m_rotation, m_economics,
+                                      rotation::Objective::kLev);
+    return true;
+}
+
 QString EconomicsWindowLogic::rateText() const {
     return percentText(m_economics.ratePercent);
 }
@@ -271,11 +351,12 @@ void EconomicsWindowLogic::showFigures() {
                        quantityText(s.height, 1) + QStringLiteral(" m · basal area ") +
                        quantityText(s.basalArea, 1) + QStringLiteral(" m²/ha · site index ") +
                        quantityText(m_path->siteIndex, 1) + QStringLiteral(" m"));
-    QString regime = describeRegime(m_table.regime, m_rotation);
-    if (const QString note = irregularNote(m_table); !note.isEmpty()) {
+    QString regime =
+        m_own ? describeTableRotation(*m_own) : describeRegime(m_table.regime, m_rotation);
+    if (const QString note = irregularNote(m_table, !m_own); !note.isEmpty()) {
         regime += QLatin1Char(' ') + note;
     }
-    if (!m_table.finalCut) {
+    if (!m_own) {
         regime += QStringLiteral(" The table has no final cut: the economic rotation is valued.");
     }
     m_view.setText(C::lblRegime, regime);
@@ -283,7 +364,8 @@ void EconomicsWindowLogic::showFigures() {
                                    pricesText(m_economics) + QStringLiteral(" · establishment ") +
                                    euroText(m_economics.establishmentCost) +
                                    QStringLiteral(" €/ha · annual cost ") +
-                                   euroText(m_economics.annualCost) + QStringLiteral(" €/ha/yr"));
+                                   euroText(m_economics.annualCost) + QStringLiteral(" €/ha/yr") +
+                                   entriesText(m_economics.entries));
     m_view.setText(C::lblNPV, euroPerHaText(v.npv));
     m_view.setText(C::lblLEV, euroPerHaText(v.lev));
     m_view.setText(C::lblEAA, v.eaa ? euroText(*v.eaa) + QStringLiteral(" €/ha/yr")
@@ -293,8 +375,8 @@ void EconomicsWindowLogic::showFigures() {
     m_view.setText(C::lblBreakEven, breakEvenText(v.breakEvenPriceFactor));
     m_view.setText(C::lblRotation,
                    QString::number(m_rotation) +
-                       (m_table.finalCut ? QStringLiteral(" years (the final cut of the table)")
-                                         : QStringLiteral(" years (the economic rotation)")));
+                       (m_own ? QStringLiteral(" years (the final cut of the table)")
+                              : QStringLiteral(" years (the economic rotation)")));
     double largestMai = 0.0;
     std::optional<double> largestLev;
     for (const rotation::RotationRow &row : m_explorer.rows) {
@@ -363,7 +445,8 @@ void EconomicsWindowLogic::cmdMonteCarlo_Click() {
             }
             s.rateLow = shell::val(low);
             s.rateHigh = shell::val(high);
-            m_monteCarlo = rotation::monteCarlo(*m_path, m_rotation, m_economics, s);
+            m_monteCarlo = m_own ? rotation::monteCarlo(*m_own, m_economics, s)
+                                 : rotation::monteCarlo(*m_path, m_rotation, m_economics, s);
             const rotation::MonteCarloResult &r = *m_monteCarlo;
             m_view.setText(
                 C::lblMonteCarlo,
@@ -532,6 +615,9 @@ void EconomicsWindowLogic::cmdApply_Click(int rank) {
         applied.restore(m_standWork.snapshot());
         const auto failed =
             work::replayRegime(applied, m_stand, chosen.regime, chosen.rotation, m_interactive);
+        // What was typed into the cash flow stays, for the years the new
+        // rotation still has: the optimiser counted it so.
+        applied.cashFlow().copyTypedFrom(m_standWork.cashFlow());
         m_main.restore(applied.snapshot());
         if (failed) {
             m_interactive.message(economicstext::titleEconomics(),

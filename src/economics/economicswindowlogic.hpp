@@ -45,8 +45,11 @@ public:
     /// The window's load: the interest rate of the cash flow, the defaults of
     /// the draws, then the figures.
     void Form_Load();
-    /// "Compute": reads the rate and the costs, derives the stand, the regime
-    /// and the final cut from the table, and values them.
+    /// "Compute": reads the rate and the costs (they become the work's), and
+    /// values the rotation of the table: its own thinnings and final cut with
+    /// the costs and other revenues of its cash flow, or without a final cut
+    /// the regime of its thinnings felled at the economic rotation. The
+    /// explorer and the optimiser work from that regime.
     void cmdCompute_Click();
     /// "Optimise": searches the regimes away from the window's thread.
     void cmdOptimise_Click();
@@ -103,6 +106,13 @@ private:
     bool readStand();
     void showFigures();
     void clearFigures(const QString &why);
+    /// The costs of the work in their fields.
+    void showCosts();
+    /// Values the table's own rotation (m_own).
+    void valueTable();
+    /// Values the regime felled at the economic rotation; false (the figures
+    /// cleared) when that rotation cannot be valued.
+    bool valueEconomicRotation();
 
     work::StandWork &m_standWork;
     workflow::IMainCommands &m_main;
@@ -116,6 +126,9 @@ private:
     /// The engine of the figures; the optimiser grows with one of its own.
     engine::Grow m_grow;
     std::optional<rotation::GrowthPath> m_path;
+    /// The harvests of a felled table as it holds them; every figure but the
+    /// explorer's and the optimiser's values them.
+    std::optional<rotation::RotationHarvests> m_own;
     std::optional<rotation::RotationValue> m_value;
     rotation::RotationExplorer m_explorer;
     std::vector<rotation::TornadoBar> m_tornado;

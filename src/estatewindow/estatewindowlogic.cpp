@@ -117,6 +117,9 @@ estate::EstateDefaults EstateWindowLogic::defaults() const {
     longTerm.data() = m_standWork.prices().data();
     longTerm.selectPriceSet(prices::kLongTermPrices);
     d.economics.prices = longTerm.pricesInUse();
+    // Every sub-compartment at the data folder's costs, as arbolex-cli estate counts it.
+    d.economics.establishmentCost = m_standWork.defaultEstablishmentCost();
+    d.economics.annualCost = m_standWork.defaultAnnualCost();
     return d;
 }
 

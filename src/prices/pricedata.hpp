@@ -35,6 +35,17 @@ struct UserCategory {
 /// Number of user-defined assortment categories.
 inline constexpr int kUserCategoryCount = 5;
 
+/// What a rotation costs unless the work says otherwise, euro per ha
+/// ("Costs.qdm").
+struct CostDefaults {
+    /// Cost of establishing the crop, paid at planting (age 0).
+    double establishment = 0.0;
+    /// Cost of every year from age 1 to the final cut.
+    double annual = 0.0;
+
+    bool operator==(const CostDefaults &) const = default;
+};
+
 /// The price lists and user categories as read from the data folder.
 struct PriceData {
     /// State forestry company's prices of the last full calendar year ("CURPRIC.qdm").
@@ -51,6 +62,8 @@ struct PriceData {
     std::array<UserCategory, kUserCategoryCount> categories;
     /// Prices of the top-diameter classes 7-14, 14-20 and >20 cm ("AssortPrices.qdm").
     rotation::AssortmentPriceList assortmentPrices{};
+    /// Establishment and yearly cost a new work starts with ("Costs.qdm").
+    CostDefaults costs;
 };
 
 /// Data file names, joined to the data folder.
@@ -60,6 +73,8 @@ inline constexpr const char *kUserPricesFile = "USRPRIC.qdm";
 inline constexpr const char *kAveragePricesFile = "AvPRIC_npv.qdm";
 inline constexpr const char *kUserAssortmentsFile = "UD_Assort.qdm";
 inline constexpr const char *kAssortmentPricesFile = "AssortPrices.qdm";
+/// Read only: the program never writes it.
+inline constexpr const char *kCostsFile = "Costs.qdm";
 /// The files GetPricesFromFiles reads, in its order: it stops at the first
 /// one missing.
 inline constexpr const char *kFilesReadForPrices[] = {kCurrentPricesFile, kPrivatePricesFile,

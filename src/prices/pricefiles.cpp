@@ -1,6 +1,7 @@
 #include "prices/pricefiles.hpp"
 
 #include "prices/assortmentpricefile.hpp"
+#include "prices/costfile.hpp"
 #include "prices/pricedata.hpp"
 #include "prices/prices.hpp"
 #include "shell/apperror.hpp"
@@ -14,6 +15,7 @@ namespace arbolex::prices {
 void readPriceFiles(const QString &dataFolder, Prices &prices, shell::ErrorLog &log) {
     GetPricesFromFiles(dataFolder, prices.data(), log);
     GetAssortmentPricesFromFile(dataFolder, prices.data(), log);
+    GetCostsFromFile(dataFolder, prices.data(), log);
 }
 
 void rereadPriceFiles(const QString &dataFolder, Prices &prices, shell::ErrorLog &log) {

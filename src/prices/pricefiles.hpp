@@ -15,7 +15,8 @@ namespace arbolex::prices {
 
 class Prices;
 
-/// The price lists, categories and assortment prices from `dataFolder`.
+/// The price lists, categories, assortment prices and default costs from
+/// `dataFolder`.
 void readPriceFiles(const QString &dataFolder, Prices &prices, shell::ErrorLog &log);
 
 /// Forgets the prices and reads them from `dataFolder` again (after a file was

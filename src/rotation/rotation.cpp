@@ -53,25 +53,36 @@ double meanAnnualIncrement(const GrowthPath &path, int age) {
     return age > 0 ? (double{path.at(age).volume} + removedBefore(path, age)) / age : 0.0;
 }
 
-/// Cash flow by age 0..rotation and the harvests valued at `economics.prices`.
+/// Cash flow by age 0..rotation: timber revenue, other revenues, costs and
+/// their net.
 struct Flows {
     std::vector<double> revenue;
+    std::vector<double> other;
     std::vector<double> cost;
     std::vector<double> net;
 };
 
 Flows cashFlows(const std::vector<Harvest> &harvests, int rotation, const Economics &economics) {
     const auto years = static_cast<std::size_t>(rotation) + 1;
-    Flows f{std::vector<double>(years, 0.0), std::vector<double>(years, 0.0), {}};
+    Flows f{std::vector<double>(years, 0.0), std::vector<double>(years, 0.0),
+            std::vector<double>(years, 0.0), std::vector<double>(years, 0.0)};
     for (std::size_t a = 0; a < years; ++a) {
         f.cost[a] = a == 0 ? economics.establishmentCost : economics.annualCost;
+    }
+    // An entry counts in every rotation that reaches its age.
+    for (const CashFlowEntry &e : economics.entries) {
+        if (e.age >= 0 && e.age <= rotation) {
+            const auto a = static_cast<std::size_t>(e.age);
+            f.cost[a] += e.cost;
+            f.other[a] += e.otherRevenue;
+        }
     }
     for (const Harvest &h : harvests) {
         f.revenue[static_cast<std::size_t>(h.age)] += h.revenue;
     }
-    f.net.resize(years);
+    // Revenues first, then the costs, as the cash-flow window sums a year.
     for (std::size_t a = 0; a < years; ++a) {
-        f.net[a] = f.revenue[a] - f.cost[a];
+        f.net[a] = f.revenue[a] + f.other[a] - f.cost[a];
     }
     return f;
 }
@@ -97,10 +108,12 @@ Figures figures(const Flows &f, int presentAge, double ratePercent) {
 }
 
 /// Values `h` as `economics` says; valued by assortments, the harvest is
-/// first divided into its classes unless it was `divided` before.
-void price(Harvest &h, const GrowthPath &path, const Economics &economics, bool divided) {
+/// first divided into its classes by `volumeRatio` unless it was `divided`
+/// before.
+void price(Harvest &h, const engine::VolumeRatioCoefficients &volumeRatio,
+           const Economics &economics, bool divided) {
     if (economics.valuation == Valuation::kAssortments && !divided) {
-        h.assortments = divideHarvest(h.volume, h.basalArea, h.stocking, path.volumeRatio);
+        h.assortments = divideHarvest(h.volume, h.basalArea, h.stocking, volumeRatio);
     }
     h.revenue = harvestRevenue(h, economics);
 }
@@ -112,18 +125,11 @@ std::vector<Harvest> harvests(const GrowthPath &path, int rotation, const Econom
     for (const Harvest &t : path.thinnings) {
         if (t.age < rotation) {
             all.push_back(t);
-            price(all.back(), path, economics, path.thinningsDivided);
+            price(all.back(), path.volumeRatio, economics, path.thinningsDivided);
         }
     }
-    const engine::StandState &s = path.at(rotation);
-    finalCut = {};
-    finalCut.age = rotation;
-    finalCut.volume = s.volume;
-    finalCut.stocking = s.stocking;
-    finalCut.basalArea = s.basalArea;
-    finalCut.meanTreeVolume = felledMeanTree(s.volume, s.stocking);
-    finalCut.priceClass = priceClassOf(finalCut.meanTreeVolume);
-    price(finalCut, path, economics, false);
+    finalCut = finalCutHarvest(rotation, path.at(rotation));
+    price(finalCut, path.volumeRatio, economics, false);
     all.push_back(finalCut);
     return all;
 }
@@ -136,6 +142,30 @@ double removedMeanTree(float removedVolume, float removedStocking) {
 
 double felledMeanTree(float volume, float stocking) {
     return volume > 0.0f ? format::shownValue(meanTree(volume, stocking), kMeanTreeCell) : 0.0;
+}
+
+Harvest thinningHarvest(int age, float volume, float stocking, float basalArea,
+                        const engine::StandState &residual) {
+    Harvest t;
+    t.age = age;
+    t.volume = volume;
+    t.stocking = stocking;
+    t.basalArea = basalArea;
+    t.meanTreeVolume = removedMeanTree(volume, stocking);
+    t.priceClass = priceClassOf(t.meanTreeVolume);
+    t.residual = residual;
+    return t;
+}
+
+Harvest finalCutHarvest(int age, const engine::StandState &crop) {
+    Harvest finalCut;
+    finalCut.age = age;
+    finalCut.volume = crop.volume;
+    finalCut.stocking = crop.stocking;
+    finalCut.basalArea = crop.basalArea;
+    finalCut.meanTreeVolume = felledMeanTree(crop.volume, crop.stocking);
+    finalCut.priceClass = priceClassOf(finalCut.meanTreeVolume);
+    return finalCut;
 }
 
 double harvestRevenue(const Harvest &harvest, const Economics &economics, double volumeFactor) {
@@ -338,15 +368,11 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
             path.stop = GrowthPath::Stop{target, {}, true};
             break;
         }
-        Harvest t;
-        t.age = target;
-        t.volume = std::fabs(pre.volume - step.thinned.volume);
-        t.stocking = pre.stocking - step.thinned.stocking;
-        t.basalArea = pre.basalArea - step.thinned.basalArea;
-        t.meanTreeVolume = removedMeanTree(t.volume, t.stocking);
-        t.priceClass = priceClassOf(t.meanTreeVolume);
-        t.residual = {pre.age, step.thinned.basalArea, step.thinned.stocking, pre.topHeight,
-                      step.thinned.volume};
+        const Harvest t = thinningHarvest(target, std::fabs(pre.volume - step.thinned.volume),
+                                          pre.stocking - step.thinned.stocking,
+                                          pre.basalArea - step.thinned.basalArea,
+                                          {pre.age, step.thinned.basalArea, step.thinned.stocking,
+                                           pre.topHeight, step.thinned.volume});
         path.thinnings.push_back(t);
         from = t.residual;
         nextThinning += regime.thinEvery;
@@ -371,26 +397,45 @@ void divideThinnings(GrowthPath &path) {
     path.thinningsDivided = true;
 }
 
-RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics,
+RotationHarvests rotationHarvests(const GrowthPath &path, int rotation) {
+    RotationHarvests h;
+    h.presentAge = path.presentAge;
+    h.rotation = rotation;
+    h.volumeRatio = path.volumeRatio;
+    h.thinningsDivided = path.thinningsDivided;
+    for (const Harvest &t : path.thinnings) {
+        if (t.age < rotation) {
+            h.thinnings.push_back(t);
+        }
+    }
+    h.finalCut = finalCutHarvest(rotation, path.at(rotation));
+    return h;
+}
+
+RotationValue valueHarvests(const RotationHarvests &harvests, const Economics &economics,
                             Appraisal appraisal) {
     engine::clearUpperVectorState();
     RotationValue v;
+    const int rotation = harvests.rotation;
     v.rotation = rotation;
-    std::vector<Harvest> all = harvests(path, rotation, economics, v.finalCut);
-    v.thinnings.assign(all.begin(), all.end() - 1);
+    v.thinnings = harvests.thinnings;
+    double removed = 0.0;
+    for (Harvest &t : v.thinnings) {
+        price(t, harvests.volumeRatio, economics, harvests.thinningsDivided);
+        removed += double{t.volume};
+    }
+    v.finalCut = harvests.finalCut;
+    price(v.finalCut, harvests.volumeRatio, economics, false);
+    std::vector<Harvest> all = v.thinnings;
+    all.push_back(v.finalCut);
     const Flows f = cashFlows(all, rotation, economics);
     for (int a = 0; a <= rotation; ++a) {
         const auto i = static_cast<std::size_t>(a);
-        v.cashflow.push_back({a, f.cost[i], f.revenue[i]});
+        v.cashflow.push_back({a, f.cost[i], f.revenue[i], f.other[i]});
     }
-    v.mai = meanAnnualIncrement(path, rotation);
-    std::vector<double> mai;
-    for (int a = path.presentAge; a <= rotation; ++a) {
-        mai.push_back(meanAnnualIncrement(path, a));
-    }
-    v.maxMai = mai.empty() ? 0.0 : *std::max_element(mai.begin(), mai.end());
-    v.yieldClass = yieldClass(mai);
-    const Figures fig = figures(f, path.presentAge, economics.ratePercent);
+    // Total production: the crop felled and everything thinned before it.
+    v.mai = rotation > 0 ? (double{v.finalCut.volume} + removed) / rotation : 0.0;
+    const Figures fig = figures(f, harvests.presentAge, economics.ratePercent);
     v.npv = fig.npv;
     v.lev = fig.lev;
     v.forestValue = fig.forestValue;
@@ -401,8 +446,26 @@ RotationValue valueRotation(const GrowthPath &path, int rotation, const Economic
         return v;
     }
     v.irr = valuation::internalRateOfReturn(f.net);
+    // Other revenues do not follow timber prices: they lower the costs the
+    // timber must pay for.
+    std::vector<double> netCost(f.cost.size());
+    for (std::size_t a = 0; a < netCost.size(); ++a) {
+        netCost[a] = f.cost[a] - f.other[a];
+    }
     v.breakEvenPriceFactor =
-        valuation::breakEvenPriceFactor(f.revenue, f.cost, economics.ratePercent);
+        valuation::breakEvenPriceFactor(f.revenue, netCost, economics.ratePercent);
+    return v;
+}
+
+RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics,
+                            Appraisal appraisal) {
+    RotationValue v = valueHarvests(rotationHarvests(path, rotation), economics, appraisal);
+    std::vector<double> mai;
+    for (int a = path.presentAge; a <= rotation; ++a) {
+        mai.push_back(meanAnnualIncrement(path, a));
+    }
+    v.maxMai = mai.empty() ? 0.0 : *std::max_element(mai.begin(), mai.end());
+    v.yieldClass = yieldClass(mai);
     return v;
 }
 

@@ -59,11 +59,23 @@ enum class Valuation {
     kAssortments,
 };
 
+/// A cost and a revenue other than timber at one age, euro/ha: an entry of the
+/// cash flow the user typed for the work.
+struct CashFlowEntry {
+    /// Age, years.
+    int age = 0;
+    double cost = 0.0;
+    double otherRevenue = 0.0;
+
+    bool operator==(const CashFlowEntry &) const = default;
+};
+
 /// What the money of a rotation is counted with.
 struct Economics {
     /// Interest rate, percent.
     double ratePercent = 0.0;
-    /// Cost of establishment, euro/ha, at age 0.
+    /// Cost of establishment, euro/ha, at age 0 (planting): it counts in the
+    /// figures of bare land, never in the value of the stand standing today.
     double establishmentCost = 0.0;
     /// Yearly cost, euro/ha, at every age from 1 to the final cut.
     double annualCost = 0.0;
@@ -72,6 +84,9 @@ struct Economics {
     Valuation valuation = Valuation::kStandingPrice;
     /// Prices of the top-diameter classes, euro/m³, when valued by assortments.
     AssortmentPriceList assortmentPrices{};
+    /// Further costs and other revenues by age; an entry counts in every
+    /// rotation that reaches its age.
+    std::vector<CashFlowEntry> entries{};
 };
 
 /// A thinning or the final cut, per hectare.
@@ -110,6 +125,16 @@ double removedMeanTree(float removedVolume, float removedStocking);
 /// number of stems, in kMeanTreeCell), read back: the final cut's price class
 /// is read from that figure. 0 without stems or without volume.
 double felledMeanTree(float volume, float stocking);
+
+/// A thinning at `age` that removes `volume` (m³/ha), `stocking` (stems/ha)
+/// and `basalArea` (m²/ha) and leaves `residual`: its mean tree and price
+/// class, not yet valued.
+Harvest thinningHarvest(int age, float volume, float stocking, float basalArea,
+                        const engine::StandState &residual);
+
+/// The final cut at `age` of the standing crop `crop`: its mean tree as the
+/// table shows it and its price class, not yet valued.
+Harvest finalCutHarvest(int age, const engine::StandState &crop);
 
 /// Revenue of `harvest`, euro/ha, valued as `economics` says, with its volume
 /// and mean tree times `volumeFactor` (at the same stems, so the mean tree may
@@ -218,9 +243,34 @@ void divideThinnings(GrowthPath &path);
 /// One year of the cash flow of a rotation from bare land, euro/ha.
 struct CashFlowYear {
     int age = 0;
+    /// The establishment or yearly cost and the entries' costs of the age.
     double cost = 0.0;
+    /// Timber revenue: what the harvests of the age earn.
     double revenue = 0.0;
+    /// The entries' other revenues of the age.
+    double otherRevenue = 0.0;
 };
+
+/// The harvests of one rotation, before any money is counted: the thinnings
+/// and the final cut of a grown path, or those of a projection table.
+struct RotationHarvests {
+    /// Present age, years: the value of the stand today counts from here.
+    int presentAge = 0;
+    /// Final-cut age, years.
+    int rotation = 0;
+    /// The thinnings, oldest first, none after the final cut.
+    std::vector<Harvest> thinnings;
+    Harvest finalCut;
+    /// The model's volume-ratio function, which divides a harvest into
+    /// assortments.
+    engine::VolumeRatioCoefficients volumeRatio{};
+    /// True when the thinnings are divided into assortments already.
+    bool thinningsDivided = false;
+};
+
+/// The harvests of the rotation felled at `rotation` on `path`: the thinnings
+/// before it and the whole standing crop at it.
+RotationHarvests rotationHarvests(const GrowthPath &path, int rotation);
 
 /// A rotation valued.
 struct RotationValue {
@@ -265,8 +315,16 @@ enum class Appraisal {
     kWithoutRates,
 };
 
+/// Values `harvests` and the cash flow of `economics`: every harvest at its
+/// price, the costs and other revenues by age, and the figures. The MAI at
+/// the final cut comes from the harvests; the largest MAI and the yield class,
+/// which need the stand of every year, are left 0.
+RotationValue valueHarvests(const RotationHarvests &harvests, const Economics &economics,
+                            Appraisal appraisal = Appraisal::kFull);
+
 /// Values the rotation that ends with the final cut at `rotation` (checked
-/// with rotationProblem beforehand).
+/// with rotationProblem beforehand): valueHarvests of its harvests, with the
+/// largest MAI and the yield class of the path.
 RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics,
                             Appraisal appraisal = Appraisal::kFull);
 

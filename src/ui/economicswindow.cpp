@@ -82,12 +82,15 @@ EconomicsWindow::EconomicsWindow(QWidget *main) : QDialog(main) {
     layout->addWidget(regime);
     QLabel *rate = label(C::lblRate);
     rate->setStyleSheet(QStringLiteral("color: #4a4a4a;"));
+    rate->setWordWrap(true);
     layout->addWidget(rate);
 
     QHBoxLayout *inputs =
         fieldRow({{et::labelInterestRate(), field(C::txtInterestRate, 7)},
                   {et::labelEstablishmentCost(), field(C::txtEstablishmentCost, 8)},
                   {et::labelAnnualCost(), field(C::txtAnnualCost, 6)}});
+    control(C::txtEstablishmentCost)->setToolTip(et::hintEstablishmentCost());
+    control(C::txtAnnualCost)->setToolTip(et::hintAnnualCost());
     inputs->addSpacing(8);
     inputs->addWidget(new QLabel(et::labelValuation(), this));
     inputs->addWidget(valuationChoice());

@@ -33,6 +33,18 @@ void CashFlow::LoadTimberRevenues(const TimberRevenue &revenue) {
     }
 }
 
+void CashFlow::copyTypedFrom(const CashFlow &other) {
+    for (int j = 0; j < other.years(); ++j) {
+        const int i = other.firstYear() + j - m_firstYear;
+        if (i < 0 || i >= years()) {
+            continue;
+        }
+        setOperation(i, other.operation(j));
+        setMatrix(kCfCost, i, other.matrix(kCfCost, j));
+        setMatrix(kCfOtherRevenues, i, other.matrix(kCfOtherRevenues, j));
+    }
+}
+
 double CashFlow::matrix(int column, int i) const {
     return m_matrix.at(static_cast<std::size_t>(column)).at(static_cast<std::size_t>(i));
 }

@@ -58,6 +58,9 @@ public:
     void reset();
     /// Load timber revenues: copies the revenue of each year into column 3.
     void LoadTimberRevenues(const TimberRevenue &revenue);
+    /// Takes the operations, costs and other revenues typed into `other`
+    /// for the years both cash flows hold (another rotation of the same stand).
+    void copyTypedFrom(const CashFlow &other);
 
     /// Computes, year by year, total revenues, cash flow and the discounted
     /// cash flow (rounded to cents, halves to even) at the interest rate. A

@@ -33,6 +33,7 @@ bool WorkSnapshot::sameWork(const WorkSnapshot &other) const {
            layout == other.layout && rows == other.rows && standingVolume == other.standingVolume &&
            felled == other.felled && cashFlowFirstYear == other.cashFlowFirstYear &&
            cashFlow == other.cashFlow && interestRate == other.interestRate &&
+           establishmentCost == other.establishmentCost && annualCost == other.annualCost &&
            priceSetInUse == other.priceSetInUse && pricesInUse == other.pricesInUse;
 }
 
@@ -193,6 +194,41 @@ void StandWork::cashFlowEdited() {
     emit changed();
 }
 
+std::vector<rotation::CashFlowEntry> StandWork::cashFlowEntries() const {
+    std::vector<rotation::CashFlowEntry> entries;
+    for (int i = 0; i < m_cashFlow.years(); ++i) {
+        const double cost = m_cashFlow.matrix(kCfCost, i);
+        const double other = m_cashFlow.matrix(kCfOtherRevenues, i);
+        if (cost != 0.0 || other != 0.0) {
+            entries.push_back(
+                {static_cast<int>(std::nearbyint(m_cashFlow.matrix(kCfYear, i))), cost, other});
+        }
+    }
+    return entries;
+}
+
+void StandWork::setCosts(double establishment, double annual) {
+    if (establishment == m_establishmentCost && annual == m_annualCost) {
+        return;
+    }
+    m_establishmentCost = establishment;
+    m_annualCost = annual;
+    emit costsChanged();
+    emit changed();
+}
+
+double StandWork::defaultEstablishmentCost() const {
+    return m_prices.data().costs.establishment;
+}
+
+double StandWork::defaultAnnualCost() const {
+    return m_prices.data().costs.annual;
+}
+
+void StandWork::resetCosts() {
+    setCosts(defaultEstablishmentCost(), defaultAnnualCost());
+}
+
 // ---- The document ---------------------------------------------------------------------------
 
 void StandWork::setIdentification(const SubCompartment &id) {
@@ -242,6 +278,8 @@ WorkSnapshot StandWork::snapshot() const {
         s.cashFlow.push_back(m_cashFlow.record(i));
     }
     s.interestRate = m_cashFlow.interestRate();
+    s.establishmentCost = m_establishmentCost;
+    s.annualCost = m_annualCost;
     s.priceSetInUse = m_prices.priceSetInUse();
     s.pricesInUse = m_prices.pricesInUse();
     return s;
@@ -285,8 +323,12 @@ void StandWork::restore(const WorkSnapshot &s) {
         }
     }
     m_prices.restoreInUse(s.priceSetInUse, s.pricesInUse);
+    // A document written before the work had its costs takes the defaults.
+    m_establishmentCost = s.establishmentCost.value_or(defaultEstablishmentCost());
+    m_annualCost = s.annualCost.value_or(defaultAnnualCost());
     emit identificationChanged();
     emit cashFlowChanged();
+    emit costsChanged();
     notifyTable(1);
 }
 

@@ -9,6 +9,7 @@
 // standing volume, the timber revenue by year, the yield class) is derived
 // from it, never kept in step by hand.
 
+#include "rotation/rotation.hpp"
 #include "work/mdlnpv.hpp"
 #include "work/projectiontable.hpp"
 #include "work/subcompartment.hpp"
@@ -147,6 +148,22 @@ public:
     void resetCashFlow();
     /// Tells the work that the cash flow was edited or computed.
     void cashFlowEdited();
+    /// The costs and other revenues typed into the cash flow, by age, for
+    /// the rotation library (years with neither left out).
+    std::vector<rotation::CashFlowEntry> cashFlowEntries() const;
+
+    /// Cost of establishing the crop, euro/ha, paid at planting: it counts in
+    /// the figures of bare land (LEV, annuity, IRR, break-even, the economic
+    /// rotation), never in the value of the stand standing today.
+    double establishmentCost() const { return m_establishmentCost; }
+    /// Yearly cost, euro/ha/year, of every age from 1 to the final cut.
+    double annualCost() const { return m_annualCost; }
+    void setCosts(double establishment, double annual);
+    /// The costs of the data folder ("Costs.qdm"), which a new work starts with.
+    double defaultEstablishmentCost() const;
+    double defaultAnnualCost() const;
+    /// Puts the costs back to the data folder's.
+    void resetCosts();
 
     // ---- The sub-compartment as a document -------------------------------------------------
 
@@ -174,6 +191,8 @@ signals:
     /// The table changed from data row `firstRow` on (1 = all).
     void tableChanged(int firstRow);
     void cashFlowChanged();
+    /// The establishment or yearly cost changed.
+    void costsChanged();
     void identificationChanged();
     /// The document's name or its unsaved mark changed.
     void documentTitleChanged();
@@ -194,6 +213,8 @@ private:
     QString m_siteIndexText;
     ProjectionTable m_table;
     CashFlow m_cashFlow;
+    double m_establishmentCost = 0.0;
+    double m_annualCost = 0.0;
     SubCompartment m_identification;
     QString m_documentName;
     bool m_modified = false;

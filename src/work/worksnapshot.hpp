@@ -13,6 +13,7 @@
 
 #include <array>
 #include <cstdint>
+#include <optional>
 #include <string_view>
 #include <vector>
 
@@ -66,6 +67,10 @@ struct WorkSnapshot {
     std::vector<CashFlowRecord> cashFlow;
     /// Interest rate, percent.
     double interestRate = 0.0;
+    /// Establishment cost, euro/ha, and yearly cost, euro/ha/year; none in a
+    /// document written before the work had them (the defaults then hold).
+    std::optional<double> establishmentCost;
+    std::optional<double> annualCost;
 
     /// Price set in use and the prices the rows were valued with, euro/m³.
     std::int16_t priceSetInUse = 0;

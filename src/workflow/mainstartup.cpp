@@ -37,6 +37,8 @@ void MainWindowLogic::Form_Load(QSettings &settings, const QRect &screen) {
         m_fields.showSiteIndex(stored.age, stored.topHeight);
         prices::readPriceFiles(m_dataFolder, prices(), errorLog());
         prices().selectPriceSet(prices::kCurrentPrices);
+        // The work starts with the data folder's costs.
+        m_work.resetCosts();
         m_summary.show(false);
         m_view.setText(MainControl::cmdShowTimberPrice, text::showTimberPrices());
     });

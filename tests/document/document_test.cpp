@@ -86,11 +86,46 @@ TEST_F(DocumentTest, FileOpensWithItsFormatAndVersion) {
     session->run(QLatin1String(kGrownAndThinned));
     const QByteArray json = document::documentToJson(session->work());
     EXPECT_TRUE(json.startsWith("{\n    \"format\": \"ARBOLEX sub-compartment\",\n"
-                                "    \"version\": 1,\n"));
+                                "    \"version\": 2,\n"));
     QString reason;
     const auto read = document::documentFromJson(json, reason);
     ASSERT_TRUE(read) << reason.toStdString();
     expectSameDocument(*read, session->work());
+}
+
+TEST_F(DocumentTest, CostsAreSavedAndAnOlderFileOpensWithTheDefaults) {
+    auto first = newSession();
+    first->run(QLatin1String(kGrownAndThinned));
+    first->session.work().setCosts(2750.0, 12.5);
+    first->run(QStringLiteral("save ") + file(QStringLiteral("costs.arbolex")));
+    auto second = newSession();
+    second->run(QStringLiteral("open ") + file(QStringLiteral("costs.arbolex")));
+    EXPECT_EQ(second->session.work().establishmentCost(), 2750.0);
+    EXPECT_EQ(second->session.work().annualCost(), 12.5);
+
+    // A file written before the work had its costs: felled at 45, a cost of
+    // 2500 typed into the first year of its cash flow.
+    const QString old = file(QStringLiteral("version1.arbolex"));
+    ASSERT_TRUE(
+        QFile::copy(QStringLiteral(ARBOLEX_TEST_SOURCE "/document/version1-felled.arbolex"), old));
+    QString reason;
+    const auto read = document::readDocumentFile(old, reason);
+    ASSERT_TRUE(read) << reason.toStdString();
+    EXPECT_FALSE(read->establishmentCost.has_value());
+    auto third = newSession();
+    third->run(QStringLiteral("open ") + old);
+    const document::Document opened = third->work();
+    EXPECT_EQ(opened.rows, read->rows);
+    EXPECT_EQ(opened.cashFlow, read->cashFlow);
+    EXPECT_EQ(opened.interestRate, read->interestRate);
+    // The shipped costs, and nothing to save for it.
+    EXPECT_EQ(opened.establishmentCost, 3045.0);
+    EXPECT_EQ(opened.annualCost, 0.0);
+    EXPECT_FALSE(third->session.session().documents().isModified());
+    // Its figures: the stand today is worth what its cash flow says.
+    third->run(QStringLiteral("press cmdNPV\npress frmNPV.cmdNPV\npress cmdEconomics"));
+    ASSERT_TRUE(third->session.economics().valued());
+    EXPECT_EQ(*third->session.economics().value()->npv, third->session.work().cashFlow().SumNPV());
 }
 
 TEST_F(DocumentTest, ANumberJsonCannotHoldComesBack) {

@@ -2,6 +2,7 @@
 
 #include "workflow/mainwindowfixture.hpp"
 
+#include "prices/costfile.hpp"
 #include "prices/pricedata.hpp"
 #include "shell/vbformat.hpp"
 #include "thinning/headlessthinview.hpp"
@@ -13,13 +14,14 @@ namespace arbolex::testing {
 
 using thinning::ThinControl;
 
-/// The main window with a thinning window attached, the shipped price lists,
-/// and model 0 grown from age 15 to `to`.
+/// The main window with a thinning window attached, the shipped price lists
+/// and default costs, and model 0 grown from age 15 to `to`.
 class ThinningTest : public MainWindowTest {
 protected:
     ThinningTest() {
         const QDir source(QStringLiteral(ARBOLEX_DATA_SOURCE));
         prices::GetPricesFromFiles(source.path(), prices.data(), log);
+        prices::GetCostsFromFile(source.path(), prices.data(), log);
     }
 
     void growTo(const QString &to, const QString &by = QStringLiteral("5")) {
