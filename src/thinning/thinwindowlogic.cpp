@@ -3,6 +3,7 @@
 #include "thinning/thinwindowlogic.hpp"
 
 #include "assortments/assortwindowlogic.hpp"
+#include "rotation/growcommand.hpp"
 #include "rotation/standmath.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
@@ -29,7 +30,10 @@ namespace {
 // Display formats of the thinning window.
 constexpr char16_t kStockingFormat[] = u"###0";
 constexpr char16_t kBasalAreaFormat[] = u"##0.00";
-constexpr char16_t kVolumeFormat[] = u"###0.00";
+/// Volumes as the window shows them: the pattern whose shown figure the
+/// volume method checks a removal against.
+const QString kVolumeFormat = QString::fromLatin1(rotation::kThinningVolumeShown.data(),
+                                                  rotation::kThinningVolumeShown.size());
 constexpr char16_t kDbhFormat[] = u"##0.0";
 constexpr char16_t kMeanVolumeFormat[] = u"0.000";
 
