@@ -13,7 +13,10 @@
 
 namespace arbolex::rotation {
 
-enum class Objective { kLev, kNpv, kVolume };
+/// What the optimiser maximises: the LEV, the NPV (both with the carbon money
+/// when carbon counts), the total production, or the long-term average
+/// carbon stock.
+enum class Objective { kLev, kNpv, kVolume, kCarbon };
 
 /// Progress of long work: the fraction done in, "keep going?" out.
 using Progress = std::function<bool(double fraction)>;
@@ -49,6 +52,9 @@ struct Candidate {
     double lev = 0.0;
     /// Total production, m³/ha: standing volume at the final cut and the thinnings.
     double volume = 0.0;
+    /// Long-term average carbon stock, t CO₂e/ha; filled when carbon counts
+    /// or is the objective.
+    double carbonStock = 0.0;
     /// The objective's figure.
     double score = 0.0;
 };

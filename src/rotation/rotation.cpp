@@ -60,12 +60,23 @@ struct Flows {
     std::vector<double> other;
     std::vector<double> cost;
     std::vector<double> net;
+    /// What carbon earns by age, and the net without it; empty unless
+    /// carbon counts.
+    std::vector<double> carbon;
+    std::vector<double> timberNet;
 };
 
-Flows cashFlows(const std::vector<Harvest> &harvests, int rotation, const Economics &economics) {
+/// `carbon` (what carbon earns by age, 0 to the rotation) counts in the net
+/// when it is not empty.
+Flows cashFlows(const std::vector<Harvest> &harvests, int rotation, const Economics &economics,
+                std::vector<double> carbon = {}) {
     const auto years = static_cast<std::size_t>(rotation) + 1;
-    Flows f{std::vector<double>(years, 0.0), std::vector<double>(years, 0.0),
-            std::vector<double>(years, 0.0), std::vector<double>(years, 0.0)};
+    Flows f{std::vector<double>(years, 0.0),
+            std::vector<double>(years, 0.0),
+            std::vector<double>(years, 0.0),
+            std::vector<double>(years, 0.0),
+            {},
+            {}};
     for (std::size_t a = 0; a < years; ++a) {
         f.cost[a] = a == 0 ? economics.establishmentCost : economics.annualCost;
     }
@@ -84,6 +95,13 @@ Flows cashFlows(const std::vector<Harvest> &harvests, int rotation, const Econom
     for (std::size_t a = 0; a < years; ++a) {
         f.net[a] = f.revenue[a] + f.other[a] - f.cost[a];
     }
+    if (carbon.size() == years) {
+        f.timberNet = f.net;
+        for (std::size_t a = 0; a < years; ++a) {
+            f.net[a] += carbon[a];
+        }
+        f.carbon = std::move(carbon);
+    }
     return f;
 }
 
@@ -93,11 +111,11 @@ struct Figures {
     std::optional<double> forestValue;
 };
 
-Figures figures(const Flows &f, int presentAge, double ratePercent) {
+Figures figures(const std::vector<double> &net, int presentAge, double ratePercent) {
     Figures out;
-    const std::vector<double> fromPresent(f.net.begin() + presentAge, f.net.end());
+    const std::vector<double> fromPresent(net.begin() + presentAge, net.end());
     out.npv = valuation::netPresentValue(fromPresent, ratePercent);
-    out.lev = valuation::landExpectationValue(f.net, ratePercent);
+    out.lev = valuation::landExpectationValue(net, ratePercent);
     if (out.lev) {
         // The forest value adds the LEV to the same net present value.
         const int yearsToFinalCut =
@@ -105,6 +123,21 @@ Figures figures(const Flows &f, int presentAge, double ratePercent) {
         out.forestValue = valuation::forestValue(out.npv, yearsToFinalCut, *out.lev, ratePercent);
     }
     return out;
+}
+
+Figures figures(const Flows &f, int presentAge, double ratePercent) {
+    return figures(f.net, presentAge, ratePercent);
+}
+
+/// What carbon earns by age in the rotation felled at `rotation` on `path`;
+/// empty unless carbon counts.
+std::vector<double> carbonMoney(const GrowthPath &path, int rotation, const Economics &economics) {
+    if (!economics.carbon.counts()) {
+        return {};
+    }
+    return carbon::carbonCashFlow(
+        rotationCarbon(rotationHarvests(path, rotation), economics.carbonParameters),
+        economics.carbon, economics.carbonParameters, economics.ratePercent);
 }
 
 /// Values `h` as `economics` says; valued by assortments, the harvest is
@@ -292,6 +325,7 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
     grow.SiteIndex(stand.age, stand.height);
     grow.GetVCF();
     GrowthPath path;
+    path.model = stand.model;
     path.ageLimit = modelAgeLimit(stand.model);
     path.volumeRatio = grow.volumeRatio();
     if (auto fault = standFault(stand, grow.maxTopHeight())) {
@@ -399,8 +433,12 @@ void divideThinnings(GrowthPath &path) {
 
 RotationHarvests rotationHarvests(const GrowthPath &path, int rotation) {
     RotationHarvests h;
+    h.model = path.model;
     h.presentAge = path.presentAge;
     h.rotation = rotation;
+    for (int a = path.presentAge; a <= rotation; ++a) {
+        h.standing.push_back(path.at(a).volume);
+    }
     h.volumeRatio = path.volumeRatio;
     h.thinningsDivided = path.thinningsDivided;
     for (const Harvest &t : path.thinnings) {
@@ -428,10 +466,17 @@ RotationValue valueHarvests(const RotationHarvests &harvests, const Economics &e
     price(v.finalCut, harvests.volumeRatio, economics, false);
     std::vector<Harvest> all = v.thinnings;
     all.push_back(v.finalCut);
-    const Flows f = cashFlows(all, rotation, economics);
+    v.carbon = rotationCarbon(harvests, economics.carbonParameters);
+    const bool carbonCounts = economics.carbon.counts() && !v.carbon.years.empty();
+    const Flows f = cashFlows(all, rotation, economics,
+                              carbonCounts ? carbon::carbonCashFlow(v.carbon, economics.carbon,
+                                                                    economics.carbonParameters,
+                                                                    economics.ratePercent)
+                                           : std::vector<double>{});
     for (int a = 0; a <= rotation; ++a) {
         const auto i = static_cast<std::size_t>(a);
-        v.cashflow.push_back({a, f.cost[i], f.revenue[i], f.other[i]});
+        v.cashflow.push_back(
+            {a, f.cost[i], f.revenue[i], f.other[i], carbonCounts ? f.carbon[i] : 0.0});
     }
     // Total production: the crop felled and everything thinned before it.
     v.mai = rotation > 0 ? (double{v.finalCut.volume} + removed) / rotation : 0.0;
@@ -439,6 +484,19 @@ RotationValue valueHarvests(const RotationHarvests &harvests, const Economics &e
     v.npv = fig.npv;
     v.lev = fig.lev;
     v.forestValue = fig.forestValue;
+    if (carbonCounts) {
+        const Figures timber = figures(f.timberNet, harvests.presentAge, economics.ratePercent);
+        const Figures carbon = figures(f.carbon, harvests.presentAge, economics.ratePercent);
+        v.npvTimber = timber.npv;
+        v.levTimber = timber.lev;
+        v.npvCarbon = carbon.npv;
+        v.levCarbon = carbon.lev;
+    } else {
+        v.npvTimber = v.npv;
+        v.levTimber = v.lev;
+        v.npvCarbon = 0.0;
+        v.levCarbon = v.lev ? std::optional<double>(0.0) : std::nullopt;
+    }
     if (v.lev) {
         v.eaa = valuation::equivalentAnnualAnnuity(*v.lev, economics.ratePercent);
     }
@@ -446,11 +504,11 @@ RotationValue valueHarvests(const RotationHarvests &harvests, const Economics &e
         return v;
     }
     v.irr = valuation::internalRateOfReturn(f.net);
-    // Other revenues do not follow timber prices: they lower the costs the
-    // timber must pay for.
+    // Other revenues and carbon do not follow timber prices: they lower the
+    // costs the timber must pay for.
     std::vector<double> netCost(f.cost.size());
     for (std::size_t a = 0; a < netCost.size(); ++a) {
-        netCost[a] = f.cost[a] - f.other[a];
+        netCost[a] = f.cost[a] - f.other[a] - (carbonCounts ? f.carbon[a] : 0.0);
     }
     v.breakEvenPriceFactor =
         valuation::breakEvenPriceFactor(f.revenue, netCost, economics.ratePercent);
@@ -485,7 +543,8 @@ RotationExplorer exploreRotations(const GrowthPath &path, const Regime &regime,
     // A path that ended early (limits, or grown for one final cut) has no later ages.
     for (int r = firstRotation(path, regime); r <= path.lastAge(); ++r) {
         Harvest finalCut;
-        const Flows f = cashFlows(harvests(path, r, economics, finalCut), r, economics);
+        const Flows f = cashFlows(harvests(path, r, economics, finalCut), r, economics,
+                                  carbonMoney(path, r, economics));
         const Figures fig = figures(f, path.presentAge, economics.ratePercent);
         RotationRow row{r,       finalCut.volume, meanAnnualIncrement(path, r),
                         fig.npv, fig.lev,         fig.forestValue};
@@ -530,13 +589,24 @@ Candidate scoreRotation(const GrowthPath &path, const Regime &regime, int rotati
         c.regime = {};
     }
     c.volume = meanAnnualIncrement(path, rotation) * rotation;
-    const Figures fig =
-        figures(cashFlows(all, rotation, economics), path.presentAge, economics.ratePercent);
+    std::vector<double> carbonFlow;
+    if (economics.carbon.counts() || objective == Objective::kCarbon) {
+        const carbon::Account account =
+            rotationCarbon(rotationHarvests(path, rotation), economics.carbonParameters);
+        c.carbonStock = account.longTermAverage;
+        if (economics.carbon.counts()) {
+            carbonFlow = carbon::carbonCashFlow(account, economics.carbon,
+                                                economics.carbonParameters, economics.ratePercent);
+        }
+    }
+    const Figures fig = figures(cashFlows(all, rotation, economics, std::move(carbonFlow)),
+                                path.presentAge, economics.ratePercent);
     c.npv = fig.npv.value_or(-std::numeric_limits<double>::infinity());
     c.lev = fig.lev.value_or(-std::numeric_limits<double>::infinity());
-    c.score = objective == Objective::kLev   ? c.lev
-              : objective == Objective::kNpv ? c.npv
-                                             : c.volume;
+    c.score = objective == Objective::kLev      ? c.lev
+              : objective == Objective::kNpv    ? c.npv
+              : objective == Objective::kCarbon ? c.carbonStock
+                                                : c.volume;
     return c;
 }
 

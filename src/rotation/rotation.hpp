@@ -5,6 +5,7 @@
 // from its yearly cash flow. One library for every caller: the economics
 // window, the optimiser and the command-line program (docs/economics.md).
 
+#include "carbon/account.hpp"
 #include "engine/grow.hpp"
 #include "engine/standstate.hpp"
 #include "rotation/assortmentprices.hpp"
@@ -87,6 +88,10 @@ struct Economics {
     /// Further costs and other revenues by age; an entry counts in every
     /// rotation that reaches its age.
     std::vector<CashFlowEntry> entries{};
+    /// What carbon earns: nothing unless a payment and a price are set.
+    carbon::Pricing carbon{};
+    /// The constants of the carbon account.
+    carbon::Parameters carbonParameters{};
 };
 
 /// A thinning or the final cut, per hectare.
@@ -147,6 +152,8 @@ double harvestRevenue(const Harvest &harvest, const Economics &economics,
 /// final-cut age: a rotation of R years takes the state at R and the thinnings
 /// before R.
 struct GrowthPath {
+    /// Model grown, 0 to 21.
+    std::int16_t model = 0;
     /// Present age, years: the stand's age moved to the nearest whole year.
     int presentAge = 0;
     /// Last age of the path, years.
@@ -249,11 +256,16 @@ struct CashFlowYear {
     double revenue = 0.0;
     /// The entries' other revenues of the age.
     double otherRevenue = 0.0;
+    /// What carbon earns in the year (below 0 when a release is charged);
+    /// 0 unless carbon counts.
+    double carbon = 0.0;
 };
 
 /// The harvests of one rotation, before any money is counted: the thinnings
 /// and the final cut of a grown path, or those of a projection table.
 struct RotationHarvests {
+    /// Model grown, 0 to 21: its species sets the carbon of the wood.
+    std::int16_t model = 0;
     /// Present age, years: the value of the stand today counts from here.
     int presentAge = 0;
     /// Final-cut age, years.
@@ -266,6 +278,9 @@ struct RotationHarvests {
     engine::VolumeRatioCoefficients volumeRatio{};
     /// True when the thinnings are divided into assortments already.
     bool thinningsDivided = false;
+    /// Standing volume before any harvest of the age, m³/ha, at every age
+    /// from the present to the final cut: the carbon in the living trees.
+    std::vector<float> standing;
 };
 
 /// The harvests of the rotation felled at `rotation` on `path`: the thinnings
@@ -304,6 +319,14 @@ struct RotationValue {
     valuation::InternalRate irr;
     /// Factor on all timber prices that brings the LEV to 0.
     std::optional<double> breakEvenPriceFactor;
+    /// The carbon account of the rotation, from planting to the final cut.
+    carbon::Account carbon;
+    /// NPV and LEV of the money without carbon, and of the carbon money
+    /// alone, euro/ha: npv and lev are their sums.
+    std::optional<double> npvTimber;
+    std::optional<double> npvCarbon;
+    std::optional<double> levTimber;
+    std::optional<double> levCarbon;
 };
 
 /// How much of a rotation's value to compute.
@@ -321,6 +344,13 @@ enum class Appraisal {
 /// which need the stand of every year, are left 0.
 RotationValue valueHarvests(const RotationHarvests &harvests, const Economics &economics,
                             Appraisal appraisal = Appraisal::kFull);
+
+/// The carbon account of `harvests` with the constants of `parameters`. The
+/// account runs from planting: before the present age, which the stand does
+/// not show, the carbon in the trees is taken to rise in a straight line from
+/// none at planting to the present stock.
+carbon::Account rotationCarbon(const RotationHarvests &harvests,
+                               const carbon::Parameters &parameters);
 
 /// Values the rotation that ends with the final cut at `rotation` (checked
 /// with rotationProblem beforehand): valueHarvests of its harvests, with the

@@ -21,12 +21,14 @@ public:
     };
 
     Flows(const RotationHarvests &harvests, const Economics &economics)
-        : m_presentAge(harvests.presentAge), m_economics(economics) {
+        : m_presentAge(harvests.presentAge), m_economics(economics),
+          m_carbonCounts(economics.carbon.counts()) {
         const RotationValue v = valueHarvests(harvests, economics, Appraisal::kWithoutRates);
         for (const CashFlowYear &c : v.cashflow) {
             m_revenue.push_back(c.revenue);
             m_other.push_back(c.otherRevenue);
             m_cost.push_back(c.cost);
+            m_carbon.push_back(c.carbon);
         }
         m_harvests = v.thinnings;
         m_harvests.push_back(v.finalCut);
@@ -46,16 +48,23 @@ public:
 
     /// NPV and LEV with the timber revenue times `revenueFactor` (other
     /// revenues do not follow timber prices), the costs times
-    /// `costFactor`, at `ratePercent`.
-    Value value(double revenueFactor, double costFactor, double ratePercent) {
-        return value(m_revenue, revenueFactor, costFactor, ratePercent);
+    /// `costFactor`, the carbon money times `carbonFactor`, at `ratePercent`.
+    Value value(double revenueFactor, double costFactor, double ratePercent,
+                double carbonFactor = 1.0) {
+        return value(m_revenue, revenueFactor, costFactor, ratePercent, carbonFactor);
     }
 
     /// The same with `revenue` by age in place of the rotation's own.
     Value value(const std::vector<double> &revenue, double revenueFactor, double costFactor,
-                double ratePercent) {
+                double ratePercent, double carbonFactor = 1.0) {
         for (std::size_t a = 0; a < m_net.size(); ++a) {
             m_net[a] = revenueFactor * revenue[a] + m_other[a] - costFactor * m_cost[a];
+        }
+        if (m_carbonCounts) {
+            // Added after the rest, as the valuation adds it.
+            for (std::size_t a = 0; a < m_net.size(); ++a) {
+                m_net[a] += carbonFactor * m_carbon[a];
+            }
         }
         const std::vector<double> fromPresent(m_net.begin() + m_presentAge, m_net.end());
         return {valuation::netPresentValue(fromPresent, ratePercent),
@@ -70,6 +79,8 @@ private:
     std::vector<double> m_other;
     std::vector<double> m_cost;
     std::vector<double> m_net;
+    std::vector<double> m_carbon;
+    bool m_carbonCounts;
 };
 
 /// Uniform on [0, 1) from the top 53 bits: the same numbers on every platform.
@@ -123,6 +134,11 @@ std::vector<TornadoBar> tornado(const RotationHarvests &harvests, const Economic
         const Flows::Value high = flows.value(m.revenueHigh, m.costHigh, m.rateHigh);
         bars.push_back({m.factor, low.npv, high.npv, low.lev, high.lev});
     }
+    if (economics.carbon.counts()) {
+        const Flows::Value low = flows.value(1.0, 1.0, r, 0.8);
+        const Flows::Value high = flows.value(1.0, 1.0, r, 1.2);
+        bars.push_back({"carbon price \u00b120 %", low.npv, high.npv, low.lev, high.lev});
+    }
     // Volume moves the mean trees too, so it is valued harvest by harvest.
     const Flows::Value low = flows.value(flows.revenueWithVolume(0.9), 1.0, 1.0, r);
     const Flows::Value high = flows.value(flows.revenueWithVolume(1.1), 1.0, 1.0, r);
@@ -152,7 +168,11 @@ MonteCarloResult monteCarlo(const RotationHarvests &harvests, const Economics &e
         const double rate =
             settings.rateLow + (settings.rateHigh - settings.rateLow) * uniform(engine);
         const double cost = std::exp(settings.costSpread * normal(engine));
-        const Flows::Value v = flows.value(price, cost, rate);
+        // A fourth number only when carbon counts: without carbon the draws
+        // stay those of a valuation that never knew carbon.
+        const double carbonPrice =
+            economics.carbon.counts() ? std::exp(settings.carbonSpread * normal(engine)) : 1.0;
+        const Flows::Value v = flows.value(price, cost, rate, carbonPrice);
         if (!v.npv || !v.lev) {
             continue; // a factor that overflows: the draw is left out
         }

@@ -16,7 +16,8 @@ namespace arbolex::rotation {
 
 /// One bar of the tornado: NPV and LEV with the factor at its low and high end.
 struct TornadoBar {
-    /// "timber prices ±20 %", "interest rate ±1 point", "costs ±20 %", "volume ±10 %".
+    /// "timber prices ±20 %", "interest rate ±1 point", "costs ±20 %",
+    /// "carbon price ±20 %" (when carbon counts), "volume ±10 %".
     std::string factor;
     std::optional<double> npvLow;
     std::optional<double> npvHigh;
@@ -42,6 +43,9 @@ struct MonteCarloSettings {
     double rateHigh = 5.0;
     /// Standard deviation of the logarithm of the cost level (0: costs fixed).
     double costSpread = 0.0;
+    /// Standard deviation of the logarithm of the carbon price level, drawn
+    /// only when carbon counts.
+    double carbonSpread = 0.3;
     /// Bars of the NPV histogram.
     int bins = 20;
 };
