@@ -258,41 +258,41 @@ void EconomicsWindowLogic::clearFigures(const QString &why) {
 }
 
 void EconomicsWindowLogic::cmdCompute_Click() {
-    shell::guard(m_standWork.errorLog(), QStringLiteral(" in frmEconomics.cmdCompute_Click()"),
-                 [&] {
-                     if (m_optimising) {
-                         return;
-                     }
-                     const rotation::Stand before = m_stand;
-                     const rotation::Economics money = m_economics;
-                     if (!readEconomics() || !readStand()) {
-                         return;
-                     }
-                     if (!sameStand(before, m_stand) || !sameMoney(money, m_economics)) {
-                         // The optimiser's regimes belong to another stand or other money.
-                         m_best.clear();
-                         m_view.setText(C::lblOptimiser, QString());
-                         m_view.setEnabled(C::cmdApply, false);
-                         m_view.regimesChanged();
-                     }
-                     m_table = regimeFromTable(m_standWork.table());
-                     rotation::GrowthFailure failure;
-                     m_path = rotation::growPath(m_grow, m_stand, m_table.regime, failure);
-                     if (!m_path) {
-                         clearFigures(QString::fromStdString(failure.text));
-                         return;
-                     }
-                     m_explorer = rotation::exploreRotations(*m_path, m_table.regime, m_economics);
-                     m_own = harvestsFromTable(m_standWork.table(), m_path->volumeRatio);
-                     if (m_own) {
-                         valueTable();
-                     } else if (!valueEconomicRotation()) {
-                         return;
-                     }
-                     showFigures();
-                     m_view.regimesChanged();
-                     cmdMonteCarlo_Click();
-                 });
+    shell::guard(
+        m_standWork.errorLog(), QStringLiteral(" in frmEconomics.cmdCompute_Click()"), [&] {
+            if (m_optimising) {
+                return;
+            }
+            const rotation::Stand before = m_stand;
+            const rotation::Economics money = m_economics;
+            if (!readEconomics() || !readStand()) {
+                return;
+            }
+            if (!sameStand(before, m_stand) || !sameMoney(money, m_economics)) {
+                // The optimiser's regimes belong to another stand or other money.
+                m_best.clear();
+                m_view.setText(C::lblOptimiser, QString());
+                m_view.setEnabled(C::cmdApply, false);
+                m_view.regimesChanged();
+            }
+            m_table = regimeFromTable(m_standWork.table());
+            rotation::GrowthFailure failure;
+            m_path = rotation::growPath(m_grow, m_stand, m_table.regime, failure);
+            if (!m_path) {
+                clearFigures(QString::fromStdString(failure.text));
+                return;
+            }
+            m_explorer = rotation::exploreRotations(*m_path, m_table.regime, m_economics);
+            m_own = harvestsFromTable(m_standWork.table(), m_path->model, m_path->volumeRatio);
+            if (m_own) {
+                valueTable();
+            } else if (!valueEconomicRotation()) {
+                return;
+            }
+            showFigures();
+            m_view.regimesChanged();
+            cmdMonteCarlo_Click();
+        });
 }
 
 bool EconomicsWindowLogic::figuresOfTable() const {

@@ -93,24 +93,69 @@ TableRegime regimeFromTable(const work::ProjectionTable &table) {
     return t;
 }
 
+namespace {
+
+/// A stand the table shows at a whole age: its volume before the harvests of
+/// the age and after them, m³/ha.
+struct Shown {
+    int age = 0;
+    float before = 0.0f;
+    float after = 0.0f;
+};
+
+/// Standing volume before any harvest of each age from the first shown to
+/// the last, m³/ha: shown where the table has a row, in a straight line from
+/// the stand left at one row to the stand grown at the next between them.
+std::vector<float> standingByAge(const std::vector<Shown> &shown) {
+    std::vector<float> standing;
+    for (std::size_t i = 0; i < shown.size(); ++i) {
+        standing.push_back(shown[i].before);
+        if (i + 1 == shown.size()) {
+            break;
+        }
+        const Shown &from = shown[i];
+        const Shown &to = shown[i + 1];
+        for (int a = from.age + 1; a < to.age; ++a) {
+            const double t = static_cast<double>(a - from.age) / (to.age - from.age);
+            standing.push_back(
+                static_cast<float>(from.after + t * (double{to.before} - double{from.after})));
+        }
+    }
+    return standing;
+}
+
+} // namespace
+
 std::optional<rotation::RotationHarvests>
-harvestsFromTable(const work::ProjectionTable &table,
+harvestsFromTable(const work::ProjectionTable &table, std::int16_t model,
                   const engine::VolumeRatioCoefficients &volumeRatio) {
     rotation::RotationHarvests h;
+    h.model = model;
     h.volumeRatio = volumeRatio;
+    std::vector<Shown> shown;
     bool felled = false;
     for (int r = 1; r <= table.lastRow() && !felled; ++r) {
         const work::TableRow &row = table.row(r);
         const work::RowRecord &s = row.record;
+        const int age = wholeAge(s.age);
         if (row.finalCut) {
             felled = true;
-            h.rotation = wholeAge(s.age);
+            h.rotation = age;
             h.finalCut = rotation::finalCutHarvest(
                 h.rotation, {s.age, s.basalArea, s.stocking, s.topHeight, s.volume});
         } else if (row.isThinning()) {
             h.thinnings.push_back(rotation::thinningHarvest(
-                wholeAge(s.age), s.removedVolume, s.removedStocking, s.removedBasalArea,
+                age, s.removedVolume, s.removedStocking, s.removedBasalArea,
                 {s.age, s.basalArea, s.stocking, s.topHeight, s.volume}));
+        }
+        if (row.isText()) {
+            continue;
+        }
+        if (!shown.empty() && shown.back().age == age) {
+            // A thinning, or the final cut, of the stand grown to this age.
+            shown.back().after = row.finalCut ? 0.0f : s.volume;
+        } else if (shown.empty() || shown.back().age < age) {
+            shown.push_back({age, s.volume, s.volume});
         }
     }
     if (!felled) {
@@ -118,6 +163,9 @@ harvestsFromTable(const work::ProjectionTable &table,
     }
     // The cash flow's first year.
     h.presentAge = static_cast<int>(std::nearbyint(table.row(1).numbers[work::kNumAge]));
+    if (!shown.empty() && shown.front().age == h.presentAge && shown.back().age == h.rotation) {
+        h.standing = standingByAge(shown);
+    }
     return h;
 }
 

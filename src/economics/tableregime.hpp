@@ -42,9 +42,11 @@ TableRegime regimeFromTable(const work::ProjectionTable &table);
 /// The rotation as the table holds it: every thinning row (one in the year of
 /// the final cut too) and the final-cut row, from the table's first year, for
 /// the rotation library to value; `volumeRatio` divides them into
-/// assortments. std::nullopt for a table without a final cut.
+/// assortments. The standing volume of every year (the carbon in the trees)
+/// is the table's where it has a row, and a straight line between its rows.
+/// std::nullopt for a table without a final cut.
 std::optional<rotation::RotationHarvests>
-harvestsFromTable(const work::ProjectionTable &table,
+harvestsFromTable(const work::ProjectionTable &table, std::int16_t model,
                   const engine::VolumeRatioCoefficients &volumeRatio);
 
 /// "Thinnings of 30 to 50 m³/ha at 20, 25 and 32 years; final cut at 45 years."

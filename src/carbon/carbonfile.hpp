@@ -1,0 +1,53 @@
+#pragma once
+
+// The carbon file "Carbon.qdm": the carbon price and how it is paid, and
+// every constant of the carbon account, one `name = value` a line with `#`
+// comments naming the sources. The desktop program reads it at start and
+// writes it at exit; the command-line program reads its constants (the price
+// only from its options). A file is read whole or not at all.
+
+#include "carbon/parameters.hpp"
+
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace arbolex::carbon {
+
+/// What the carbon file holds.
+struct Settings {
+    Pricing pricing{};
+    Parameters parameters{};
+
+    bool operator==(const Settings &other) const;
+};
+
+/// The shipped carbon price, euro per t CO₂e: Ireland's carbon tax on fossil
+/// fuels from 1 May 2024 (Finance Act 2020), not counted until a payment is
+/// chosen.
+inline constexpr double kDefaultCarbonPrice = 56.0;
+
+/// Highest carbon price a file or a field may hold, euro per t CO₂e.
+inline constexpr double kMaxCarbonPrice = 10000.0;
+
+/// The settings a first start has: the shipped price, no payment, the
+/// constants' defaults.
+Settings defaultSettings();
+
+/// What reading a carbon file gave: its settings, or the first fault with its
+/// line ("line 4: the half-life of paper must be above 0 years").
+struct CarbonReading {
+    std::optional<Settings> settings;
+    std::string fault;
+};
+
+/// Reads the text of a carbon file. Every name must be known and appear at
+/// most once; a name left out keeps its default; the settings must pass
+/// parameterFault.
+CarbonReading readCarbonText(std::string_view text);
+
+/// The text of a carbon file holding `settings`, every name with its
+/// source as a comment.
+std::string carbonText(const Settings &settings);
+
+} // namespace arbolex::carbon
