@@ -14,6 +14,9 @@
 
 namespace arbolex::carbon {
 
+/// Name of the carbon file in the data folder.
+inline constexpr const char *kCarbonFile = "Carbon.qdm";
+
 /// What the carbon file holds.
 struct Settings {
     Pricing pricing{};

@@ -23,7 +23,8 @@ struct Objective {
 
 constexpr Objective kObjectives[] = {{"lev", rotation::Objective::kLev},
                                      {"npv", rotation::Objective::kNpv},
-                                     {"volume", rotation::Objective::kVolume}};
+                                     {"volume", rotation::Objective::kVolume},
+                                     {"carbon", rotation::Objective::kCarbon}};
 
 QString objectiveWord(rotation::Objective objective) {
     for (const Objective &o : kObjectives) {
@@ -44,7 +45,7 @@ rotation::Objective readObjective(const Options &options) {
             return o.objective;
         }
     }
-    throw UsageError{QStringLiteral("--objective takes lev, npv or volume")};
+    throw UsageError{QStringLiteral("--objective takes lev, npv, volume or carbon")};
 }
 
 /// The columns of a regime found, after "rank".
@@ -53,25 +54,39 @@ const QStringList kCandidateColumns = {QStringLiteral("thin_from"),   QStringLit
                                        QStringLiteral("rotation"),    QStringLiteral("npv"),
                                        QStringLiteral("lev"),         QStringLiteral("volume")};
 
-/// A regime's figures in the order of kCandidateColumns; its thinning is
+/// The columns of the regimes found: kCandidateColumns, and the long-term
+/// average carbon stock when carbon counts or is the objective.
+QStringList candidateColumns(bool withCarbon) {
+    QStringList columns = kCandidateColumns;
+    if (withCarbon) {
+        columns << QStringLiteral("carbon_stock");
+    }
+    return columns;
+}
+
+/// A regime's figures in the order of candidateColumns; its thinning is
 /// empty when it does not thin.
-std::vector<Value> candidateCells(const Candidate &c) {
+std::vector<Value> candidateCells(const Candidate &c, bool withCarbon) {
     const rotation::Regime &g = c.regime;
     const bool thins = g.thins();
     auto thinning = [&](double x) {
         return thins ? Value::number(x) : Value();
     };
-    return {thinning(g.thinFrom),     thinning(g.thinEvery),
-            thinning(g.thinVolume),   thinning(g.thinUntil.value_or(0)),
-            Value::whole(c.rotation), Value::money(c.npv),
-            Value::money(c.lev),      Value::number(c.volume)};
+    std::vector<Value> cells = {thinning(g.thinFrom),     thinning(g.thinEvery),
+                                thinning(g.thinVolume),   thinning(g.thinUntil.value_or(0)),
+                                Value::whole(c.rotation), Value::money(c.npv),
+                                Value::money(c.lev),      Value::number(c.volume)};
+    if (withCarbon) {
+        cells.push_back(Value::number(c.carbonStock));
+    }
+    return cells;
 }
 
-/// The regimes found (and the current one) as a table of kCandidateColumns.
-Table candidateTable(const std::vector<Candidate> &candidates) {
-    Table table(kCandidateColumns);
+/// The regimes found (and the current one) as a table of candidateColumns.
+Table candidateTable(const std::vector<Candidate> &candidates, bool withCarbon) {
+    Table table(candidateColumns(withCarbon));
     for (const Candidate &c : candidates) {
-        table.add(candidateCells(c));
+        table.add(candidateCells(c, withCarbon));
     }
     return table;
 }
@@ -145,28 +160,33 @@ int runOptimise(CommandContext &context) {
             ? std::optional<double>(result->best.front().score - current->score)
             : std::nullopt;
     const bool forVolume = settings.objective == rotation::Objective::kVolume;
+    const bool forCarbon = settings.objective == rotation::Objective::kCarbon;
+    const bool withCarbon = forCarbon || in.economics.carbon.counts();
     const Value gainValue = gain ? Value::number(*gain) : Value();
     if (in.format == Format::kJson) {
         ResultDocument document(run);
         Fields fields = rotationPreamble(grow, in.economics);
         fields.push_back({QStringLiteral("regimes_grown"), Value::whole(result->regimesGrown)});
         document.insert(fields);
-        document.insert(QStringLiteral("best"), candidateTable(result->best).json());
+        document.insert(QStringLiteral("best"), candidateTable(result->best, withCarbon).json());
         if (current) {
-            document.insert(QStringLiteral("current"), candidateTable({*current}).jsonRow(0));
+            document.insert(QStringLiteral("current"),
+                            candidateTable({*current}, withCarbon).jsonRow(0));
             document.insert(QStringLiteral("gain"), gainValue.json());
         }
         if (forVolume) {
             document.setUnit(QStringLiteral("gain"), units::kCubicMetresPerHa);
+        } else if (forCarbon) {
+            document.setUnit(QStringLiteral("gain"), units::kTonnesCo2ePerHa);
         }
         writeOutput(context.out, document.bytes());
     } else {
         // The current regime is a row beside the best, its gain a line below.
-        QStringList columns = kCandidateColumns;
+        QStringList columns = candidateColumns(withCarbon);
         columns.prepend(QStringLiteral("rank"));
         Table table(columns);
         auto add = [&](const QString &rank, const Candidate &c) {
-            std::vector<Value> cells = candidateCells(c);
+            std::vector<Value> cells = candidateCells(c, withCarbon);
             cells.insert(cells.begin(), Value::word(rank));
             table.add(std::move(cells));
         };
@@ -196,7 +216,7 @@ Command optimiseCommand() {
         QStringLiteral(
             "usage: arbolex-cli optimise --model M --age A --stocking N --height H\n"
             "                            (--basal-area G | --dbh D) [REGIME] [--rotation R]\n"
-            "                            [--objective lev|npv|volume] [--rate P]\n"
+            "                            [--objective lev|npv|volume|carbon] [--rate P]\n"
             "                            [--establishment-cost C] [--annual-cost C]\n"
             "                            [--prices LIST] [--valuation stand|assortment]\n"
             "                            [--assortment-prices FILE] [--max-removal PERCENT]\n"
@@ -209,14 +229,19 @@ Command optimiseCommand() {
             "volume (default 35) and leave at least --min-stocking stems/ha (default 400).\n"
             "Prints the K best (default 5): thin_from, thin_every, thin_volume, thin_until\n"
             "(empty or null without thinning), rotation, npv, lev (euro/ha) and volume\n"
-            "(total production, m3/ha). With a REGIME (or --rotation), \"current\" holds\n"
-            "its figures and \"gain\" what the best adds to the objective.\n"
+            "(total production, m3/ha), and carbon_stock (the long-term average carbon\n"
+            "stock, t CO2e/ha) when carbon is the objective or --carbon-price is given.\n"
+            "With --carbon-price, npv and lev include the carbon money. With a REGIME (or\n"
+            "--rotation), \"current\" holds its figures and \"gain\" what the best adds to\n"
+            "the objective.\n"
             "\n") +
             standOptionsHelp() + regimeOptionsHelp() +
             QStringLiteral("  --rotation R              final-cut age of the current regime\n") +
             economicsOptionsHelp() +
             QStringLiteral(
-                "  --objective lev|npv|volume  what to maximise (default lev)\n"
+                "  --objective lev|npv|volume|carbon\n"
+                "                            what to maximise (default lev; carbon: the\n"
+                "                            long-term average carbon stock)\n"
                 "  --max-removal PERCENT     largest removal per thinning (default 35)\n"
                 "  --min-stocking N          smallest stocking a thinning leaves (default 400)\n"
                 "  --top K                   regimes to print (default 5)\n") +

@@ -104,12 +104,73 @@ QJsonObject harvestJson(const Harvest &h, bool withStocking, bool byAssortments)
     return o;
 }
 
-Table cashflowTable(const rotation::RotationValue &v) {
-    Table table({QStringLiteral("age"), QStringLiteral("cost"), QStringLiteral("revenue")});
+/// The cash flow by age; with a column of carbon money when carbon counts.
+Table cashflowTable(const rotation::RotationValue &v, bool withCarbon) {
+    QStringList columns = {QStringLiteral("age"), QStringLiteral("cost"),
+                           QStringLiteral("revenue")};
+    if (withCarbon) {
+        columns << QStringLiteral("carbon");
+    }
+    Table table(columns);
     for (const rotation::CashFlowYear &c : v.cashflow) {
-        table.add({Value::whole(c.age), Value::money(c.cost), Value::money(c.revenue)});
+        std::vector<Value> cells = {Value::whole(c.age), Value::money(c.cost),
+                                    Value::money(c.revenue)};
+        if (withCarbon) {
+            cells.push_back(Value::money(c.carbon));
+        }
+        table.add(std::move(cells));
     }
     return table;
+}
+
+/// The carbon account by age, t CO₂e/ha.
+Table carbonTable(const carbon::Account &account) {
+    Table table({QStringLiteral("age"), QStringLiteral("stock_trees_tco2e_ha"),
+                 QStringLiteral("stock_products_tco2e_ha"), QStringLiteral("net_removal_tco2e_ha"),
+                 QStringLiteral("emissions_tco2e_ha"), QStringLiteral("units_tco2e_ha")});
+    for (const carbon::AccountYear &y : account.years) {
+        table.add({Value::whole(y.age), Value::number(y.trees), Value::number(y.products),
+                   Value::number(y.netRemoval), Value::number(y.emissions),
+                   Value::number(y.units)});
+    }
+    return table;
+}
+
+/// The carbon account's totals and the money split into timber and carbon.
+Fields carbonFigures(const Report &r) {
+    const rotation::RotationValue &v = r.value;
+    const carbon::Account &a = v.carbon;
+    const bool counts = r.economics.carbon.counts();
+    // The crop at the final cut, before it is felled.
+    const double felled = a.years.empty() ? 0.0 : a.years.back().harvested;
+    const double removed = a.years.empty() ? 0.0 : a.years.back().cumulativeNetRemoval;
+    return {
+        {QStringLiteral("stock_final_cut_tco2e_ha"), Value::number(felled)},
+        {QStringLiteral("long_term_average_tco2e_ha"), Value::number(a.longTermAverage)},
+        {QStringLiteral("net_removal_total_tco2e_ha"), Value::number(removed)},
+        {QStringLiteral("units_total_tco2e_ha"), Value::number(a.unitsTotal)},
+        {QStringLiteral("npv_timber"), Value::money(v.npvTimber)},
+        {QStringLiteral("npv_carbon"), Value::money(v.npvCarbon)},
+        {QStringLiteral("lev_timber"), Value::money(v.levTimber)},
+        {QStringLiteral("lev_carbon"), Value::money(v.levCarbon)},
+        {QStringLiteral("carbon_price"), counts ? Value::exact(r.economics.carbon.price) : Value()},
+        {QStringLiteral("carbon_money"),
+         Value::word(QLatin1String(carbon::paymentName(r.economics.carbon.payment)))}};
+}
+
+QJsonObject carbonJson(const Report &r) {
+    QJsonObject o;
+    for (const auto &[key, value] : carbonFigures(r)) {
+        if (key == QLatin1String("carbon_price")) {
+            o.insert(QStringLiteral("price"), value.json());
+        } else if (key == QLatin1String("carbon_money")) {
+            o.insert(QStringLiteral("money"), value.json());
+        } else {
+            o.insert(key, value.json());
+        }
+    }
+    o.insert(QStringLiteral("by_age"), carbonTable(r.value.carbon).json());
+    return o;
 }
 
 Table byAgeTable(const rotation::RotationExplorer &explorer) {
@@ -138,8 +199,10 @@ QByteArray toJson(const Report &r, const engine::Grow &grow, const RunRecord &ru
     }
     document.insert(QStringLiteral("thinnings"), thinnings);
     document.insert(QStringLiteral("final_cut"), harvestJson(v.finalCut, false, r.byAssortments()));
-    document.insert(QStringLiteral("cashflow"), cashflowTable(v).json());
+    document.insert(QStringLiteral("cashflow"),
+                    cashflowTable(v, r.economics.carbon.counts()).json());
     document.insert(QStringLiteral("by_age"), byAgeTable(r.explorer).json());
+    document.insert(QStringLiteral("carbon"), carbonJson(r));
     return document.bytes();
 }
 
@@ -163,9 +226,13 @@ QByteArray toText(Format format, const Report &r, const engine::Grow &grow) {
     text.title(QStringLiteral("harvests"));
     text.table(harvests);
     text.title(QStringLiteral("cashflow"));
-    text.table(cashflowTable(v));
+    text.table(cashflowTable(v, r.economics.carbon.counts()));
     text.title(QStringLiteral("by_age"));
     text.table(byAgeTable(r.explorer));
+    text.title(QStringLiteral("carbon"));
+    text.fields(carbonFigures(r));
+    text.title(QStringLiteral("carbon_by_age"));
+    text.table(carbonTable(v.carbon));
     return text.bytes();
 }
 
@@ -212,6 +279,7 @@ Command rotationCommand() {
                 "                            [--prices current|user|longterm|private]\n"
                 "                            [--valuation stand|assortment]\n"
                 "                            [--assortment-prices FILE]\n"
+                "                            [--carbon-price C [--carbon-money flow|units]]\n"
                 "                            [--format tsv|csv|json] [--data-dir DIR]\n"
                 "\n"
                 "Grows the stand year by year to the model's age limit, thinning the given\n"
@@ -227,6 +295,11 @@ Command rotationCommand() {
                 "the rotation explorer (by_age: the final cut at every age after the last\n"
                 "thinning). An irr that does not exist reads \"no sign change\", \"no root\" or\n"
                 "\"more than one root\" (null in JSON, with irr_note).\n"
+                "Then the carbon account of the rotation (docs/carbon.md): by age the carbon\n"
+                "in the trees and in products, the year's net removal and emissions and the\n"
+                "units issued, t CO2e/ha, and its totals; with --carbon-price the carbon\n"
+                "money counts in npv, lev, the rotations and the cash flow (column carbon),\n"
+                "and npv_timber/npv_carbon, lev_timber/lev_carbon split them.\n"
                 "\n") +
                 standOptionsHelp() + regimeOptionsHelp() +
                 QStringLiteral("  --rotation R              final-cut age, years\n") +

@@ -1,5 +1,6 @@
 #include "cli/rotationinput.hpp"
 
+#include "carbon/carbonfile.hpp"
 #include "cli/command.hpp"
 #include "prices/assortmentpricefile.hpp"
 #include "prices/costfile.hpp"
@@ -8,6 +9,7 @@
 #include "shell/settings.hpp"
 
 #include <QDir>
+#include <QFile>
 #include <QFileInfo>
 #include <QJsonArray>
 #include <QJsonObject>
@@ -175,9 +177,53 @@ rotation::Regime readRegime(const Options &options) {
     return regime;
 }
 
+/// The carbon file of the data folder. Its constants are the carbon
+/// account's; the price and the payment count only from --carbon-price and
+/// --carbon-money, so that without them every figure is that of timber. A
+/// file that is refused stops the command; without a file the constants are
+/// the defaults. True when the file was read.
+bool readCarbon(const Options &options, const QString &dataFolder, rotation::Economics &economics) {
+    const QString path = QDir(dataFolder).filePath(QLatin1String(carbon::kCarbonFile));
+    bool read = false;
+    if (QFile file(path); file.exists()) {
+        if (!file.open(QIODevice::ReadOnly)) {
+            throw UsageError{QStringLiteral("cannot read the carbon file ") + path};
+        }
+        const QByteArray text = file.readAll();
+        const carbon::CarbonReading reading =
+            carbon::readCarbonText(std::string_view(text.constData(), text.size()));
+        if (!reading.settings) {
+            throw UsageError{QStringLiteral("the carbon file ") + path + QStringLiteral(", ") +
+                             QString::fromStdString(reading.fault)};
+        }
+        economics.carbonParameters = reading.settings->parameters;
+        read = true;
+    }
+    carbon::Payment payment = carbon::Payment::kFlow;
+    if (options.has("carbon-money") &&
+        !carbon::paymentFromName(options.text("carbon-money").toStdString(), payment)) {
+        throw UsageError{QStringLiteral("--carbon-money takes flow, units or none")};
+    }
+    if (payment != carbon::Payment::kNone && options.has("carbon-money") &&
+        !options.has("carbon-price")) {
+        throw UsageError{QStringLiteral("--carbon-money ") + options.text("carbon-money") +
+                         QStringLiteral(" needs --carbon-price")};
+    }
+    if (options.has("carbon-price")) {
+        const double price = options.number("carbon-price");
+        if (!(price >= 0.0 && price <= carbon::kMaxCarbonPrice)) {
+            throw UsageError{QStringLiteral("--carbon-price must be from 0 to ") +
+                             QString::number(carbon::kMaxCarbonPrice) +
+                             QStringLiteral(" euro per t CO2e")};
+        }
+        economics.carbon = {price, payment};
+    }
+    return read;
+}
+
 std::vector<const char *> economicsOptionNames() {
-    return {"rate",   "establishment-cost", "annual-cost",
-            "prices", "valuation",          "assortment-prices"};
+    return {"rate",      "establishment-cost", "annual-cost",  "prices",
+            "valuation", "assortment-prices",  "carbon-price", "carbon-money"};
 }
 
 QString economicsOptionsHelp() {
@@ -198,7 +244,14 @@ QString economicsOptionsHelp() {
                "                            top-diameter class at the assortment prices\n"
                "  --assortment-prices FILE  the three prices, euro/m3, of 7-14, 14-20 and\n"
                "                            >20 cm (default: AssortPrices.qdm of the data "
-               "folder)\n");
+               "folder)\n"
+               "  --carbon-price C          carbon price, euro per t CO2e: carbon money counts\n"
+               "                            in the cash flow (default: none; the constants of\n"
+               "                            the carbon account come from Carbon.qdm)\n"
+               "  --carbon-money flow|units|none\n"
+               "                            flow: paid on each year's net removal, charged on\n"
+               "                            each release (default with a price); units: paid\n"
+               "                            on the carbon units issued; none: not counted\n");
 }
 
 Fields regimeFields(const rotation::Regime &regime) {
@@ -222,6 +275,7 @@ rotation::Economics readEconomics(const Options &options, const QString &dataFol
             QStringLiteral("--rate must be above 0: the land expectation value needs interest")};
     }
     const bool costsFile = readCosts(options, dataFolder, economics);
+    const bool carbonFile = readCarbon(options, dataFolder, economics);
     prices::PriceSet set = prices::kLongTermPrices;
     if (options.has("prices")) {
         const QString word = options.text("prices");
@@ -247,6 +301,14 @@ rotation::Economics readEconomics(const Options &options, const QString &dataFol
         run.fileRead(QLatin1String(prices::kCostsFile),
                      QDir(dataFolder).filePath(QLatin1String(prices::kCostsFile)));
     }
+    if (carbonFile) {
+        run.fileRead(QLatin1String(carbon::kCarbonFile),
+                     QDir(dataFolder).filePath(QLatin1String(carbon::kCarbonFile)));
+    }
+    run.inputs({{QStringLiteral("carbon_price"),
+                 options.has("carbon-price") ? Value::exact(economics.carbon.price) : Value()},
+                {QStringLiteral("carbon_money"),
+                 Value::word(QLatin1String(carbon::paymentName(economics.carbon.payment)))}});
     readValuation(options, dataFolder, economics, run);
     run.insert(QStringLiteral("prices_used"), pricesUsed(economics, set));
     return economics;

@@ -124,8 +124,8 @@ int runUncertainty(CommandContext &context) {
     try {
         QStringList arguments = context.arguments;
         const auto range = takeRateRange(arguments);
-        const Options options(
-            arguments, rotationOptionNames({"draws", "seed", "price-spread", "cost-spread"}));
+        const Options options(arguments, rotationOptionNames({"draws", "seed", "price-spread",
+                                                              "cost-spread", "carbon-spread"}));
         in = readRotationInput(options, context.dataFolder, run);
         if (options.has("draws")) {
             settings.draws = options.wholeNumber("draws", 1, 10'000'000);
@@ -140,7 +140,14 @@ int runUncertainty(CommandContext &context) {
         if (options.has("cost-spread")) {
             settings.costSpread = options.number("cost-spread");
         }
-        if (settings.priceSpread < 0.0 || settings.costSpread < 0.0) {
+        if (options.has("carbon-spread")) {
+            if (!in.economics.carbon.counts()) {
+                throw UsageError{QStringLiteral("--carbon-spread needs --carbon-price")};
+            }
+            settings.carbonSpread = options.number("carbon-spread");
+        }
+        if (settings.priceSpread < 0.0 || settings.costSpread < 0.0 ||
+            settings.carbonSpread < 0.0) {
             throw UsageError{QStringLiteral("a spread must not be negative")};
         }
         settings.rateLow = range ? rate(range->first) : in.economics.ratePercent;
@@ -156,6 +163,9 @@ int runUncertainty(CommandContext &context) {
                 {QStringLiteral("seed"), Value::whole(static_cast<qint64>(settings.seed))},
                 {QStringLiteral("price_spread"), Value::exact(settings.priceSpread)},
                 {QStringLiteral("cost_spread"), Value::exact(settings.costSpread)}});
+    if (in.economics.carbon.counts()) {
+        run.input(QStringLiteral("carbon_spread"), Value::exact(settings.carbonSpread));
+    }
     run.input(QStringLiteral("rate_range"), QJsonArray{Value::exact(settings.rateLow).json(),
                                                        Value::exact(settings.rateHigh).json()});
 
@@ -194,6 +204,8 @@ Command uncertaintyCommand() {
                 "                               [--cost-spread SD] [--rate P] [costs]\n"
                 "                               [--prices LIST] [--valuation stand|assortment]\n"
                 "                               [--assortment-prices FILE]\n"
+                "                               [--carbon-price C [--carbon-money flow|units]\n"
+                "                                [--carbon-spread SD]]\n"
                 "                               [--format tsv|csv|json]\n"
                 "\n"
                 "Grows the rotation once (at --rotation, else its economic rotation) and\n"
@@ -204,7 +216,9 @@ Command uncertaintyCommand() {
                 "Prints the 5th, 50th and 95th percentiles of NPV and LEV (euro/ha), the\n"
                 "probability that NPV is below 0, a histogram of NPV and a tornado: NPV and\n"
                 "LEV with timber prices +-20 %, the rate +-1 point, costs +-20 % and volume\n"
-                "+-10 %, one at a time.\n"
+                "+-10 %, one at a time. With --carbon-price the carbon money counts, its\n"
+                "price level is drawn log-normal too (default SD 0.3) and the tornado gets\n"
+                "carbon price +-20 %.\n"
                 "\n") +
                 standOptionsHelp() + regimeOptionsHelp() + economicsOptionsHelp() +
                 formatOptionHelp(),

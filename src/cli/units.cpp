@@ -74,6 +74,24 @@ constexpr KeyUnit kStandUnits[] = {
     {"establishment_cost", kEuroPerHa},
     {"annual_cost", kEuroPerHaYear},
     {"price", kEuroPerCubicMetre},
+    // carbon
+    {"carbon_price", kEuroPerTonneCo2e},
+    {"carbon", kEuroPerHa},
+    {"stock_trees_tco2e_ha", kTonnesCo2ePerHa},
+    {"stock_products_tco2e_ha", kTonnesCo2ePerHa},
+    {"net_removal_tco2e_ha", kTonnesCo2ePerHa},
+    {"emissions_tco2e_ha", kTonnesCo2ePerHa},
+    {"units_tco2e_ha", kTonnesCo2ePerHa},
+    {"stock_final_cut_tco2e_ha", kTonnesCo2ePerHa},
+    {"long_term_average_tco2e_ha", kTonnesCo2ePerHa},
+    {"net_removal_total_tco2e_ha", kTonnesCo2ePerHa},
+    {"units_total_tco2e_ha", kTonnesCo2ePerHa},
+    {"npv_timber", kEuroPerHa},
+    {"npv_carbon", kEuroPerHa},
+    {"lev_timber", kEuroPerHa},
+    {"lev_carbon", kEuroPerHa},
+    {"carbon_stock", kTonnesCo2ePerHa},
+    {"carbon_spread", kNumber},
     // the search and the draws
     {"regimes_grown", kNumber},
     {"gain", kEuroPerHa},
@@ -120,6 +138,11 @@ constexpr KeyUnit kEstateUnits[] = {
     {"forest_value_ha", kEuroPerHa},
     {"forest_value", kEuro},
     {"revenue", kEuro},
+    {"carbon_stock_tco2e_ha", kTonnesCo2ePerHa},
+    {"carbon_ltas_tco2e_ha", kTonnesCo2ePerHa},
+    {"carbon_units", kTonnesCo2e},
+    {"npv_carbon_ha", kEuroPerHa},
+    {"carbon_net_removal", kTonnesCo2e},
 };
 
 template <std::size_t N> const char *find(const KeyUnit (&table)[N], QStringView key) {

@@ -24,6 +24,9 @@ inline constexpr const char *kEuro = "EUR";
 inline constexpr const char *kEuroPerHa = "EUR/ha";
 inline constexpr const char *kEuroPerHaYear = "EUR/ha/yr";
 inline constexpr const char *kEuroPerCubicMetre = "EUR/m3";
+inline constexpr const char *kEuroPerTonneCo2e = "EUR/t CO2e";
+inline constexpr const char *kTonnesCo2ePerHa = "t CO2e/ha";
+inline constexpr const char *kTonnesCo2e = "t CO2e";
 inline constexpr const char *kPercent = "%";
 inline constexpr const char *kPercentPerYear = "%/yr";
 /// A pure number: a count, an identifier, a share or a factor.

@@ -44,7 +44,9 @@ std::optional<std::int64_t> units(const std::string &text, int decimals) {
 
 void Forecast::add(const RowResult &row) {
     for (const ForecastEntry &h : row.harvests) {
-        add(h.year, row.species, {h.thinningLitres, h.finalCutLitres, h.revenueCents});
+        add(h.year, row.species,
+            {h.thinningLitres, h.finalCutLitres, h.revenueCents, h.carbonRemovalKg,
+             h.carbonUnitsKg});
     }
 }
 
@@ -87,30 +89,36 @@ std::vector<Forecast::Line> Forecast::lines(int firstYear) const {
 
 std::vector<ResultColumn> forecastColumns() {
     using enum ColumnType;
-    return {{"year", kInteger},
-            {"species", kText},
-            {"thinning_volume", kReal},
-            {"final_cut_volume", kReal},
-            {"revenue", kReal}};
+    return {{"year", kInteger},          {"species", kText}, {"thinning_volume", kReal},
+            {"final_cut_volume", kReal}, {"revenue", kReal}, {"carbon_net_removal", kReal},
+            {"carbon_units", kReal}};
 }
 
 std::vector<std::string> forecastValues(const Forecast::Line &line) {
-    return {std::to_string(line.year), line.species, fixed(line.totals.thinningLitres, 3),
-            fixed(line.totals.finalCutLitres, 3), fixed(line.totals.revenueCents, 2)};
+    return {std::to_string(line.year),
+            line.species,
+            fixed(line.totals.thinningLitres, 3),
+            fixed(line.totals.finalCutLitres, 3),
+            fixed(line.totals.revenueCents, 2),
+            fixed(line.totals.carbonRemovalKg, 3),
+            fixed(line.totals.carbonUnitsKg, 3)};
 }
 
 std::optional<Forecast::Line> forecastLine(const std::vector<std::string> &values) {
-    if (values.size() != 5) {
+    if (values.size() != 7) {
         return std::nullopt;
     }
     const std::optional<long long> year = wholeNumber(values[0]);
     const auto thinning = units(values[2], 3);
     const auto finalCut = units(values[3], 3);
     const auto revenue = units(values[4], 2);
-    if (!year || values[1].empty() || !thinning || !finalCut || !revenue) {
+    const auto removal = units(values[5], 3);
+    const auto issued = units(values[6], 3);
+    if (!year || values[1].empty() || !thinning || !finalCut || !revenue || !removal || !issued) {
         return std::nullopt;
     }
-    return Forecast::Line{static_cast<int>(*year), values[1], {*thinning, *finalCut, *revenue}};
+    return Forecast::Line{
+        static_cast<int>(*year), values[1], {*thinning, *finalCut, *revenue, *removal, *issued}};
 }
 
 } // namespace arbolex::estate

@@ -23,11 +23,16 @@ struct ForecastTotals {
     std::int64_t thinningLitres = 0;
     std::int64_t finalCutLitres = 0;
     std::int64_t revenueCents = 0;
+    /// Net carbon removal and carbon units issued, kg CO₂e.
+    std::int64_t carbonRemovalKg = 0;
+    std::int64_t carbonUnitsKg = 0;
 
     ForecastTotals &operator+=(const ForecastTotals &o) {
         thinningLitres += o.thinningLitres;
         finalCutLitres += o.finalCutLitres;
         revenueCents += o.revenueCents;
+        carbonRemovalKg += o.carbonRemovalKg;
+        carbonUnitsKg += o.carbonUnitsKg;
         return *this;
     }
     bool operator==(const ForecastTotals &) const = default;

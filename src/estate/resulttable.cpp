@@ -60,6 +60,10 @@ const std::vector<ResultColumn> &figureColumns() {
                                                       {"lev", kReal},
                                                       {"forest_value_ha", kReal},
                                                       {"forest_value", kReal},
+                                                      {"carbon_stock_tco2e_ha", kReal},
+                                                      {"carbon_ltas_tco2e_ha", kReal},
+                                                      {"carbon_units", kReal},
+                                                      {"npv_carbon_ha", kReal},
                                                       {"status", kText}};
     return columns;
 }
@@ -89,6 +93,10 @@ void figureValues(const RowResult &row, std::vector<std::string> &values) {
     values.push_back(moneyForArea(row.lev, area));
     values.push_back(money(row.forestValue));
     values.push_back(moneyForArea(row.forestValue, area));
+    values.push_back(quantity(row.carbonStock));
+    values.push_back(quantity(row.carbonLongTermAverage));
+    values.push_back(fixed(row.carbonUnits * area, 3));
+    values.push_back(money(row.npvCarbon));
     values.emplace_back(statusWord(row.status));
 }
 

@@ -113,12 +113,14 @@ void RowEvaluator::grow(const RowPlan &plan, RowResult &result) {
         result.thinningVolume += double{t.volume};
         result.harvests.push_back({presentYear + t.age,
                                    whole(double{t.volume} * plan.areaHa * 1000.0), 0,
-                                   whole(t.revenue * plan.areaHa * 100.0)});
+                                   whole(t.revenue * plan.areaHa * 100.0), 0, 0});
     }
     const rotation::Harvest &f = value.finalCut;
     result.harvests.push_back({presentYear + f.age, 0,
                                whole(double{f.volume} * plan.areaHa * 1000.0),
-                               whole(f.revenue * plan.areaHa * 100.0)});
+                               whole(f.revenue * plan.areaHa * 100.0), 0, 0});
+    carbon(value.carbon, path->presentAge, presentYear, plan.areaHa, result);
+    result.npvCarbon = value.npvCarbon;
     result.thinningCount = static_cast<int>(value.thinnings.size());
     result.yieldClass = rotation::pathYieldClass(*path);
     result.finalCutAge = f.age;
@@ -129,6 +131,24 @@ void RowEvaluator::grow(const RowPlan &plan, RowResult &result) {
     result.npv = value.npv;
     result.lev = value.lev;
     result.forestValue = value.forestValue;
+}
+
+void RowEvaluator::carbon(const carbon::Account &account, int presentAge, int presentYear,
+                          double areaHa, RowResult &result) {
+    if (account.years.size() <= static_cast<std::size_t>(presentAge)) {
+        return;
+    }
+    const carbon::AccountYear &today = account.years[static_cast<std::size_t>(presentAge)];
+    result.carbonStock = today.trees + today.harvested;
+    result.carbonLongTermAverage = account.longTermAverage;
+    result.carbonUnits = account.unitsTotal;
+    // The years from today on: what is removed and issued before it is past.
+    for (std::size_t a = static_cast<std::size_t>(presentAge); a < account.years.size(); ++a) {
+        const carbon::AccountYear &y = account.years[a];
+        result.harvests.push_back({presentYear + y.age, 0, 0, 0,
+                                   whole(y.netRemoval * areaHa * 1000.0),
+                                   whole(y.units * areaHa * 1000.0)});
+    }
 }
 
 } // namespace arbolex::estate

@@ -29,6 +29,9 @@ private:
     };
 
     void grow(const RowPlan &plan, RowResult &result);
+    /// The carbon figures of the row and its carbon by calendar year from today.
+    static void carbon(const carbon::Account &account, int presentAge, int presentYear,
+                       double areaHa, RowResult &result);
 
     const Layout &m_layout;
     const EstateDefaults &m_defaults;

@@ -29,6 +29,10 @@ struct ForecastEntry {
     std::int64_t thinningLitres = 0;
     std::int64_t finalCutLitres = 0;
     std::int64_t revenueCents = 0;
+    /// Net carbon removal of the year and the carbon units issued in it,
+    /// whole kg CO₂e for the sub-compartment's area.
+    std::int64_t carbonRemovalKg = 0;
+    std::int64_t carbonUnitsKg = 0;
 };
 
 struct RowResult {
@@ -64,8 +68,15 @@ struct RowResult {
     std::optional<double> npv;
     std::optional<double> lev;
     std::optional<double> forestValue;
+    /// Carbon in the trees today and their long-term average stock over the
+    /// rotation, t CO₂e/ha; the carbon units of the rotation, t CO₂e/ha; and
+    /// the NPV of the carbon money, euro/ha (0 unless carbon counts).
+    double carbonStock = 0.0;
+    double carbonLongTermAverage = 0.0;
+    double carbonUnits = 0.0;
+    std::optional<double> npvCarbon;
 
-    /// The row's harvests by calendar year.
+    /// The row's harvests and carbon by calendar year.
     std::vector<ForecastEntry> harvests;
 
     /// What the sink made of the row on the thread that grew it (its results

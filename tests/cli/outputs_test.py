@@ -46,10 +46,11 @@ COMMANDS = {
     "grow": ["grow", *STAND, "--to", "40", "--by", "5"],
     "assort": ["assort", "--model", "0", "--age", "40", "--stocking", "900", "--height", "20",
                "--basal-area", "40"],
-    "rotation": ["rotation", *STAND, *REGIME, *MONEY, "--valuation", "assortment"],
-    "optimise": ["optimise", *STAND, *REGIME, *MONEY, "--top", "3"],
+    "rotation": ["rotation", *STAND, *REGIME, *MONEY, "--valuation", "assortment",
+                 "--carbon-price", "56", "--carbon-money", "units"],
+    "optimise": ["optimise", *STAND, *REGIME, *MONEY, "--top", "3", "--objective", "carbon"],
     "uncertainty": ["uncertainty", *STAND, *REGIME, *MONEY, "--draws", "400", "--seed", "7",
-                    "--rate-range", "2", "4", "--cost-spread", "0.1"],
+                    "--rate-range", "2", "4", "--cost-spread", "0.1", "--carbon-price", "30"],
 }
 
 TIME = re.compile(rb'"started": ?"[^"]*"')
@@ -297,9 +298,10 @@ class RerunTest(DataFolder, unittest.TestCase):
         given = {
             "rotation": ["rotation", "--model", "0", "--age", "15", "--stocking", "2500",
                          "--height", "7", "--dbh", "10.0925", *REGIME, "--rate", "2.75"],
-            "optimise": [*COMMANDS["optimise"], "--objective", "volume"],
+            "optimise": [*COMMANDS["optimise"][:-2], "--objective", "volume"],
             "uncertainty": ["uncertainty", *STAND, "--rotation", "45", "--draws", "300",
                             "--price-spread", "0.3"],
+            "carbon": ["rotation", *STAND, *REGIME, "--carbon-price", "40"],
         }
         for name, arguments in given.items():
             with self.subTest(command=name):

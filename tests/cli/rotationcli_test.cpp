@@ -276,14 +276,21 @@ TEST_F(RotationCliTest, UncertaintyRepeatsWithItsSeed) {
 INSTANTIATE_TEST_SUITE_P(
     CliSearch, RotationCliBadArgumentsTest,
     ::testing::Values(
-        BadRotation{"--objective profit", "--objective takes lev, npv or volume", "optimise"},
+        BadRotation{"--objective profit", "--objective takes lev, npv, volume or carbon",
+                    "optimise"},
         BadRotation{"--max-removal 150", "--max-removal is a percentage up to 100", "optimise"},
         BadRotation{"--top 0", "--top must be a whole number from 1 to 100", "optimise"},
         BadRotation{"--rate -2", "--rate must be above 0", "optimise"},
         BadRotation{"--rate-range 4 2", "--rate-range: LO is above HI", "uncertainty"},
         BadRotation{"--rate-range 0 3", "\"0\" is not a rate above 0", "uncertainty"},
         BadRotation{"--rate-range 2", "--rate-range takes two rates", "uncertainty"},
-        BadRotation{"--rotation 70", "past the model's age limit 60", "uncertainty"}));
+        BadRotation{"--rotation 70", "past the model's age limit 60", "uncertainty"},
+        BadRotation{"--carbon-money units", "--carbon-money units needs --carbon-price",
+                    "optimise"},
+        BadRotation{"--carbon-price -5", "--carbon-price must be from 0 to 10000", "uncertainty"},
+        BadRotation{"--carbon-price 5 --carbon-money monthly",
+                    "--carbon-money takes flow, units or none", "optimise"},
+        BadRotation{"--carbon-spread 0.2", "--carbon-spread needs --carbon-price", "uncertainty"}));
 
 } // namespace
 

@@ -8,6 +8,8 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
 #include <cctype>
 #include <cmath>
 
@@ -131,9 +133,18 @@ TEST_F(EstateRowTest, GrowsAndValuesTheStandAsTheRotationLibraryDoes) {
     EXPECT_EQ(r.npv, v.npv);
     EXPECT_EQ(r.lev, v.lev);
     EXPECT_EQ(r.forestValue, v.forestValue);
-    // One harvest per thinning and the final cut, for the 2.5 ha.
-    ASSERT_EQ(r.harvests.size(), 7U);
-    EXPECT_EQ(r.harvests.back().finalCutLitres, std::llround(double{v.finalCut.volume} * 2500.0));
+    // One harvest per thinning and the final cut, and the carbon of every
+    // year from today, for the 2.5 ha.
+    const auto harvests = std::count_if(r.harvests.begin(), r.harvests.end(), [](const auto &h) {
+        return h.thinningLitres > 0 || h.finalCutLitres > 0;
+    });
+    EXPECT_EQ(harvests, 7);
+    EXPECT_EQ(r.harvests[6].finalCutLitres, std::llround(double{v.finalCut.volume} * 2500.0));
+    EXPECT_EQ(r.harvests.size(), 7U + static_cast<std::size_t>(48 - path->presentAge + 1));
+    EXPECT_EQ(r.harvests.back().carbonRemovalKg,
+              std::llround(v.carbon.years.back().netRemoval * 2500.0));
+    EXPECT_EQ(r.carbonLongTermAverage, v.carbon.longTermAverage);
+    EXPECT_LT(r.harvests.back().carbonRemovalKg, 0) << "the final cut releases carbon";
 }
 
 TEST_F(EstateRowTest, TheYieldClassIsTheStandsProductivityWhateverTheFinalCut) {
