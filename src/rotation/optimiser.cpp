@@ -66,7 +66,10 @@ public:
         // such failures from the user's report.
         if (std::optional<GrowthPath> path =
                 growPath(m_quiet, m_stand, regime, failure, &m_limits)) {
-            if (m_economics.valuation == Valuation::kAssortments) {
+            // Valued by assortments or with its carbon, every final cut reads
+            // the thinnings' classes: divided once for all of them.
+            if (m_economics.valuation == Valuation::kAssortments ||
+                m_economics.carbon.counts() || m_settings.objective == Objective::kCarbon) {
                 divideThinnings(*path);
             }
             scorePath(*path, regime);
