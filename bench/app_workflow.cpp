@@ -1,25 +1,16 @@
 // The window logic at the speed a user feels it: a grow command, a thinning
 // preview, a whole thinning loop; and the headless runner as a whole process.
-#include "economics/inpvview.hpp"
-#include "economics/npvwindowlogic.hpp"
-#include "economics/pricedata.hpp"
-#include "economics/prices.hpp"
-#include "engine/grow.hpp"
-#include "shell/enginereport.hpp"
+#include "cli/headlesssession.hpp"
+#include "prices/pricedata.hpp"
+#include "prices/prices.hpp"
 #include "shell/errorlog.hpp"
-#include "shell/iclipboard.hpp"
-#include "shell/interactive.hpp"
-#include "silentinteractive.hpp"
-#include "thinning/headlessthinview.hpp"
-#include "thinning/thinwindowlogic.hpp"
-#include "workflow/headlessmainview.hpp"
-#include "workflow/mainwindowlogic.hpp"
 
 #include <QCoreApplication>
 #include <QDir>
 #include <QFile>
 #include <QProcess>
 #include <QTemporaryDir>
+#include <QTextStream>
 
 #include <benchmark/benchmark.h>
 
@@ -28,23 +19,20 @@ namespace {
 using arbolex::thinning::ThinControl;
 using arbolex::workflow::MainControl;
 
-using arbolex::bench::SilentInteractive;
-
-/// A main window and a thinning window without a screen.
+/// The program's windows without a screen; messages are thrown away.
 struct Windows {
     QTemporaryDir dir;
-    arbolex::shell::ErrorLog log{dir.path()};
-    SilentInteractive interactive;
-    arbolex::shell::EngineReport report{interactive, log};
-    arbolex::engine::Grow grow{&report};
-    arbolex::economics::Prices prices;
-    arbolex::workflow::HeadlessMainView view;
-    arbolex::workflow::MainWindowLogic main{grow, prices, log, dir.path(), view, interactive};
-    arbolex::thinning::HeadlessThinView thinView;
-    arbolex::thinning::ThinWindowLogic thin{main, thinView, interactive};
+    QFile silence{QStringLiteral("/dev/null")};
+    QTextStream messages{&silence};
+    arbolex::cli::HeadlessSession session{dir.path(), messages};
+    arbolex::workflow::MainWindowLogic &main = session.main();
+    arbolex::thinning::ThinWindowLogic &thin = session.thinning();
+    arbolex::shell::ErrorLog &log = session.session().errorLog();
+    arbolex::prices::Prices &prices = session.session().prices();
+    arbolex::work::StandWork &work = session.work();
 
     Windows() {
-        main.attachThinning(&thin);
+        silence.open(QIODevice::WriteOnly);
         main.mnuModel_Click(0);
     }
 
@@ -69,7 +57,7 @@ void BM_GrowCommand10To60(benchmark::State &state) {
         w->main.cmdGrow_Click();
         benchmark::DoNotOptimize(w->main.table().rowCount());
         state.PauseTiming();
-        if (w->main.table().rowCount() != 52 || w->interactive.messages != 0) {
+        if (w->main.table().rowCount() != 52 || w->session.interactive().messagesShown() != 0) {
             state.SkipWithError("the grow did not append 51 rows");
         }
         w.reset();
@@ -90,7 +78,7 @@ void BM_ThinPreviewByVolume(benchmark::State &state) {
         w.thin.cmdThin_Click();
         benchmark::DoNotOptimize(w.thin.work().postBasalArea);
     }
-    if (!w.thin.work().previewed || w.interactive.messages != 0) {
+    if (!w.thin.work().previewed || w.session.interactive().messagesShown() != 0) {
         state.SkipWithError("no preview");
     }
 }
@@ -183,20 +171,20 @@ void BM_FinalCutAndCashFlow(benchmark::State &state) {
     for (auto _ : state) {
         state.PauseTiming();
         auto w = std::make_unique<Windows>();
-        arbolex::economics::GetPricesFromFiles(QStringLiteral(ARBOLEX_BIN_DIR), w->prices.data(),
-                                               w->log);
-        w->prices.selectPriceSet(arbolex::economics::kCurrentPrices);
+        arbolex::prices::GetPricesFromFiles(QStringLiteral(ARBOLEX_BIN_DIR), w->prices.data(),
+                                            w->log);
+        w->prices.selectPriceSet(arbolex::prices::kCurrentPrices);
         w->typeStand("10", "60", "1");
         w->main.typeText(MainControl::txtFromH, QStringLiteral("5"));
         w->main.cmdGrow_Click();
-        w->interactive.answer = true;
+        w->session.queueAnswer(true);
         state.ResumeTiming();
         w->main.cmdFinalCut_Click();
-        w->main.cashFlow().LoadTimberRevenues(w->main.timberRevenue());
-        const int years = w->main.cashFlow().ComputeCashFlow(w->log);
-        benchmark::DoNotOptimize(w->main.cashFlow().SumNPV());
+        w->work.cashFlow().LoadTimberRevenues(w->work.timberRevenue());
+        const int years = w->work.cashFlow().ComputeCashFlow(w->log);
+        benchmark::DoNotOptimize(w->work.cashFlow().SumNPV());
         state.PauseTiming();
-        if (years != 51 || w->main.cashFlow().SumNPV() <= 0.0) {
+        if (years != 51 || w->work.cashFlow().SumNPV() <= 0.0) {
             state.SkipWithError("the final cut laid out no 51-year cash flow");
         }
         w.reset();
@@ -209,12 +197,12 @@ BENCHMARK(BM_FinalCutAndCashFlow)->Unit(benchmark::kMicrosecond);
 void BM_ComputeCashFlow60Years(benchmark::State &state) {
     QTemporaryDir dir;
     arbolex::shell::ErrorLog log(dir.path());
-    arbolex::economics::CashFlow flow;
+    arbolex::work::CashFlow flow;
     flow.SetRotationLength(0, 60);
     flow.DimNPVArrays();
     for (int i = 0; i < flow.years(); ++i) {
-        flow.setMatrix(arbolex::economics::kCfCost, i, 25.0 * i);
-        flow.setMatrix(arbolex::economics::kCfTimberRevenue, i, i % 5 == 0 ? 900.0 : 0.0);
+        flow.setMatrix(arbolex::work::kCfCost, i, 25.0 * i);
+        flow.setMatrix(arbolex::work::kCfTimberRevenue, i, i % 5 == 0 ? 900.0 : 0.0);
     }
     for (auto _ : state) {
         benchmark::DoNotOptimize(flow.ComputeCashFlow(log));
@@ -226,23 +214,12 @@ BENCHMARK(BM_ComputeCashFlow60Years)->Unit(benchmark::kMicrosecond);
 /// Opening the net present value window's logic on 60 years: the grid, the
 /// timber revenues, the typed values and the net present value.
 void BM_OpenNpvWindow60Years(benchmark::State &state) {
-    QTemporaryDir dir;
-    arbolex::shell::ErrorLog log(dir.path());
-    SilentInteractive interactive;
-    arbolex::shell::HeadlessClipboard clipboard;
-    arbolex::economics::HeadlessNpvView view;
-    arbolex::economics::TimberRevenue revenue;
-    for (int age = 20; age < 60; age += 5) {
-        revenue.add(age, 700.0);
-    }
-    revenue.add(60, 40000.0);
-    arbolex::economics::CashFlow flow;
-    flow.SetRotationLength(0, 60);
-    flow.DimNPVArrays();
-    arbolex::economics::NpvWindowLogic npv(flow, revenue, log, view, interactive, clipboard);
+    Windows w;
+    w.work.cashFlow().SetRotationLength(0, 60);
+    w.work.cashFlow().DimNPVArrays();
     for (auto _ : state) {
-        npv.Form_Load();
-        benchmark::DoNotOptimize(npv.grid().size());
+        w.session.npv().Form_Load();
+        benchmark::DoNotOptimize(w.session.npv().grid().size());
     }
 }
 BENCHMARK(BM_OpenNpvWindow60Years)->Unit(benchmark::kMicrosecond);

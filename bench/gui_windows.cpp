@@ -1,12 +1,15 @@
 // The windows as a user opens them, drawn off screen: the net present value
 // window on a 60-year cash flow, from the command to the window laid out.
-#include "economics/mdlnpv.hpp"
 #include "economics/npvwindowlogic.hpp"
+#include "engine/grow.hpp"
+#include "prices/prices.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/iclipboard.hpp"
 #include "shell/interactive.hpp"
 #include "silentinteractive.hpp"
 #include "ui/npvwindow.hpp"
+#include "work/mdlnpv.hpp"
+#include "work/standwork.hpp"
 
 #include <QApplication>
 #include <QTemporaryDir>
@@ -22,16 +25,14 @@ void BM_ShowNpvWindow60Years(benchmark::State &state) {
     arbolex::shell::ErrorLog log(dir.path());
     SilentInteractive interactive;
     arbolex::shell::HeadlessClipboard clipboard;
-    arbolex::economics::TimberRevenue revenue;
-    for (int age = 20; age <= 60; age += 5) {
-        revenue.add(age, 800.0);
-    }
-    arbolex::economics::CashFlow flow;
-    flow.SetRotationLength(0, 60);
-    flow.DimNPVArrays();
+    arbolex::engine::Grow grow;
+    arbolex::prices::Prices prices;
+    arbolex::work::StandWork work(grow, prices, log);
+    work.cashFlow().SetRotationLength(0, 60);
+    work.cashFlow().DimNPVArrays();
     for (auto _ : state) {
         arbolex::ui::NpvWindow window;
-        arbolex::economics::NpvWindowLogic npv(flow, revenue, log, window, interactive, clipboard);
+        arbolex::economics::NpvWindowLogic npv(work, window, interactive, clipboard);
         window.attach(npv);
         npv.Form_Load();
         npv.cmdNPV_Click();

@@ -7,8 +7,8 @@
 #   (default 100,000) on 1 and 2 threads;
 #   the desktop program under the offscreen platform: start to main window,
 #   then the grow command 10 -> 60 and the economics window's first figures
-#   (its --time-windows run, which times each from the command to the figures
-#   drawn).
+#   (runner scripts bench/scripts/desktop-*.arb through arbolex --script,
+#   whose `time` lines time each from the command to the windows drawn).
 # Each command-line run is repeated with the vector state cleared before every
 # pow, exp and log by a preloaded library (clearvectorstate.so, built with the
 # benchmarks): a program that guards its numeric work gains at most 10 % from
@@ -94,15 +94,17 @@ if [[ -x "$desktop" ]]; then
             --data-dir "$data" "$@"
     }
     startup=$(median_ms run_desktop --quit-when-shown)
-    # Each timing run prints its own figure; the median of 5 of each.
+    # Each timing run prints its own figure ("TIME<TAB>line<TAB>ms"); the median of 5 of each.
+    scripts=$(cd "$here/../bench/scripts" && pwd)
     for ((i = 0; i < 5; ++i)); do
         for stage in grow economics; do
-            run_desktop --time-windows "$stage" 2>/dev/null >>"$work/windows.txt" || true
+            run_desktop --script "$scripts/desktop-$stage.arb" 2>&1 >/dev/null |
+                awk -F'\t' -v s="$stage" '$1 == "TIME" { print s, $3 }' >>"$work/windows.txt" || true
         done
     done
     awk -v s="$startup" '
-        /^grow 10 to 60/ { grow[++g] = $(NF - 1) }
-        /^economics window/ { econ[++e] = $(NF - 1) }
+        $1 == "grow" { grow[++g] = $2 }
+        $1 == "economics" { econ[++e] = $2 }
         function median(a, n,    i, j, t) {
             for (i = 1; i <= n; ++i) for (j = i + 1; j <= n; ++j) if (a[j] < a[i]) { t = a[i]; a[i] = a[j]; a[j] = t }
             return n ? a[int((n + 1) / 2)] : -1

@@ -1,27 +1,23 @@
 #!/usr/bin/env bash
 # Screenshots of the desktop program as a user sees it, under a virtual X
-# server: the model choice window, the main window as it opens, the main
-# window after growing a young Sitka spruce stand (model 0, age 15, 2500
-# stems/ha, 7 m, 20 m²/ha, to 50 by 5), the thinning window opened on the
-# same stand grown to 30 before and after previewing a removal of 60 m³/ha
-# (the whole screen, and the thinning window alone), and the main window
-# after a thinning loop: 30 m³/ha at 20, then every 5 years until 50; a
-# whole rotation (age 15, 2500 stems/ha, 9 m, 22 m²/ha, 10 ha, thinned by
-# 50 m³/ha at 30, grown to 60): the final cut with its question, the summary,
-# and the net present value window; and the timber prices window as Show
-# Timber Prices opens it (the whole screen, and the window alone); and the
-# assortment prices window with changes allowed.
+# server: the model choice window, the main window as it opens, and one shot
+# for every runner script in scripts/shots/ (each puts the windows into the
+# state its first comment line describes: a grown stand, a thinning preview,
+# a rotation's final cut, summary and cash flow, the charts, the economics
+# window's pages, the assortment reports, documents and the estate).
 #
-#   scripts/screenshot.sh [OUTPUT_FOLDER]      (default /tmp/shots)
+#   scripts/screenshot.sh [OUTPUT_FOLDER] [SHOT...]   (default /tmp/shots, every shot)
 #
-# ARBOLEX_EXE names the program (default build-ui/bin/arbolex). Each run works
-# on a fresh copy of data/ and a throw-away settings folder, so neither the
-# shipped data nor the user's settings change.
+# ARBOLEX_EXE names the program (default build/bin/arbolex). Each shot works on
+# a fresh copy of data/ and a throw-away settings folder, so neither the
+# shipped data nor the user's settings change. A shot of a window that opens
+# over the main window also saves that window alone as NAME-window.png.
 set -euo pipefail
 
 root=$(cd "$(dirname "$0")/.." && pwd)
-exe=${ARBOLEX_EXE:-$root/build-ui/bin/arbolex}
+exe=${ARBOLEX_EXE:-$root/build/bin/arbolex}
 out=${1:-/tmp/shots}
+shift || true
 screen=${ARBOLEX_SCREEN:-1400x900x24}
 settle=${ARBOLEX_SETTLE:-4}
 
@@ -30,108 +26,69 @@ mkdir -p "$out"
 work=$(mktemp -d)
 trap 'rm -rf "$work"' EXIT
 
-# shoot NAME ARGS...: starts the program with ARGS, waits, saves NAME.png
-# (the whole screen). With WINDOW_TITLE set, the top-level window whose title
-# contains it is saved as well, alone, as NAME-window.png.
+# The window a shot also saves alone, by the start of its title.
+window_of() {
+    case "$1" in
+    thin-*) echo "Thinning at age" ;;
+    npv) echo "Net Present Value" ;;
+    timber-prices) echo "Timber Prices" ;;
+    assort-prices) echo "Assortment Prices" ;;
+    assort-user) echo "User assortment categories" ;;
+    assort-growth | assort-thinning | assort-user-report) echo "Assortment at age" ;;
+    economics-table) echo "" ;;
+    economics-*) echo "Economics of the rotation" ;;
+    estate-table | estate-chart | estate-marked) echo "Estate" ;;
+    *) echo "" ;;
+    esac
+}
+
+# Files some scripts open: a damaged document, an estate with two bad rows.
+prepare() {
+    printf '{\n    "format": "ARBOLEX sub-compartment",\n    "version": 1,\n    "model": 0,\n    "table": {"rows": [\n' \
+        >/tmp/arbolex-damaged.arbolex
+    cat "$root/data/examples/estate.csv" - >"$work/estate-marked.csv" <<'ROWS'
+GL-04,Glenmore,0,15,lots,7.0,20.0,,3.0,20,5,40,,
+AR-04,Ardnish,3,95,1500,20.0,40.0,,2.0,0,,,,
+ROWS
+}
+
+# shoot NAME ARGS...: starts the program with ARGS in the work folder, waits,
+# saves NAME.png (the whole screen) and, for a window of window_of, that
+# window alone as NAME-window.png.
 shoot() {
     local name=$1
     shift
     rm -rf "$work/data" "$work/config"
     cp -r "$root/data" "$work/data"
     mkdir -p "$work/config"
-    XDG_CONFIG_HOME="$work/config" xvfb-run -a -s "-screen 0 $screen" \
-        bash -c '
+    (cd "$work" && XDG_CONFIG_HOME="$work/config" SHOT="$out/$name.png" \
+        WINDOW_TITLE="$(window_of "$name")" SETTLE=${SETTLE:-$settle} \
+        xvfb-run -a -s "-screen 0 $screen" bash -c '
             "$0" "$@" &
             pid=$!
             sleep "$SETTLE"
             import -window root "$SHOT"
-            if [ -n "${WINDOW_TITLE:-}" ]; then
+            if [ -n "$WINDOW_TITLE" ]; then
                 id=$(xwininfo -root -tree | grep -F "$WINDOW_TITLE" | head -n 1 | awk "{print \$1}")
                 [ -n "$id" ] && import -window "$id" "${SHOT%.png}-window.png"
             fi
             kill "$pid" 2>/dev/null || true
             wait "$pid" 2>/dev/null || true
-        ' "$exe" --data-dir "$work/data" "$@"
+        ' "$exe" --data-dir "$work/data" "$@")
     echo "$out/$name.png"
-    if [ -n "${WINDOW_TITLE:-}" ] && [ -f "$out/$name-window.png" ]; then
-        echo "$out/$name-window.png"
-    fi
 }
-export SETTLE=$settle
-export WINDOW_TITLE=
 
-export SHOT="$out/model-choice.png"
-shoot model-choice
-export SHOT="$out/main-start.png"
-shoot main-start --no-intro
-export SHOT="$out/main-grown.png"
-shoot main-grown --no-intro --demo-grow
-
-export WINDOW_TITLE="Thinning at age"
-export SHOT="$out/thin-open.png"
-rm -f "${SHOT%.png}-window.png"
-shoot thin-open --no-intro --demo-thin open
-export SHOT="$out/thin-preview.png"
-rm -f "${SHOT%.png}-window.png"
-shoot thin-preview --no-intro --demo-thin preview
-export WINDOW_TITLE=
-export SHOT="$out/main-thin-loop.png"
-shoot main-thin-loop --no-intro --demo-thin loop
-
-export SHOT="$out/main-final-cut.png"
-shoot main-final-cut --no-intro --demo-rotation finalcut
-export SHOT="$out/main-summary.png"
-shoot main-summary --no-intro --demo-rotation summary
-export WINDOW_TITLE="Net Present Value"
-export SHOT="$out/npv.png"
-rm -f "${SHOT%.png}-window.png"
-shoot npv --no-intro --demo-rotation npv
-export WINDOW_TITLE="Timber Prices"
-export SHOT="$out/timber-prices.png"
-rm -f "${SHOT%.png}-window.png"
-shoot timber-prices --no-intro --demo-prices
-export WINDOW_TITLE=
-# Assortments: the report of a growth row at 35, the report of the trees a
-# 60 m³/ha thinning at 30 removes, the user categories window and a report
-# over the categories in use, and the main window with the assortment rows
-# of an accepted thinning.
-export WINDOW_TITLE="Assortment at age"
-for stage in growth thinning user-report; do
-    export SHOT="$out/assort-$stage.png"
-    rm -f "${SHOT%.png}-window.png"
-    shoot "assort-$stage" --no-intro --demo-assort "$stage"
+prepare
+if [ $# -eq 0 ]; then
+    shoot model-choice
+    shoot main-start --no-intro
+fi
+for script in "$root"/scripts/shots/*.arb; do
+    name=$(basename "$script" .arb)
+    if [ $# -gt 0 ] && [[ " $* " != *" $name "* ]]; then
+        continue
+    fi
+    # The economics window's optimiser runs a few seconds before its table shows.
+    case "$name" in economics-optimiser | economics-applied | economics-table) extra=4 ;; *) extra=0 ;; esac
+    SETTLE=$((settle + extra)) shoot "$name" --no-intro --script "$script"
 done
-export WINDOW_TITLE="User assortment categories"
-export SHOT="$out/assort-user.png"
-rm -f "${SHOT%.png}-window.png"
-shoot assort-user --no-intro --demo-assort user
-export WINDOW_TITLE=
-export SHOT="$out/main-assort-rows.png"
-shoot main-assort-rows --no-intro --demo-assort rows
-
-# Charts: a rotation thinned by 40 m³/ha at 25 and every 5 years until 45,
-# felled at 60, its cash flow computed with planting and cleaning costs; the
-# main window with each chart beside the table.
-for chart in stand increments cashflow; do
-    export SHOT="$out/charts-$chart.png"
-    shoot "charts-$chart" --no-intro --demo-charts --demo-chart-tab "$chart"
-done
-# Economics: the economics window on the rotation above at 3 % with costs of
-# establishment and upkeep: the value of the regime and NPV, LEV and MAI by
-# rotation age, the optimiser's five best regimes, the best of them applied to
-# the table, the tornado and the Monte Carlo histogram.
-export WINDOW_TITLE="Economics of the rotation"
-for stage in rotation optimiser applied sensitivity montecarlo; do
-    export SHOT="$out/economics-$stage.png"
-    rm -f "${SHOT%.png}-window.png"
-    shoot "economics-$stage" --no-intro --demo-economics "$stage"
-done
-export WINDOW_TITLE=
-export SHOT="$out/economics-table.png"
-shoot economics-table --no-intro --demo-economics table
-# The assortment prices window, opened with changes allowed.
-export WINDOW_TITLE="Assortment Prices"
-export SHOT="$out/assort-prices.png"
-rm -f "${SHOT%.png}-window.png"
-shoot assort-prices --no-intro --demo-assort-prices
-export WINDOW_TITLE=

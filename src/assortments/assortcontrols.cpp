@@ -1,6 +1,6 @@
 #include "assortments/assortcontrols.hpp"
 
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 #include "shell/controlnames.hpp"
 
 #include <QRegularExpression>
@@ -35,9 +35,8 @@ std::optional<AssortUserControlRef> assortUserControlFromName(const QString &nam
         return std::nullopt;
     }
     const int index = m.hasMatch() ? m.captured(2).toInt() : 0;
-    const bool indexOk = isPerCategory(*control)
-                             ? index >= 1 && index <= economics::kUserCategoryCount
-                             : !m.hasMatch();
+    const bool indexOk =
+        isPerCategory(*control) ? index >= 1 && index <= prices::kUserCategoryCount : !m.hasMatch();
     if (!indexOk) {
         return std::nullopt;
     }

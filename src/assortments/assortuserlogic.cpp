@@ -1,7 +1,7 @@
 #include "assortments/assortuserlogic.hpp"
 
 #include "assortments/assortmessages.hpp"
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
 #include "workflow/mainmessages.hpp"
@@ -12,13 +12,13 @@ namespace {
 constexpr float kSmallestSmallEnd = 7.0f;
 } // namespace
 
-AssortUserLogic::AssortUserLogic(economics::PriceData &data, AssortmentSession &session,
+AssortUserLogic::AssortUserLogic(prices::PriceData &data, AssortmentSession &session,
                                  IAssortUserView &view, shell::IInteractive &interactive)
     : m_data(data), m_session(session), m_view(view), m_interactive(interactive) {}
 
 void AssortUserLogic::mnuAssortUser_Click() {
-    for (int i = 1; i <= economics::kUserCategoryCount; ++i) {
-        const economics::UserCategory &c = m_data.categories.at(static_cast<std::size_t>(i - 1));
+    for (int i = 1; i <= prices::kUserCategoryCount; ++i) {
+        const prices::UserCategory &c = m_data.categories.at(static_cast<std::size_t>(i - 1));
         m_view.setText(AssortUserControl::txtName, i, c.name);
         m_view.setText(AssortUserControl::txtSmall, i, shell::singleText(c.smallEnd));
         m_view.setText(AssortUserControl::txtBig, i, shell::singleText(c.bigEnd));
@@ -37,9 +37,9 @@ bool AssortUserLogic::refuse(int index, const QString &name, const QString &why,
 }
 
 void AssortUserLogic::cmdOK_Click() {
-    std::array<economics::UserCategory, economics::kUserCategoryCount> edited;
-    for (int i = 1; i <= economics::kUserCategoryCount; ++i) {
-        economics::UserCategory &c = edited.at(static_cast<std::size_t>(i - 1));
+    std::array<prices::UserCategory, prices::kUserCategoryCount> edited;
+    for (int i = 1; i <= prices::kUserCategoryCount; ++i) {
+        prices::UserCategory &c = edited.at(static_cast<std::size_t>(i - 1));
         c.name = m_view.text(AssortUserControl::txtName, i).trimmed();
         c.inUse = m_view.isChecked(AssortUserControl::chkUse, i);
         const QString small = m_view.text(AssortUserControl::txtSmall, i).trimmed();

@@ -12,7 +12,7 @@ namespace arbolex::shell {
 class IInteractive;
 }
 
-namespace arbolex::economics {
+namespace arbolex::prices {
 struct PriceData;
 }
 
@@ -20,7 +20,7 @@ namespace arbolex::assortments {
 
 class AssortUserLogic {
 public:
-    AssortUserLogic(economics::PriceData &data, AssortmentSession &session, IAssortUserView &view,
+    AssortUserLogic(prices::PriceData &data, AssortmentSession &session, IAssortUserView &view,
                     shell::IInteractive &interactive);
 
     /// Fills the window from the categories and the switch, and shows it.
@@ -37,7 +37,7 @@ public:
 private:
     bool refuse(int index, const QString &name, const QString &why, AssortUserControl focus);
 
-    economics::PriceData &m_data;
+    prices::PriceData &m_data;
     AssortmentSession &m_session;
     IAssortUserView &m_view;
     shell::IInteractive &m_interactive;

@@ -1,13 +1,14 @@
 #include "assortments/assortwindowlogic.hpp"
 
 #include "assortments/assortmessages.hpp"
-#include "economics/prices.hpp"
 #include "engine/grow.hpp"
+#include "prices/prices.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
+#include "work/rowformat.hpp"
+#include "work/standwork.hpp"
 #include "workflow/mainmessages.hpp"
-#include "workflow/mainwindowlogic.hpp"
 
 #include <cmath>
 
@@ -19,14 +20,6 @@ namespace {
 
 constexpr char16_t kVolumeFormat[] = u"###0.00";
 constexpr char16_t kPercentFormat[] = u"##0.0";
-
-/// The columns of `flxMain` that an assortment row fills, in order: two per
-/// class (share, then volume), the separator column left out.
-constexpr std::array<int, 10> kRowColumns = {
-    workflow::kColTopHeight,        workflow::kColStocking,      workflow::kColDbh,
-    workflow::kColBasalArea,        workflow::kColVolumePerTree, workflow::kColVolumePerHa,
-    workflow::kColThinStocking,     workflow::kColThinDbh,       workflow::kColThinBasalArea,
-    workflow::kColThinVolumePerTree};
 
 /// A thinning is a rack thinning when it removes the same share of basal
 /// area as of stems: the mean tree stays.
@@ -61,7 +54,7 @@ bool isRackThinning(float preBasalArea, float preStocking, float postBasalArea,
     return std::fabs(rB - rN) < 0.001f;
 }
 
-QString bounds(const economics::UserCategory &c) {
+QString bounds(const prices::UserCategory &c) {
     const QString small = shell::singleText(c.smallEnd);
     return c.bigEnd == 0.0f ? small + text::openEnded()
                             : small + QStringLiteral(" - ") + shell::singleText(c.bigEnd);
@@ -69,16 +62,16 @@ QString bounds(const economics::UserCategory &c) {
 
 } // namespace
 
-AssortWindowLogic::AssortWindowLogic(workflow::MainWindowLogic &main, IAssortView &view,
+AssortWindowLogic::AssortWindowLogic(work::StandWork &work, IAssortView &view,
                                      shell::IInteractive &interactive)
-    : m_main(main), m_view(view), m_interactive(interactive) {}
+    : m_standWork(work), m_view(view), m_interactive(interactive) {}
 
 void AssortWindowLogic::message(const QString &text) {
     m_interactive.message(workflow::text::titleArbolex(), text, shell::kExclamation);
 }
 
 void AssortWindowLogic::reportOnGrowthRow(int row) {
-    const workflow::RowRecord &r = m_main.table().row(row).record;
+    const work::RowRecord &r = m_standWork.table().row(row).record;
     m_fromMain = true;
     m_actualThinning = false;
     m_volumes = {};
@@ -168,7 +161,7 @@ ReportStand AssortWindowLogic::standOf(int kind, const thinning::ThinningWork &w
 
 bool AssortWindowLogic::categoriesInUse(std::vector<engine::AssortmentCategory> &bounds,
                                         QStringList &names) {
-    for (const economics::UserCategory &c : m_main.prices().data().categories) {
+    for (const prices::UserCategory &c : m_standWork.prices().data().categories) {
         if (c.inUse) {
             bounds.push_back({c.smallEnd, c.bigEnd});
             names << c.name;
@@ -188,7 +181,7 @@ bool AssortWindowLogic::calculate(const ReportStand &stand, float topHeight, boo
     if (user && !categoriesInUse(bounds, names)) {
         return false;
     }
-    if (!m_main.grow().AsmtB(stand.basalArea, stand.stocking, topHeight, bounds, result)) {
+    if (!m_standWork.grow().AsmtB(stand.basalArea, stand.stocking, topHeight, bounds, result)) {
         return false;
     }
     if (stand.removedVolume > 0.0f) {
@@ -217,7 +210,7 @@ bool AssortWindowLogic::prepareReport(const thinning::ThinningWork &work, float 
 bool AssortWindowLogic::frmAssortLoad(float preBasalArea, float preStocking, float topHeight,
                                       float postBasalArea, float postStocking) {
     bool built = false;
-    shell::guard(m_main.errorLog(), QStringLiteral(" in Misc.frmAssortLoad()"), [&] {
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in Misc.frmAssortLoad()"), [&] {
         const thinning::ThinningWork work =
             workOf(preBasalArea, preStocking, postBasalArea, postStocking, m_volumes);
         engine::Assortment result;
@@ -246,7 +239,7 @@ bool AssortWindowLogic::frmAssortLoad(float preBasalArea, float preStocking, flo
 bool AssortWindowLogic::frmAssortLoadMod(float preBasalArea, float preStocking, float topHeight,
                                          float postBasalArea, float postStocking) {
     bool built = false;
-    shell::guard(m_main.errorLog(), QStringLiteral(" in Misc.frmAssortLoadMod()"), [&] {
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in Misc.frmAssortLoadMod()"), [&] {
         const thinning::ThinningWork work =
             workOf(preBasalArea, preStocking, postBasalArea, postStocking, m_volumes);
         engine::Assortment result;
@@ -269,7 +262,7 @@ bool AssortWindowLogic::frmAssortLoadMod(float preBasalArea, float preStocking, 
             }
         }
         QStringList names;
-        for (const economics::UserCategory &c : m_main.prices().data().categories) {
+        for (const prices::UserCategory &c : m_standWork.prices().data().categories) {
             if (!c.inUse) {
                 continue;
             }
@@ -345,30 +338,18 @@ QString AssortWindowLogic::rowLabel(const QString &description) {
 
 void AssortWindowLogic::appendRow(const QString &description, float age,
                                   const engine::Assortment &result, const QStringList &names) {
-    workflow::TableRow row;
-    row.kind = workflow::RowKind::Text;
-    row.label = rowLabel(description);
-    row.record.age = age;
-    row.numbers[workflow::kNumAge] = age;
-    for (int c = 0; c < workflow::kColumnCount; ++c) {
-        row.cells.append(QString());
+    std::vector<work::rowformat::AssortmentClass> classes;
+    for (std::size_t i = 0; i < result.count; ++i) {
+        classes.push_back({names.isEmpty() ? text::rowClass(static_cast<int>(i))
+                                           : names.at(static_cast<qsizetype>(i)),
+                           result.percent(i), result.classVolume[i]});
     }
-    row.cells[workflow::kColAge] = shell::singleText(age);
-    for (std::size_t i = 0; i < result.count && 2 * i + 1 < kRowColumns.size(); ++i) {
-        const QString cls = names.isEmpty() ? text::rowClass(static_cast<int>(i))
-                                            : names.at(static_cast<qsizetype>(i));
-        row.cells[kRowColumns[2 * i]] = text::rowCaptionPercent(cls) + QLatin1Char(' ') +
-                                        formatNumber(result.percent(i), kPercentFormat);
-        row.cells[kRowColumns[2 * i + 1]] = text::rowCaptionVolume(cls) + QLatin1Char(' ') +
-                                            formatNumber(result.classVolume[i], kVolumeFormat);
-    }
-    workflow::ProjectionTable &table = m_main.tableForThinning();
-    const int index = table.append(std::move(row));
-    m_main.view().tableChanged(index);
+    m_standWork.appendAssortmentRow(
+        work::rowformat::assortmentRow(rowLabel(description), age, classes));
 }
 
 void AssortWindowLogic::appendPendingRows(const thinning::ThinningWork &work, float age) {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in Misc.WriteAssortLines()"), [&] {
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in Misc.WriteAssortLines()"), [&] {
         for (int kind = kPreThin; kind <= kPostThin; ++kind) {
             const QString &description = m_session.descriptions.at(static_cast<std::size_t>(kind));
             if (!m_session.pending.contains(QString::number(kind)) || description.isEmpty()) {

@@ -18,8 +18,8 @@ namespace arbolex::shell {
 class IInteractive;
 }
 
-namespace arbolex::workflow {
-class MainWindowLogic;
+namespace arbolex::work {
+class StandWork;
 }
 
 namespace arbolex::assortments {
@@ -34,8 +34,7 @@ struct ReportStand {
 
 class AssortWindowLogic {
 public:
-    AssortWindowLogic(workflow::MainWindowLogic &main, IAssortView &view,
-                      shell::IInteractive &interactive);
+    AssortWindowLogic(work::StandWork &work, IAssortView &view, shell::IInteractive &interactive);
 
     AssortmentSession &session() { return m_session; }
     IAssortView &view() { return m_view; }
@@ -97,7 +96,7 @@ private:
                    const QStringList &names);
     void message(const QString &text);
 
-    workflow::MainWindowLogic &m_main;
+    work::StandWork &m_standWork;
     IAssortView &m_view;
     shell::IInteractive &m_interactive;
     AssortmentSession m_session;

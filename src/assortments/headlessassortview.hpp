@@ -1,7 +1,7 @@
 #pragma once
 
 #include "assortments/iassortview.hpp"
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 
 #include <array>
 #include <optional>
@@ -20,9 +20,9 @@ public:
     void close() override { m_shown = false; }
     bool isShown() const override { return m_shown; }
 
-    QString caption() const { return m_caption; }
+    QString caption() const override { return m_caption; }
     /// The user report on show, if any.
-    const std::optional<UserReport> &userReport() const { return m_userReport; }
+    std::optional<UserReport> userReport() const override { return m_userReport; }
 
 private:
     static std::size_t index(AssortControl c) { return static_cast<std::size_t>(c); }

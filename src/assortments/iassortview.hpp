@@ -5,6 +5,7 @@
 #include <QString>
 #include <QStringList>
 
+#include <optional>
 #include <vector>
 
 namespace arbolex::assortments {
@@ -22,9 +23,12 @@ public:
     virtual QString text(AssortControl control) const = 0;
     virtual void setText(AssortControl control, const QString &text) = 0;
     virtual void setCaption(const QString &caption) = 0;
+    virtual QString caption() const = 0;
     /// Shows the three fixed classes, or instead the table of `report`.
     virtual void showFixedClasses() = 0;
     virtual void showUserReport(const UserReport &report) = 0;
+    /// The report over the user categories on show, if the window shows one.
+    virtual std::optional<UserReport> userReport() const = 0;
     /// Shows the window, modal: the handler that opens it waits until it closes.
     virtual void showReport() = 0;
     virtual void close() = 0;

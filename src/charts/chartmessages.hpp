@@ -96,6 +96,17 @@ inline QString noteNpv(const QString &npv, const QString &rate) {
     return QStringLiteral("Net present value %1 €/ha at %2 %").arg(npv, rate);
 }
 
+// Harvest forecast of an estate
+inline QString titleHarvest() {
+    return QStringLiteral("Harvest forecast by year and species");
+}
+inline QString axisHarvestVolume() {
+    return QStringLiteral("Volume harvested, m³ to 7 cm top");
+}
+inline QString axisHarvestYear() {
+    return QStringLiteral("Year");
+}
+
 // The chart panel
 inline QString buttonExportPng() {
     return QStringLiteral("Export PNG…");

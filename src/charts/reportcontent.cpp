@@ -1,17 +1,21 @@
 #include "charts/reportcontent.hpp"
+#include "work/worktexts.hpp"
 
+#include "charts/economicscharts.hpp"
 #include "charts/reportmessages.hpp"
 #include "charts/standcharts.hpp"
-#include "document/subcompartment.hpp"
-#include "economics/mdlnpv.hpp"
-#include "economics/npvmessages.hpp"
+#include "economics/economicsmessages.hpp"
+#include "economics/economicswindowlogic.hpp"
+#include "engine/grow.hpp"
 #include "shell/vbformat.hpp"
-#include "workflow/mainwindowlogic.hpp"
+#include "work/mdlnpv.hpp"
+#include "work/standwork.hpp"
+#include "work/subcompartment.hpp"
 
 namespace arbolex::charts {
 
 using shell::formatNumber;
-using workflow::MainControl;
+using work::WorkField;
 
 namespace {
 
@@ -39,15 +43,15 @@ ReportTable fromGrid(std::vector<QStringList> grid, QStringList groups) {
 /// The cash flow with the costs and revenues typed so far, computed; the
 /// program's own cash flow keeps what its window last computed.
 struct ComputedCashFlow {
-    economics::CashFlow flow;
+    work::CashFlow flow;
     int years = 0;
 };
 
-ComputedCashFlow computedCashFlow(workflow::MainWindowLogic &logic) {
-    ComputedCashFlow computed{logic.cashFlow(), 0};
+ComputedCashFlow computedCashFlow(work::StandWork &work) {
+    ComputedCashFlow computed{work.cashFlow(), 0};
     if (computed.flow.years() > 0) {
-        computed.flow.LoadTimberRevenues(logic.timberRevenue());
-        computed.years = computed.flow.ComputeCashFlow(logic.errorLog());
+        computed.flow.LoadTimberRevenues(work.timberRevenue());
+        computed.years = computed.flow.ComputeCashFlow(work.errorLog());
     }
     return computed;
 }
@@ -57,19 +61,19 @@ ReportTable cashFlowTable(const ComputedCashFlow &computed) {
     if (computed.years == 0) {
         return table;
     }
-    table.captions = economics::text::npvHeaders();
+    table.captions = work::text::cashFlowHeaders();
     for (int i = 0; i < computed.years; ++i) {
         // Years without an operation, a cost or a revenue are left out.
         const bool quiet = computed.flow.operation(i).trimmed().isEmpty() &&
-                           computed.flow.matrix(economics::kCfCost, i) == 0.0 &&
-                           computed.flow.matrix(economics::kCfTotalRevenues, i) == 0.0;
+                           computed.flow.matrix(work::kCfCost, i) == 0.0 &&
+                           computed.flow.matrix(work::kCfTotalRevenues, i) == 0.0;
         if (quiet) {
             continue;
         }
         QStringList row;
-        row << QString::number(static_cast<int>(computed.flow.matrix(economics::kCfYear, i)))
+        row << QString::number(static_cast<int>(computed.flow.matrix(work::kCfYear, i)))
             << computed.flow.operation(i);
-        for (int c = economics::kCfCost; c < economics::kCashFlowColumnCount; ++c) {
+        for (int c = work::kCfCost; c < work::kCashFlowColumnCount; ++c) {
             row << formatNumber(computed.flow.matrix(c, i), u"#0");
         }
         table.rows.push_back(std::move(row));
@@ -79,63 +83,100 @@ ReportTable cashFlowTable(const ComputedCashFlow &computed) {
 
 /// The stand the projection started from: the table's first row, else the
 /// grow-from fields as typed.
-std::vector<std::pair<QString, QString>> inputs(workflow::MainWindowLogic &logic) {
-    const workflow::ProjectionTable &table = logic.table();
-    const auto value = [&](int column, MainControl field) {
-        return table.empty() ? logic.view().text(field) : table.row(1).cells.value(column);
+std::vector<std::pair<QString, QString>> inputs(const work::StandWork &work) {
+    const work::ProjectionTable &table = work.table();
+    const auto value = [&](int column, WorkField field) {
+        return table.empty() ? work.field(field) : table.row(1).cells.value(column);
     };
     return {
-        {text::inputAge(), value(workflow::kColAge, MainControl::txtFromA)},
-        {text::inputStocking(), value(workflow::kColStocking, MainControl::txtFromN)},
-        {text::inputTopHeight(), value(workflow::kColTopHeight, MainControl::txtFromH)},
-        {text::inputBasalArea(), value(workflow::kColBasalArea, MainControl::txtFromB)},
-        {text::inputDbh(), value(workflow::kColDbh, MainControl::txtFromD)},
-        {text::inputNetArea(), logic.view().text(MainControl::txtNetArea)},
+        {text::inputAge(), value(work::kColAge, WorkField::FromAge)},
+        {text::inputStocking(), value(work::kColStocking, WorkField::FromStocking)},
+        {text::inputTopHeight(), value(work::kColTopHeight, WorkField::FromHeight)},
+        {text::inputBasalArea(), value(work::kColBasalArea, WorkField::FromBasalArea)},
+        {text::inputDbh(), value(work::kColDbh, WorkField::FromDbh)},
+        {text::inputNetArea(), work.field(WorkField::NetArea)},
     };
+}
+
+/// The yield class as the main window shows it: fixed at the final cut, else
+/// once the increment has culminated.
+QString yieldClassText(const work::StandWork &work) {
+    const int yc = work.yieldClass();
+    return work.felled() || yc > 0 ? QString::number(yc) : QString();
+}
+
+/// The economics window's figures as it shows them now.
+EconomicsPage economicsPage(economics::EconomicsWindowLogic &logic) {
+    namespace et = economics::economicstext;
+    using economics::EconomicsControl;
+    const economics::IEconomicsView &view = logic.view();
+    const QString rate = QLatin1Char(' ') + et::atRate(logic.rateText());
+    EconomicsPage page;
+    page.title = et::economicsCaption() + rate;
+    page.stand = view.text(EconomicsControl::lblStand);
+    page.regime = view.text(EconomicsControl::lblRegime);
+    page.money = view.text(EconomicsControl::lblRate);
+    for (const auto &[caption, label] : economics::valueFigures()) {
+        page.figures.emplace_back(caption, view.text(label));
+    }
+    page.rotations = rotationChart(logic.explorer(), et::panelRotations() + rate);
+    if (!logic.regimes().empty()) {
+        std::vector<QStringList> grid = logic.regimeGrid();
+        // Captions in two lines on screen run on in print.
+        for (QString &caption : grid.front()) {
+            caption.replace(QLatin1Char('\n'), QLatin1Char(' '));
+        }
+        page.regimesTitle = et::panelOptimiser() + rate;
+        page.regimes = fromGrid(std::move(grid), {});
+        page.regimesNote = view.text(EconomicsControl::lblOptimiser);
+    }
+    return page;
 }
 
 } // namespace
 
-RotationCharts rotationCharts(workflow::MainWindowLogic &logic) {
-    const ComputedCashFlow computed = computedCashFlow(logic);
-    return {standDevelopment(logic.table()), increments(logic.table()),
+RotationCharts rotationCharts(work::StandWork &work) {
+    const ComputedCashFlow computed = computedCashFlow(work);
+    return {standDevelopment(work.table()), increments(work.table()),
             cashFlowChart(computed.flow, computed.years)};
 }
 
-ReportContent reportContent(workflow::MainWindowLogic &logic) {
+ReportContent reportContent(work::StandWork &work) {
     ReportContent content;
-    const document::SubCompartment &id = logic.identification();
+    const work::SubCompartment &id = work.identification();
     content.forest = id.forest;
     content.compartment = id.compartment;
     content.subCompartment = id.subCompartment;
     content.description = id.notes;
-    content.modelLabel = QString::fromStdString(logic.grow().label());
-    content.inputs = inputs(logic);
-    content.siteIndex = logic.view().text(MainControl::lblSI);
-    content.yieldClass = logic.view().text(MainControl::lblYC);
+    content.modelLabel = QString::fromStdString(work.grow().label());
+    content.inputs = inputs(work);
+    content.siteIndex = work.siteIndexText();
+    content.yieldClass = yieldClassText(work);
     if (content.yieldClass.isEmpty()) {
         content.yieldClass = text::notCalculated();
     }
-    content.projection = fromGrid(logic.table().exportGrid(), logic.table().exportGroups());
-
-    if (!logic.table().empty()) {
-        // The summary of the table as it is now; the window keeps its view.
-        const bool showingSummary = logic.showingSummary();
-        if (logic.FillSummary() && !showingSummary) {
-            logic.cmdSummary_Click();
-        }
-        content.summary = fromGrid(logic.summaryGrid(), logic.summaryGroups());
+    content.projection = fromGrid(work.table().exportGrid(), work.table().exportGroups());
+    if (const auto summary = work.summary()) {
+        content.summary = fromGrid(work.summaryGrid(*summary), work.summaryGroups());
     }
 
-    const ComputedCashFlow computed = computedCashFlow(logic);
+    const ComputedCashFlow computed = computedCashFlow(work);
     content.cashFlow = cashFlowTable(computed);
     if (computed.years > 0) {
         content.netPresentValue = formatNumber(computed.flow.SumNPV(), u"#0");
         content.interestRate = formatNumber(computed.flow.interestRate(), u"0.00##");
     }
-    content.standChart = standDevelopment(logic.table());
-    content.incrementChart = increments(logic.table());
+    content.standChart = standDevelopment(work.table());
+    content.incrementChart = increments(work.table());
     content.cashFlowChart = cashFlowChart(computed.flow, computed.years);
+    return content;
+}
+
+ReportContent reportContent(work::StandWork &work, economics::EconomicsWindowLogic &economics) {
+    ReportContent content = reportContent(work);
+    if (economics.figuresOfTable()) {
+        content.economics = economicsPage(economics);
+    }
     return content;
 }
 

@@ -9,11 +9,15 @@
 #include <QString>
 #include <QStringList>
 
+#include <optional>
 #include <utility>
 #include <vector>
 
-namespace arbolex::workflow {
-class MainWindowLogic;
+namespace arbolex::economics {
+class EconomicsWindowLogic;
+}
+namespace arbolex::work {
+class StandWork;
 }
 
 namespace arbolex::charts {
@@ -26,6 +30,25 @@ struct ReportTable {
     std::vector<QStringList> rows;
 
     bool empty() const { return rows.empty(); }
+};
+
+/// The economics of the rotation as the economics window values it.
+struct EconomicsPage {
+    /// "Economics of the rotation at 3.00 % a year".
+    QString title;
+    /// The stand, the regime, and the rate, prices and costs the figures used.
+    QString stand;
+    QString regime;
+    QString money;
+    /// The figures of the value panel: caption, value.
+    std::vector<std::pair<QString, QString>> figures;
+    /// NPV, LEV and MAI by rotation age.
+    ChartData rotations;
+    /// The optimiser's best regimes and the user's own, with the heading
+    /// and the count of regimes grown; empty when the optimiser has not run.
+    QString regimesTitle;
+    ReportTable regimes;
+    QString regimesNote;
 };
 
 struct ReportContent {
@@ -53,12 +76,21 @@ struct ReportContent {
     ChartData standChart;
     ChartData incrementChart;
     ChartData cashFlowChart;
+
+    /// The economics of the rotation; none unless the economics window has
+    /// valued the table as it stands.
+    std::optional<EconomicsPage> economics;
 };
 
-/// The report of what the main window holds now. The summary is filled
-/// afresh (the window goes on showing what it showed) and the cash flow is
-/// computed on a copy with the costs and revenues typed so far.
-ReportContent reportContent(workflow::MainWindowLogic &logic);
+/// The report of the work as it stands: its summary made afresh, and the
+/// cash flow computed on a copy with the costs and revenues typed so far.
+ReportContent reportContent(work::StandWork &work);
+
+/// The report with the economics page when the economics window has valued
+/// the rotation the table holds now: its figures, rate and costs as the
+/// window shows them, and the optimiser's regimes once it has run. No page
+/// before the window has valued the table, nor after the table has changed.
+ReportContent reportContent(work::StandWork &work, economics::EconomicsWindowLogic &economics);
 
 /// The three charts of the main window now (the panel beside the table).
 struct RotationCharts {
@@ -66,6 +98,6 @@ struct RotationCharts {
     ChartData increments;
     ChartData cashFlow;
 };
-RotationCharts rotationCharts(workflow::MainWindowLogic &logic);
+RotationCharts rotationCharts(work::StandWork &work);
 
 } // namespace arbolex::charts

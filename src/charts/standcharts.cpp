@@ -1,19 +1,19 @@
 #include "charts/standcharts.hpp"
 
 #include "charts/chartmessages.hpp"
-#include "economics/mdlnpv.hpp"
 #include "rotation/yieldclass.hpp"
 #include "shell/vbformat.hpp"
-#include "workflow/incrementrows.hpp"
-#include "workflow/projectiontable.hpp"
+#include "work/incrementrows.hpp"
+#include "work/mdlnpv.hpp"
+#include "work/projectiontable.hpp"
 
 #include <algorithm>
 #include <cmath>
 
 namespace arbolex::charts {
 
-using workflow::RowRecord;
-using workflow::TableRow;
+using work::RowRecord;
+using work::TableRow;
 
 bool ChartData::empty() const {
     return std::all_of(series.begin(), series.end(),
@@ -42,14 +42,14 @@ ChartSeries series(const QString &name, const QString &unit, int axis) {
 
 } // namespace
 
-ChartData standDevelopment(const workflow::ProjectionTable &table) {
+ChartData standDevelopment(const work::ProjectionTable &table) {
     ChartData chart;
     chart.title = text::titleStand();
-    chart.xTitle = text::axisAge();
+    chart.x.title = text::axisAge();
     chart.note = text::noteStand();
-    chart.axes = {{text::axisVolume(), false},
-                  {text::axisHeightBasalArea(), false},
-                  {text::axisStocking(), true}};
+    chart.axes = {{.title = text::axisVolume()},
+                  {.title = text::axisHeightBasalArea()},
+                  {.title = text::axisStocking(), .right = true}};
     ChartSeries height = series(text::seriesTopHeight(), QStringLiteral("m"), kAxisHeightBasalArea);
     ChartSeries stocking =
         series(text::seriesStocking(), QStringLiteral("stems/ha"), kAxisStocking);
@@ -92,23 +92,23 @@ ChartData standDevelopment(const workflow::ProjectionTable &table) {
     return chart;
 }
 
-ChartData increments(const workflow::ProjectionTable &table) {
+ChartData increments(const work::ProjectionTable &table) {
     ChartData chart;
     chart.title = text::titleIncrements();
-    chart.xTitle = text::axisAge();
-    chart.axes = {{text::axisIncrement(), false}};
+    chart.x.title = text::axisAge();
+    chart.axes = {{.title = text::axisIncrement()}};
     ChartSeries cai = series(text::seriesCai(), QStringLiteral("m³/ha/yr"), 0);
     ChartSeries mai = series(text::seriesMai(), QStringLiteral("m³/ha/yr"), 0);
     std::vector<double> maiValues;
-    for (const int i : workflow::incrementRows(table)) {
+    for (const int i : work::incrementRows(table)) {
         const TableRow &row = table.row(i);
-        const double age = row.numbers[workflow::kNumAge];
-        if (!row.cells.value(workflow::kColCai).isEmpty()) {
-            add(cai, age, row.numbers[workflow::kNumCai]);
+        const double age = row.numbers[work::kNumAge];
+        if (!row.cells.value(work::kColCai).isEmpty()) {
+            add(cai, age, row.numbers[work::kNumCai]);
         }
-        maiValues.push_back(row.numbers[workflow::kNumMai]);
+        maiValues.push_back(row.numbers[work::kNumMai]);
         if (age > 0.0) {
-            add(mai, age, row.numbers[workflow::kNumMai]);
+            add(mai, age, row.numbers[work::kNumMai]);
         }
     }
     const int yieldClass = rotation::yieldClass(maiValues);
@@ -128,13 +128,14 @@ ChartData increments(const workflow::ProjectionTable &table) {
     return chart;
 }
 
-ChartData cashFlowChart(const economics::CashFlow &computed, int years) {
+ChartData cashFlowChart(const work::CashFlow &computed, int years) {
     ChartData chart;
     chart.title = text::titleCashFlow();
-    chart.xTitle = text::axisYear();
+    chart.x.title = text::axisYear();
     // Two axes with their zeros level: the final cut's revenue would flatten
     // the discounted sums on a common axis.
-    chart.axes = {{text::axisCashFlow(), false}, {text::axisCumulative(), true}};
+    chart.axes = {{.title = text::axisCashFlow()},
+                  {.title = text::axisCumulative(), .right = true}};
     ChartSeries bars = series(text::seriesCashFlow(), text::unitMoney(), 0);
     bars.style = ChartSeries::Style::Bars;
     ChartSeries cumulative = series(text::seriesCumulative(), text::unitMoney(), 1);
@@ -142,12 +143,12 @@ ChartData cashFlowChart(const economics::CashFlow &computed, int years) {
     double sum = 0.0;
     int lastNegative = -1;
     for (int i = 0; i < years; ++i) {
-        const double year = computed.matrix(economics::kCfYear, i);
-        const double flow = computed.matrix(economics::kCfCashFlow, i);
+        const double year = computed.matrix(work::kCfYear, i);
+        const double flow = computed.matrix(work::kCfCashFlow, i);
         if (flow != 0.0) {
             bars.points.push_back({year, flow});
         }
-        sum += computed.matrix(economics::kCfDiscountedCashFlow, i);
+        sum += computed.matrix(work::kCfDiscountedCashFlow, i);
         cumulative.points.push_back({year, sum});
         if (sum < 0.0) {
             lastNegative = i;

@@ -22,7 +22,7 @@ std::optional<std::optional<economics::AssortPricesItem>> item(const QString &co
 
 } // namespace
 
-std::optional<QString> setAssortPricesControl(HeadlessSession &session, const QString &control,
+std::optional<QString> setAssortPricesControl(ScriptTarget &session, const QString &control,
                                               const QString &text) {
     const auto found = item(control);
     if (!found) {
@@ -35,7 +35,7 @@ std::optional<QString> setAssortPricesControl(HeadlessSession &session, const QS
     return QString();
 }
 
-std::optional<QString> pressAssortPricesControl(HeadlessSession &session, const QString &control) {
+std::optional<QString> pressAssortPricesControl(ScriptTarget &session, const QString &control) {
     if (control == QLatin1String("mnuAssortPrices")) {
         session.assortPrices().show();
         return QString();
@@ -50,7 +50,7 @@ std::optional<QString> pressAssortPricesControl(HeadlessSession &session, const 
     return QString();
 }
 
-std::optional<QString> printAssortPricesControl(HeadlessSession &session, const QString &control,
+std::optional<QString> printAssortPricesControl(ScriptTarget &session, const QString &control,
                                                 QTextStream &out) {
     const auto found = item(control);
     if (!found) {

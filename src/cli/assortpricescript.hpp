@@ -11,14 +11,14 @@
 
 namespace arbolex::cli {
 
-class HeadlessSession;
+class ScriptTarget;
 
 /// Each returns nothing when `control` is not one of the window's controls,
 /// else the runner's error text (empty when the line ran).
-std::optional<QString> setAssortPricesControl(HeadlessSession &session, const QString &control,
+std::optional<QString> setAssortPricesControl(ScriptTarget &session, const QString &control,
                                               const QString &text);
-std::optional<QString> pressAssortPricesControl(HeadlessSession &session, const QString &control);
-std::optional<QString> printAssortPricesControl(HeadlessSession &session, const QString &control,
+std::optional<QString> pressAssortPricesControl(ScriptTarget &session, const QString &control);
+std::optional<QString> printAssortPricesControl(ScriptTarget &session, const QString &control,
                                                 QTextStream &out);
 
 } // namespace arbolex::cli

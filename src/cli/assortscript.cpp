@@ -34,7 +34,7 @@ std::optional<std::optional<assortments::AssortControl>> reportControl(const QSt
 
 } // namespace
 
-std::optional<QString> setAssortControl(HeadlessSession &session, const QString &control,
+std::optional<QString> setAssortControl(ScriptTarget &session, const QString &control,
                                         const QString &text) {
     const auto user = userControl(control);
     if (!user) {
@@ -49,7 +49,7 @@ std::optional<QString> setAssortControl(HeadlessSession &session, const QString 
     return QString();
 }
 
-std::optional<QString> pressAssortControl(HeadlessSession &session, const QString &control) {
+std::optional<QString> pressAssortControl(ScriptTarget &session, const QString &control) {
     if (control == QLatin1String("cmdAssort")) {
         session.main().cmdAssort_Click();
         return QString();
@@ -83,11 +83,11 @@ std::optional<QString> pressAssortControl(HeadlessSession &session, const QStrin
     return std::nullopt;
 }
 
-std::optional<QString> printAssortControl(HeadlessSession &session, const QString &control,
+std::optional<QString> printAssortControl(ScriptTarget &session, const QString &control,
                                           QTextStream &out) {
     if (control == kReportWindow) {
         // The whole report: caption, title, then the classes or the categories.
-        const assortments::HeadlessAssortView &view = session.assortView();
+        const assortments::IAssortView &view = session.assortView();
         out << view.caption() << '\n' << view.text(assortments::AssortControl::lblDesc) << '\n';
         if (const auto &user = view.userReport()) {
             out << user->header.join(QLatin1Char('\t')) << '\n';
@@ -119,7 +119,7 @@ std::optional<QString> printAssortControl(HeadlessSession &session, const QStrin
         }
         using assortments::AssortUserControl;
         const AssortUserControl c = (*user)->control;
-        assortments::HeadlessAssortUserView &view = session.assortUserView();
+        const assortments::IAssortUserView &view = session.assortUserView();
         if (c == AssortUserControl::chkUse || c == AssortUserControl::chkUserCategories) {
             out << (view.isChecked(c, (*user)->index) ? "1" : "0") << '\n';
         } else {

@@ -12,14 +12,14 @@
 
 namespace arbolex::cli {
 
-class HeadlessSession;
+class ScriptTarget;
 
 /// Each returns nothing when `control` is not one of the assortment
 /// controls, else the runner's error text (empty when the line ran).
-std::optional<QString> setAssortControl(HeadlessSession &session, const QString &control,
+std::optional<QString> setAssortControl(ScriptTarget &session, const QString &control,
                                         const QString &text);
-std::optional<QString> pressAssortControl(HeadlessSession &session, const QString &control);
-std::optional<QString> printAssortControl(HeadlessSession &session, const QString &control,
+std::optional<QString> pressAssortControl(ScriptTarget &session, const QString &control);
+std::optional<QString> printAssortControl(ScriptTarget &session, const QString &control,
                                           QTextStream &out);
 
 } // namespace arbolex::cli

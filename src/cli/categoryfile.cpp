@@ -1,7 +1,7 @@
 #include "cli/categoryfile.hpp"
 
 #include "cli/options.hpp"
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 #include "shell/seqfile.hpp"
 
 namespace arbolex::cli {
@@ -13,7 +13,7 @@ std::vector<NamedCategory> readCategoryFile(const QString &path) {
                              .arg(path, in.openError().description)};
     }
     std::vector<NamedCategory> categories;
-    for (int i = 0; i < economics::kUserCategoryCount; ++i) {
+    for (int i = 0; i < prices::kUserCategoryCount; ++i) {
         NamedCategory c;
         for (const shell::RuntimeError &e :
              {in.readString(c.name), in.readNumber(c.bounds.smallEnd),

@@ -16,12 +16,12 @@ class DocumentController;
 
 namespace arbolex::cli {
 
-class HeadlessSession;
+class ScriptTarget;
 
 /// Nothing when `command` is not a File menu command, else the runner's
 /// error text (empty when the line ran). `rest` is the rest of the line.
 std::optional<QString> runDocumentCommand(document::DocumentController &documents,
-                                          HeadlessSession &session, const QString &command,
+                                          ScriptTarget &session, const QString &command,
                                           const QString &rest, QTextStream &out);
 
 } // namespace arbolex::cli

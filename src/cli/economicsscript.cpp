@@ -33,7 +33,7 @@ std::optional<QString> windowPart(const QString &control) {
 
 } // namespace
 
-std::optional<QString> setEconomicsControl(HeadlessSession &session, const QString &control,
+std::optional<QString> setEconomicsControl(ScriptTarget &session, const QString &control,
                                            const QString &text) {
     const auto part = windowPart(control);
     if (!part) {
@@ -50,7 +50,7 @@ std::optional<QString> setEconomicsControl(HeadlessSession &session, const QStri
     return QString();
 }
 
-std::optional<QString> pressEconomicsControl(HeadlessSession &session, const QString &control) {
+std::optional<QString> pressEconomicsControl(ScriptTarget &session, const QString &control) {
     if (control == QLatin1String("cmdEconomics")) {
         session.economics().cmdEconomics_Click();
         return QString();
@@ -76,7 +76,7 @@ std::optional<QString> pressEconomicsControl(HeadlessSession &session, const QSt
     return QString();
 }
 
-std::optional<QString> printEconomicsControl(HeadlessSession &session, const QString &control,
+std::optional<QString> printEconomicsControl(ScriptTarget &session, const QString &control,
                                              QTextStream &out) {
     if (control == kWindow) {
         out << session.economics().figuresText();

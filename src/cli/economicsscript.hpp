@@ -14,14 +14,14 @@
 
 namespace arbolex::cli {
 
-class HeadlessSession;
+class ScriptTarget;
 
 /// Each returns nothing when `control` is not one of the economics window's
 /// controls, else the runner's error text (empty when the line ran).
-std::optional<QString> setEconomicsControl(HeadlessSession &session, const QString &control,
+std::optional<QString> setEconomicsControl(ScriptTarget &session, const QString &control,
                                            const QString &text);
-std::optional<QString> pressEconomicsControl(HeadlessSession &session, const QString &control);
-std::optional<QString> printEconomicsControl(HeadlessSession &session, const QString &control,
+std::optional<QString> pressEconomicsControl(ScriptTarget &session, const QString &control);
+std::optional<QString> printEconomicsControl(ScriptTarget &session, const QString &control,
                                              QTextStream &out);
 
 } // namespace arbolex::cli

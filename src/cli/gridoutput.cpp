@@ -8,7 +8,7 @@ namespace arbolex::cli {
 
 namespace {
 
-using namespace workflow;
+using namespace work;
 
 /// The key of each column of the grid (cli/units.hpp gives their units);
 /// none for the separators.

@@ -7,7 +7,7 @@
 // whether the summary carries it.
 
 #include "cli/output.hpp"
-#include "workflow/projectiontable.hpp"
+#include "work/projectiontable.hpp"
 
 #include <QJsonArray>
 #include <QStringList>
@@ -17,14 +17,14 @@ namespace arbolex::cli {
 /// The grid: the captions, then a line per row. With `labels`, each line
 /// starts with the row's label ("G yr", "T yr", "FC yr" …) under "Row", as a
 /// copied table does.
-Table gridTable(const workflow::ProjectionTable &table, bool labels);
+Table gridTable(const work::ProjectionTable &table, bool labels);
 
 /// The keys of the grid's columns in JSON, in the grid's order (the blank
 /// separator columns have none).
-QStringList gridKeys(const workflow::ProjectionTable &table);
+QStringList gridKeys(const work::ProjectionTable &table);
 
 /// One object per row: "label", "in_summary" and each column's figure by
 /// key (null for an empty cell, the cell's text when it is no number).
-QJsonArray gridJson(const workflow::ProjectionTable &table);
+QJsonArray gridJson(const work::ProjectionTable &table);
 
 } // namespace arbolex::cli

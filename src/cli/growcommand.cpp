@@ -15,7 +15,7 @@ namespace {
 using workflow::MainControl;
 
 /// The grid in the format asked for.
-QByteArray gridOutput(Format format, const RunRecord &run, const workflow::ProjectionTable &table) {
+QByteArray gridOutput(Format format, const RunRecord &run, const work::ProjectionTable &table) {
     if (format == Format::kJson) {
         ResultDocument document(run);
         document.insert(QStringLiteral("columns"), QJsonArray::fromStringList(gridKeys(table)));

@@ -1,29 +1,20 @@
 #pragma once
 
-// A whole program without a screen: the engine, the prices, the error log and
-// the main window's logic over a headless view. The runner and the grow
-// shortcut of the command-line program drive it.
+// A whole program without a screen: the session over headless views. The
+// runner and the grow shortcut of the command-line program drive it.
 
-#include "assortments/assortuserlogic.hpp"
-#include "assortments/assortwindowlogic.hpp"
 #include "assortments/headlessassortview.hpp"
-#include "economics/assortpriceswindowlogic.hpp"
-#include "economics/economicswindowlogic.hpp"
+#include "cli/scripttarget.hpp"
 #include "economics/headlessassortpricesview.hpp"
 #include "economics/headlesstimberpricesview.hpp"
+#include "economics/ieconomicsview.hpp"
 #include "economics/inpvview.hpp"
-#include "economics/npvwindowlogic.hpp"
-#include "economics/prices.hpp"
-#include "economics/timberpriceswindowlogic.hpp"
-#include "engine/grow.hpp"
-#include "shell/enginereport.hpp"
-#include "shell/errorlog.hpp"
+#include "estatewindow/iestateview.hpp"
+#include "session/session.hpp"
 #include "shell/iclipboard.hpp"
 #include "shell/interactive.hpp"
 #include "thinning/headlessthinview.hpp"
-#include "thinning/thinwindowlogic.hpp"
 #include "workflow/headlessmainview.hpp"
-#include "workflow/mainwindowlogic.hpp"
 
 #include <QList>
 #include <QTextStream>
@@ -57,54 +48,47 @@ private:
     int m_messages = 0;
 };
 
-/// The objects of one run of the program.
-class HeadlessSession {
+/// A whole program without a screen: the session over headless views.
+class HeadlessSession : public ScriptTarget {
 public:
     HeadlessSession(const QString &dataFolder, QTextStream &out);
 
-    workflow::MainWindowLogic &main() { return m_main; }
+    session::Session &session() override { return m_session; }
+    void queueAnswer(bool yes) override { m_interactive.queueAnswer(yes); }
+    QString clipboardText() const override { return m_clipboard.text(); }
+    work::StandWork &work() { return m_session.work(); }
+    workflow::MainWindowLogic &main() { return m_session.main(); }
     workflow::HeadlessMainView &mainView() { return m_mainView; }
-    thinning::ThinWindowLogic &thinning() { return m_thin; }
+    thinning::ThinWindowLogic &thinning() { return m_session.thinning(); }
     thinning::HeadlessThinView &thinView() { return m_thinView; }
-    assortments::AssortWindowLogic &assort() { return m_assort; }
+    assortments::AssortWindowLogic &assort() { return m_session.assort(); }
     assortments::HeadlessAssortView &assortView() { return m_assortView; }
-    assortments::AssortUserLogic &assortUser() { return m_assortUser; }
+    assortments::AssortUserLogic &assortUser() { return m_session.assortUser(); }
     assortments::HeadlessAssortUserView &assortUserView() { return m_assortUserView; }
     PrintingInteractive &interactive() { return m_interactive; }
-    economics::NpvWindowLogic &npv() { return m_npv; }
+    economics::NpvWindowLogic &npv() { return m_session.npv(); }
     economics::HeadlessNpvView &npvView() { return m_npvView; }
     shell::HeadlessClipboard &clipboard() { return m_clipboard; }
-    economics::TimberPricesWindowLogic &timberPrices() { return m_timberPrices; }
+    economics::TimberPricesWindowLogic &timberPrices() { return m_session.timberPrices(); }
     economics::HeadlessTimberPricesView &timberPricesView() { return m_timberPricesView; }
-    economics::EconomicsWindowLogic &economics() { return m_economics; }
+    economics::EconomicsWindowLogic &economics() { return m_session.economics(); }
     economics::HeadlessEconomicsView &economicsView() { return m_economicsView; }
-    economics::AssortPricesWindowLogic &assortPrices() { return m_assortPrices; }
+    economics::AssortPricesWindowLogic &assortPrices() { return m_session.assortPrices(); }
     economics::HeadlessAssortPricesView &assortPricesView() { return m_assortPricesView; }
 
 private:
-    shell::ErrorLog m_log;
     PrintingInteractive m_interactive;
-    shell::EngineReport m_report;
-    engine::Grow m_grow;
-    economics::Prices m_prices;
     workflow::HeadlessMainView m_mainView;
-    workflow::MainWindowLogic m_main;
     thinning::HeadlessThinView m_thinView;
-    thinning::ThinWindowLogic m_thin;
     shell::HeadlessClipboard m_clipboard;
     economics::HeadlessNpvView m_npvView;
-    economics::NpvWindowLogic m_npv;
     economics::HeadlessTimberPricesView m_timberPricesView;
-    economics::TimberPricesWindowLogic m_timberPrices{m_prices, m_log, m_timberPricesView};
     assortments::HeadlessAssortView m_assortView;
-    assortments::AssortWindowLogic m_assort;
     assortments::HeadlessAssortUserView m_assortUserView;
-    assortments::AssortUserLogic m_assortUser;
     economics::HeadlessEconomicsView m_economicsView;
-    economics::EconomicsWindowLogic m_economics{m_main, m_thin, m_economicsView, m_interactive};
     economics::HeadlessAssortPricesView m_assortPricesView;
-    economics::AssortPricesWindowLogic m_assortPrices{m_prices.data(), m_log, m_assortPricesView,
-                                                      m_interactive};
+    estatewindow::HeadlessEstateView m_estateView;
+    session::Session m_session;
 };
 
 } // namespace arbolex::cli

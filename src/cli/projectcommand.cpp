@@ -5,7 +5,7 @@
 #include "cli/options.hpp"
 #include "cli/resultdocument.hpp"
 #include "cli/standinput.hpp"
-#include "workflow/standmath.hpp"
+#include "rotation/standmath.hpp"
 
 #include <vector>
 
@@ -16,7 +16,7 @@ namespace {
 float diameter(const engine::StandState &s) {
     float basalArea = s.basalArea;
     float stocking = s.stocking;
-    return workflow::dbhFromBasalArea(basalArea, stocking);
+    return rotation::dbhFromBasalArea(basalArea, stocking);
 }
 } // namespace
 

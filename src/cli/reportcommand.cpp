@@ -66,8 +66,8 @@ int runReport(CommandContext &context) {
         context.err << "arbolex-cli report: " << fault << '\n';
         return kExitBadArguments;
     }
-    const int pages = report::writeReportPdf(charts::reportContent(session.main()), outPath,
-                                             report::printedNow());
+    const int pages = report::writeReportPdf(
+        charts::reportContent(session.work(), session.economics()), outPath, report::printedNow());
     if (pages == 0) {
         context.err << "arbolex-cli report: cannot write " << outPath << '\n';
         return kExitEngineFailure;
@@ -90,8 +90,11 @@ Command reportCommand() {
                 "as an A4 landscape PDF: the identification, the\n"
                 "model, the stand at the start, site index and yield class, the projection\n"
                 "table, the summary, the cash flow with its net present value, and the\n"
-                "charts of stand development, increments and cash flow. Nothing in the\n"
-                "data folder is changed. Prints REPORT.pdf<TAB>N pages.\n"
+                "charts of stand development, increments and cash flow. When SCRIPT\n"
+                "valued the rotation in the economics window (press cmdEconomics or\n"
+                "frmEconomics.cmdCompute), a last page holds its figures, NPV, LEV and MAI\n"
+                "by rotation age and, once it ran the optimiser, the best regimes.\n"
+                "Nothing in the data folder is changed. Prints REPORT.pdf<TAB>N pages.\n"
                 "Exit status: 0 written, 1 the PDF cannot be written, 2 the command line,\n"
                 "the document or the script is wrong.\n"),
             &runReport};

@@ -1,8 +1,9 @@
 #include "cli/rotationinput.hpp"
 
 #include "cli/command.hpp"
-#include "economics/assortmentpricefile.hpp"
-#include "economics/prices.hpp"
+#include "prices/assortmentpricefile.hpp"
+#include "prices/costfile.hpp"
+#include "prices/prices.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/settings.hpp"
 
@@ -23,16 +24,16 @@ constexpr int kLongestAge = 200;
 
 struct PriceChoice {
     const char *word;
-    economics::PriceSet set;
+    prices::PriceSet set;
 };
 
-constexpr PriceChoice kPriceChoices[] = {{"current", economics::kCurrentPrices},
-                                         {"user", economics::kUserPrices},
-                                         {"longterm", economics::kLongTermPrices},
-                                         {"private", economics::kPrivatePrices}};
+constexpr PriceChoice kPriceChoices[] = {{"current", prices::kCurrentPrices},
+                                         {"user", prices::kUserPrices},
+                                         {"longterm", prices::kLongTermPrices},
+                                         {"private", prices::kPrivatePrices}};
 
 /// The price list of --prices as the option names it.
-const char *priceListWord(economics::PriceSet set) {
+const char *priceListWord(prices::PriceSet set) {
     const auto found = std::find_if(std::begin(kPriceChoices), std::end(kPriceChoices),
                                     [&](const PriceChoice &c) { return c.set == set; });
     return found->word;
@@ -48,7 +49,7 @@ QString classCaption(std::string_view caption) {
 
 /// The prices a valuation uses, class by class: the standing prices by
 /// mean tree volume and, valued by assortments, the assortment prices.
-QJsonObject pricesUsed(const rotation::Economics &economics, economics::PriceSet set) {
+QJsonObject pricesUsed(const rotation::Economics &economics, prices::PriceSet set) {
     auto prices = [](const auto &captions, const auto &list) {
         QJsonArray out;
         for (std::size_t i = 0; i < list.size(); ++i) {
@@ -70,7 +71,7 @@ QJsonObject pricesUsed(const rotation::Economics &economics, economics::PriceSet
 /// Records the data folder's price files the prices were read from, in the
 /// order they are read, to the first one missing.
 void recordPriceFiles(RunRecord &run, const QString &dataFolder) {
-    for (const char *name : economics::kFilesReadForPrices) {
+    for (const char *name : prices::kFilesReadForPrices) {
         const QString path = QDir(dataFolder).filePath(QLatin1String(name));
         run.fileRead(QLatin1String(name), path);
         if (!QFileInfo::exists(path)) {
@@ -80,15 +81,32 @@ void recordPriceFiles(RunRecord &run, const QString &dataFolder) {
 }
 
 double cost(const Options &options, const char *name) {
-    if (!options.has(name)) {
-        return 0.0;
-    }
     const double c = options.number(name);
     if (c < 0.0) {
         throw UsageError{QStringLiteral("--") + QLatin1String(name) +
                          QStringLiteral(" must not be negative")};
     }
     return c;
+}
+
+/// --establishment-cost and --annual-cost, each the data folder's cost file's
+/// without its option. The file is read whenever it is there, so that the run
+/// record lists it however the costs were given; a file that is refused stops
+/// the command when a cost is taken from it, and without a file the costs are
+/// 0, as the program starts without it. True when the file is there.
+bool readCosts(const Options &options, const QString &dataFolder, rotation::Economics &economics) {
+    const prices::CostsReading read =
+        prices::readCosts(QDir(dataFolder).filePath(QLatin1String(prices::kCostsFile)));
+    const bool establishmentGiven = options.has("establishment-cost");
+    const bool annualGiven = options.has("annual-cost");
+    if (!read.costs && !read.missing && !(establishmentGiven && annualGiven)) {
+        throw UsageError{QStringLiteral("costs ") + read.fault};
+    }
+    const prices::CostDefaults costs = read.costs.value_or(prices::CostDefaults{});
+    economics.establishmentCost =
+        establishmentGiven ? cost(options, "establishment-cost") : costs.establishment;
+    economics.annualCost = annualGiven ? cost(options, "annual-cost") : costs.annual;
+    return !read.missing;
 }
 
 /// --valuation and --assortment-prices: how harvests are valued, and with
@@ -110,8 +128,8 @@ void readValuation(const Options &options, const QString &dataFolder,
     const bool given = options.has("assortment-prices");
     const QString path =
         given ? options.text("assortment-prices")
-              : QDir(dataFolder).filePath(QLatin1String(economics::kAssortmentPricesFile));
-    const economics::AssortmentPricesReading read = economics::readAssortmentPrices(path);
+              : QDir(dataFolder).filePath(QLatin1String(prices::kAssortmentPricesFile));
+    const prices::AssortmentPricesReading read = prices::readAssortmentPrices(path);
     if (!read.prices) {
         throw UsageError{QStringLiteral("assortment prices ") + read.fault};
     }
@@ -120,7 +138,7 @@ void readValuation(const Options &options, const QString &dataFolder,
     if (given) {
         run.input(QStringLiteral("assortment_prices"), Value::word(path));
     }
-    run.fileRead(given ? path : QLatin1String(economics::kAssortmentPricesFile), path);
+    run.fileRead(given ? path : QLatin1String(prices::kAssortmentPricesFile), path);
 }
 
 } // namespace
@@ -167,8 +185,10 @@ QString economicsOptionsHelp() {
            QString::number(shell::kDefaultInterestRate) +
            QStringLiteral(
                ")\n"
-               "  --establishment-cost C    cost at age 0, euro/ha (default 0)\n"
-               "  --annual-cost C           cost of every year, euro/ha (default 0)\n"
+               "  --establishment-cost C    cost at age 0, euro/ha (default: Costs.qdm of\n"
+               "                            the data folder)\n"
+               "  --annual-cost C           cost of every year, euro/ha (default: Costs.qdm\n"
+               "                            of the data folder)\n"
                "  --prices current|user|longterm|private\n"
                "                            price list (default longterm: the long-term\n"
                "                            average prices the net present value uses)\n"
@@ -201,9 +221,8 @@ rotation::Economics readEconomics(const Options &options, const QString &dataFol
         throw UsageError{
             QStringLiteral("--rate must be above 0: the land expectation value needs interest")};
     }
-    economics.establishmentCost = cost(options, "establishment-cost");
-    economics.annualCost = cost(options, "annual-cost");
-    economics::PriceSet set = economics::kLongTermPrices;
+    const bool costsFile = readCosts(options, dataFolder, economics);
+    prices::PriceSet set = prices::kLongTermPrices;
     if (options.has("prices")) {
         const QString word = options.text("prices");
         const auto found =
@@ -214,9 +233,9 @@ rotation::Economics readEconomics(const Options &options, const QString &dataFol
         }
         set = found->set;
     }
-    economics::Prices prices;
+    prices::Prices prices;
     shell::ErrorLog log(dataFolder);
-    economics::GetPricesFromFiles(dataFolder, prices.data(), log);
+    prices::GetPricesFromFiles(dataFolder, prices.data(), log);
     prices.selectPriceSet(set);
     economics.prices = prices.pricesInUse();
     run.inputs({{QStringLiteral("rate"), Value::exact(economics.ratePercent)},
@@ -224,6 +243,10 @@ rotation::Economics readEconomics(const Options &options, const QString &dataFol
                 {QStringLiteral("annual_cost"), Value::exact(economics.annualCost)},
                 {QStringLiteral("prices"), Value::word(QLatin1String(priceListWord(set)))}});
     recordPriceFiles(run, dataFolder);
+    if (costsFile) {
+        run.fileRead(QLatin1String(prices::kCostsFile),
+                     QDir(dataFolder).filePath(QLatin1String(prices::kCostsFile)));
+    }
     readValuation(options, dataFolder, economics, run);
     run.insert(QStringLiteral("prices_used"), pricesUsed(economics, set));
     return economics;

@@ -37,7 +37,8 @@ std::vector<const char *> economicsOptionNames();
 QString economicsOptionsHelp();
 
 /// Reads the interest rate (above 0, the program's default rate without it),
-/// the costs (0 by default, never negative) and the price list (long-term
+/// the costs (never negative; without their options those of the data
+/// folder's cost file, 0 when it has none) and the price list (long-term
 /// average prices without --prices), whose prices come from the data folder's
 /// files as the program reads them, each as its absolute value, and the
 /// valuation (--valuation, by assortments with the prices of

@@ -7,6 +7,7 @@
 #include "cli/gridoutput.hpp"
 #include "shell/tableexport.hpp"
 
+#include <QElapsedTimer>
 #include <QFile>
 #include <QRegularExpression>
 #include <QSettings>
@@ -16,8 +17,8 @@ namespace arbolex::cli {
 
 using workflow::MainControl;
 
-ScriptRunner::ScriptRunner(HeadlessSession &session, QTextStream &out)
-    : m_session(session), m_out(out), m_documents(session.main(), session.interactive(), nullptr) {
+ScriptRunner::ScriptRunner(ScriptTarget &session, QTextStream &out)
+    : m_session(session), m_out(out), m_documents(session.session().documents()) {
     m_documents.start();
     workflow::MainWindowLogic &main = session.main();
     m_commands = {
@@ -151,8 +152,30 @@ QString ScriptRunner::runLine(const QString &rawLine) {
         if (rest != QLatin1String("yes") && rest != QLatin1String("no")) {
             return QStringLiteral("answer needs yes or no");
         }
-        m_session.interactive().queueAnswer(rest == QLatin1String("yes"));
+        m_session.queueAnswer(rest == QLatin1String("yes"));
         return {};
+    }
+    if (command == QLatin1String("time")) {
+        // Runs the rest of the line and prints how long it took, the windows
+        // drawn: "TIME<TAB>line<TAB>milliseconds".
+        QElapsedTimer timer;
+        timer.start();
+        const QString error = runLine(rest);
+        m_session.settle();
+        const double ms = static_cast<double>(timer.nsecsElapsed()) / 1e6;
+        m_out << "TIME\t" << rest << '\t' << QString::number(ms, 'f', 1) << '\n';
+        return error;
+    }
+    if (command == QLatin1String("quit")) {
+        m_session.quitAfterScript();
+        return {};
+    }
+    if (command == QLatin1String("wait")) {
+        m_session.waitForWork();
+        return {};
+    }
+    if (command == QLatin1String("show")) {
+        return m_session.show(control, text);
     }
     return QStringLiteral("unknown command '") + command + QLatin1Char('\'');
 }
@@ -255,6 +278,11 @@ QString ScriptRunner::set(const QString &control, const QString &text) {
 }
 
 QString ScriptRunner::press(const QString &control) {
+    static const QRegularExpression estateRow(QStringLiteral(R"(^frmEstate\.grdEstate\((\d+)\)$)"));
+    if (const QRegularExpressionMatch row = estateRow.match(control); row.hasMatch()) {
+        m_session.estate().openSubCompartment(row.captured(1).toInt());
+        return {};
+    }
     if (const auto prices = timberPricesItem(control)) {
         if (!m_session.timberPrices().press(prices->control)) {
             return QStringLiteral("no command named '") + control + QLatin1Char('\'');
@@ -319,7 +347,7 @@ QString ScriptRunner::print(const QString &control) {
         return {};
     }
     if (control == QLatin1String("clipboard")) {
-        m_out << m_session.clipboard().text();
+        m_out << m_session.clipboardText();
         return {};
     }
     if (control == QLatin1String("frmNPV.NPV_Grid")) {
@@ -331,7 +359,7 @@ QString ScriptRunner::print(const QString &control) {
         return {};
     }
     if (const auto thin = thinControl(control)) {
-        thinning::HeadlessThinView &view = m_session.thinView();
+        const thinning::IThinView &view = m_session.thinView();
         if (*thin == thinning::ThinControl::chkActivLoop) {
             m_out << (view.isChecked(*thin) ? "1" : "0") << '\n';
         } else {
@@ -340,7 +368,7 @@ QString ScriptRunner::print(const QString &control) {
         return {};
     }
     if (const auto prices = timberPricesItem(control)) {
-        const economics::HeadlessTimberPricesView &view = m_session.timberPricesView();
+        const economics::ITimberPricesView &view = m_session.timberPricesView();
         if (economics::isPriceOption(prices->control)) {
             m_out << (view.isChecked(prices->control) ? "1" : "0") << '\n';
         } else {
@@ -356,7 +384,7 @@ QString ScriptRunner::print(const QString &control) {
     return {};
 }
 
-ScriptRunner::Outcome runScriptText(const QByteArray &script, HeadlessSession &session,
+ScriptRunner::Outcome runScriptText(const QByteArray &script, ScriptTarget &session,
                                     QSettings &settings, QTextStream &out) {
     const QStringList lines = QString::fromUtf8(script).split(QLatin1Char('\n'));
     session.main().Form_Load(settings, QRect(0, 0, 1280, 800));

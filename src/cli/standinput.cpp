@@ -1,6 +1,6 @@
 #include "cli/standinput.hpp"
 
-#include "workflow/standmath.hpp"
+#include "rotation/standmath.hpp"
 
 #include <cmath>
 
@@ -56,7 +56,7 @@ StandInput readStand(const Options &options) {
     if (options.oneOf({"basal-area", "dbh"}) == 0) {
         stand.basalArea = options.positive("basal-area");
     } else {
-        stand.basalArea = workflow::basalAreaFromDbh(stand.stocking, options.positive("dbh"));
+        stand.basalArea = rotation::basalAreaFromDbh(stand.stocking, options.positive("dbh"));
     }
     return stand;
 }

@@ -112,6 +112,7 @@ constexpr KeyUnit kEstateUnits[] = {
     {"final_cut_volume_ha", kCubicMetresPerHa},
     {"final_cut_volume", kCubicMetres},
     {"max_mai", kCubicMetresPerHaYear},
+    {"mai_final_cut", kCubicMetresPerHaYear},
     {"npv_ha", kEuroPerHa},
     {"npv", kEuro},
     {"lev_ha", kEuroPerHa},

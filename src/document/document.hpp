@@ -1,19 +1,20 @@
 #pragma once
 
 // A sub-compartment as a document: the file format's name and version, and
-// the work it holds (the main window's snapshot with its identification).
+// the work it holds (the work on the sub-compartment as a whole).
 
-#include "workflow/mainsnapshot.hpp"
+#include "work/worksnapshot.hpp"
 
 namespace arbolex::document {
 
 /// The work of one sub-compartment as a file holds it.
-using Document = workflow::MainSnapshot;
+using Document = work::WorkSnapshot;
 
 /// Value of the "format" field that opens every file.
 inline constexpr const char *kFormatName = "ARBOLEX sub-compartment";
-/// Version this program writes; it reads this and every older one.
-inline constexpr int kFormatVersion = 1;
+/// Version this program writes; it reads this and every older one. Version 2
+/// adds the establishment and yearly costs to the cash flow.
+inline constexpr int kFormatVersion = 2;
 /// Suffix of a document's file name, without the dot.
 inline constexpr const char *kFileSuffix = "arbolex";
 
@@ -55,6 +56,8 @@ inline constexpr const char *otherRevenues = "otherRevenues";
 inline constexpr const char *totalRevenues = "totalRevenues";
 inline constexpr const char *cashFlowValue = "cashFlow";
 inline constexpr const char *discountedCashFlow = "discountedCashFlow";
+inline constexpr const char *establishmentCost = "establishmentCost";
+inline constexpr const char *annualCost = "annualCost";
 inline constexpr const char *prices = "prices";
 inline constexpr const char *setInUse = "setInUse";
 inline constexpr const char *inUse = "inUse";

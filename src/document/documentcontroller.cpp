@@ -5,23 +5,30 @@
 #include "document/documentwriter.hpp"
 #include "document/idocumentdialogs.hpp"
 #include "shell/apperror.hpp"
+#include "shell/errorlog.hpp"
 #include "shell/interactive.hpp"
 #include "shell/settings.hpp"
+#include "work/standwork.hpp"
+#include "workflow/iworkwindows.hpp"
 #include "workflow/mainmessages.hpp"
-#include "workflow/mainwindowlogic.hpp"
 
 #include <QDir>
 #include <QFileInfo>
 
 namespace arbolex::document {
 
-DocumentController::DocumentController(workflow::MainWindowLogic &main,
+DocumentController::DocumentController(work::StandWork &work, workflow::IMainCommands &main,
                                        shell::IInteractive &interactive, QSettings *settings,
                                        IDocumentDialogs *dialogs)
-    : m_main(main), m_interactive(interactive), m_settings(settings), m_dialogs(dialogs) {
+    : m_work(work), m_main(main), m_interactive(interactive), m_settings(settings),
+      m_dialogs(dialogs) {
     if (m_settings != nullptr) {
         m_recent = shell::readRecentFiles(*m_settings);
     }
+}
+
+DocumentController::~DocumentController() {
+    QObject::disconnect(m_followsWork);
 }
 
 QString DocumentController::lastFolder() const {
@@ -31,6 +38,11 @@ QString DocumentController::lastFolder() const {
 
 void DocumentController::start() {
     adopt(QString());
+    // From now on the caption's unsaved mark follows every change of the work.
+    if (!m_followsWork) {
+        m_followsWork =
+            QObject::connect(&m_work, &work::StandWork::changed, [this] { refreshCaption(); });
+    }
     if (m_dialogs != nullptr) {
         m_dialogs->recentFilesChanged(m_recent);
     }
@@ -44,17 +56,17 @@ QString DocumentController::displayName() const {
 }
 
 bool DocumentController::isModified() const {
-    return !m_main.snapshot().sameWork(m_saved);
+    return !m_work.snapshot().sameWork(m_saved);
 }
 
 void DocumentController::refreshCaption() {
-    m_main.setDocumentTitle(displayName(), isModified());
+    m_work.setDocumentTitle(displayName(), isModified());
 }
 
 void DocumentController::adopt(const QString &path) {
     m_path = path;
     m_newName.clear();
-    m_saved = m_main.snapshot();
+    m_saved = m_work.snapshot();
     if (!path.isEmpty()) {
         rememberRecent(path);
     }
@@ -92,7 +104,7 @@ bool DocumentController::maySafelyDiscard() {
 }
 
 Document DocumentController::emptyWork() const {
-    Document empty = m_main.snapshot();
+    Document empty = m_work.snapshot();
     empty.identification = {};
     empty.rows.clear();
     empty.currentRow = 0;
@@ -100,6 +112,9 @@ Document DocumentController::emptyWork() const {
     empty.standingVolume = 0.0;
     empty.felled = false;
     empty.cashFlow.clear();
+    // A new sub-compartment starts with the data folder's costs.
+    empty.establishmentCost = m_work.defaultEstablishmentCost();
+    empty.annualCost = m_work.defaultAnnualCost();
     return empty;
 }
 
@@ -183,7 +198,7 @@ bool DocumentController::saveAs() {
     }
     QString suggested = m_path;
     if (suggested.isEmpty()) {
-        const SubCompartment &id = m_main.identification();
+        const work::SubCompartment &id = m_work.identification();
         QString stem = QStringList{id.forest, id.compartment, id.subCompartment}.join(u' ');
         stem = stem.simplified();
         suggested = QDir(lastFolder())
@@ -202,11 +217,11 @@ bool DocumentController::saveAs() {
 
 bool DocumentController::saveAs(const QString &path) {
     QString reason;
-    if (!writeDocumentFile(path, m_main.snapshot(), reason)) {
+    if (!writeDocumentFile(path, m_work.snapshot(), reason)) {
         m_interactive.message(workflow::text::titleArbolex(),
                               text::saveFault(QFileInfo(path).fileName(), reason),
                               shell::kExclamation);
-        m_main.errorLog().append(shell::moduleFaultLine(
+        m_work.errorLog().append(shell::moduleFaultLine(
             {shell::RuntimeError{shell::RuntimeError::pathFileAccessError().number, reason}, 0},
             QStringLiteral(" in procedure SaveSubCompartment of Module Document")));
         return false;
@@ -219,14 +234,18 @@ void DocumentController::editIdentification() {
     if (m_dialogs == nullptr) {
         return;
     }
-    SubCompartment id = m_main.identification();
+    work::SubCompartment id = m_work.identification();
     if (m_dialogs->editIdentification(id)) {
         setIdentification(id);
     }
 }
 
-void DocumentController::setIdentification(const SubCompartment &id) {
-    m_main.setIdentification(id);
+const work::SubCompartment &DocumentController::identification() const {
+    return m_work.identification();
+}
+
+void DocumentController::setIdentification(const work::SubCompartment &id) {
+    m_work.setIdentification(id);
     refreshCaption();
 }
 

@@ -8,6 +8,7 @@
 
 #include "document/document.hpp"
 
+#include <QMetaObject>
 #include <QString>
 #include <QStringList>
 
@@ -17,8 +18,12 @@ namespace arbolex::shell {
 class IInteractive;
 }
 
+namespace arbolex::work {
+class StandWork;
+}
+
 namespace arbolex::workflow {
-class MainWindowLogic;
+class IMainCommands;
 }
 
 namespace arbolex::document {
@@ -27,14 +32,20 @@ class IDocumentDialogs;
 
 class DocumentController {
 public:
+    /// The document of `work`, which `main` puts back when one is opened.
     /// `settings` keeps the recent documents and the last folder; `dialogs`
     /// shows the file and identification dialogs. Either may be null where
     /// files are named directly (a script).
-    DocumentController(workflow::MainWindowLogic &main, shell::IInteractive &interactive,
-                       QSettings *settings, IDocumentDialogs *dialogs = nullptr);
+    DocumentController(work::StandWork &work, workflow::IMainCommands &main,
+                       shell::IInteractive &interactive, QSettings *settings,
+                       IDocumentDialogs *dialogs = nullptr);
+    ~DocumentController();
+    DocumentController(const DocumentController &) = delete;
+    DocumentController &operator=(const DocumentController &) = delete;
 
     /// Takes the work as it stands after the window's load as an unsaved,
-    /// unchanged "Untitled" document.
+    /// unchanged "Untitled" document; from then on the caption's unsaved mark
+    /// follows every change of the work.
     void start();
 
     // ---- The File menu ----------------------------------------------------------
@@ -56,7 +67,8 @@ public:
     void fileClose();
     /// Sub-compartment identification: edited in its dialog.
     void editIdentification();
-    void setIdentification(const SubCompartment &id);
+    void setIdentification(const work::SubCompartment &id);
+    const work::SubCompartment &identification() const;
 
     /// The work now in the window becomes a new document, never saved and
     /// named `name` until it is: everything in it counts as unsaved. The
@@ -89,7 +101,8 @@ private:
     void rememberRecent(const QString &path);
     QString lastFolder() const;
 
-    workflow::MainWindowLogic &m_main;
+    work::StandWork &m_work;
+    workflow::IMainCommands &m_main;
     shell::IInteractive &m_interactive;
     QSettings *m_settings;
     IDocumentDialogs *m_dialogs;
@@ -99,6 +112,7 @@ private:
     /// The work as last opened or saved.
     Document m_saved;
     QStringList m_recent;
+    QMetaObject::Connection m_followsWork;
 };
 
 } // namespace arbolex::document

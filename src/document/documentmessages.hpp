@@ -2,19 +2,21 @@
 
 // Every text of the documents: captions, questions, faults and menu entries.
 
+#include "work/subcompartment.hpp"
+
 #include <QString>
 
 namespace arbolex::document::text {
 
 // ---- The identification -------------------------------------------------------
 inline QString captionForest() {
-    return QStringLiteral("Forest");
+    return work::SubCompartment::forestCaption();
 }
 inline QString captionCompartment() {
-    return QStringLiteral("Compartment");
+    return work::SubCompartment::compartmentCaption();
 }
 inline QString captionSubCompartment() {
-    return QStringLiteral("Sub-compartment");
+    return work::SubCompartment::subCompartmentCaption();
 }
 inline QString captionNotes() {
     return QStringLiteral("Notes");
@@ -28,14 +30,6 @@ inline QString titleIdentification() {
 /// Name of a document never saved.
 inline QString untitled() {
     return QStringLiteral("Untitled");
-}
-/// Between the model in use and the document's name.
-inline QString captionDocument() {
-    return QStringLiteral("   ----  ");
-}
-/// After the name of a document with unsaved changes.
-inline QString unsavedMark() {
-    return QStringLiteral(" *");
 }
 
 // ---- Questions and faults --------------------------------------------------------

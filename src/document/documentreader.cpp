@@ -1,7 +1,7 @@
 #include "document/documentreader.hpp"
 
-#include "economics/prices.hpp"
 #include "engine/catalogue.hpp"
+#include "prices/prices.hpp"
 
 #include <QFile>
 #include <QFileInfo>
@@ -11,13 +11,14 @@
 
 #include <cmath>
 #include <limits>
+#include <optional>
 
 namespace arbolex::document {
 
 namespace {
 
-using workflow::RowKind;
-using workflow::TableRow;
+using work::RowKind;
+using work::TableRow;
 
 // Limits of what a sub-compartment can hold; anything beyond is damage.
 constexpr int kMaxRows = 5000;
@@ -36,6 +37,8 @@ constexpr double kMaxBasalArea = 1000.0;
 constexpr double kMaxVolume = 100000.0;
 constexpr double kMaxInterestRate = 1000.0;
 constexpr double kMaxPrice = 1.0e6;
+/// Highest establishment or yearly cost, euro/ha.
+constexpr double kMaxCost = 1.0e6;
 
 /// Why a document was refused; thrown only inside this file.
 struct Refused {
@@ -78,6 +81,15 @@ public:
                            QStringLiteral(" characters"));
         }
         return v.toString();
+    }
+
+    /// A number in [low, high] when the field is there; std::nullopt when it
+    /// is not (a field a document of an older version does not have).
+    std::optional<double> optionalNumber(const char *key, double low, double high) const {
+        if (!m_object.contains(name(key))) {
+            return std::nullopt;
+        }
+        return number(key, low, high);
     }
 
     bool boolean(const char *key) const {
@@ -168,10 +180,10 @@ private:
     QString m_place;
 };
 
-SubCompartment readIdentification(const ObjectReader &top) {
+work::SubCompartment readIdentification(const ObjectReader &top) {
     const ObjectReader r(top.object(key::subCompartment),
                          QStringLiteral("the sub-compartment's identification"));
-    SubCompartment id;
+    work::SubCompartment id;
     id.forest = r.string(key::forest, kMaxNameLength);
     id.compartment = r.string(key::compartment, kMaxNameLength);
     id.subCompartment = r.string(key::subCompartment, kMaxNameLength);
@@ -181,8 +193,9 @@ SubCompartment readIdentification(const ObjectReader &top) {
 
 void readFields(const ObjectReader &top, Document &d) {
     const ObjectReader r(top.object(key::fields), QStringLiteral("the grow-from fields"));
-    for (std::size_t i = 0; i < workflow::kSnapshotFields.size(); ++i) {
-        const QByteArray field = workflow::controlName(workflow::kSnapshotFields.at(i)).toLatin1();
+    for (std::size_t i = 0; i < work::kWorkFields.size(); ++i) {
+        const std::string_view name = work::workFieldName(work::kWorkFields.at(i));
+        const QByteArray field(name.data(), static_cast<qsizetype>(name.size()));
         const QString text = r.string(field.constData(), kMaxFieldLength);
         // The fields take digits and the decimal point only: a minus sign
         // (a negative stocking) or a letter was never typed there.
@@ -196,22 +209,22 @@ void readFields(const ObjectReader &top, Document &d) {
     }
 }
 
-RowKind readKind(const ObjectReader &r) {
+work::RowKind readKind(const ObjectReader &r) {
     const QString kind = r.string(key::kind, kMaxLabelLength);
     for (int k = 0; k < static_cast<int>(std::size(kRowKindNames)); ++k) {
         if (kind == QLatin1String(kRowKindNames[k])) {
-            return static_cast<RowKind>(k - 1);
+            return static_cast<work::RowKind>(k - 1);
         }
     }
     r.wrong(key::kind, QStringLiteral("is \"") + kind + QStringLiteral("\", no kind of row"));
 }
 
-void readRecord(const ObjectReader &row, TableRow &t) {
+void readRecord(const ObjectReader &row, work::TableRow &t) {
     const ObjectReader r(row.object(key::record), row.place() + QStringLiteral(", its record"));
     // A failed projection's row keeps whatever the engine left in it; any
     // other row holds a stand and is checked as one.
-    const bool any = t.kind == RowKind::Failed;
-    workflow::RowRecord &rec = t.record;
+    const bool any = t.kind == work::RowKind::Failed;
+    work::RowRecord &rec = t.record;
     rec.age = r.single(kRecordFields[0], 0.0, kMaxAge);
     rec.topHeight = r.single(kRecordFields[1], 0.0, kMaxTopHeight, any);
     rec.basalArea = r.single(kRecordFields[2], 0.0, kMaxBasalArea, any);
@@ -224,25 +237,24 @@ void readRecord(const ObjectReader &row, TableRow &t) {
     rec.postDbh = r.single(kRecordFields[9], 0.0, kMaxBasalArea, any);
 }
 
-TableRow readRow(const QJsonValue &value, int index) {
+work::TableRow readRow(const QJsonValue &value, int index) {
     const QString place = QStringLiteral("row ") + QString::number(index);
     if (!value.isObject()) {
         refuse(place + QStringLiteral(" is not a group of fields"));
     }
     const ObjectReader r(value.toObject(), place);
-    TableRow t;
+    work::TableRow t;
     t.kind = readKind(r);
     t.label = r.string(key::label, kMaxLabelLength);
-    for (const QJsonValue cell :
-         r.array(key::cells, workflow::kColumnCount, workflow::kColumnCount)) {
+    for (const QJsonValue cell : r.array(key::cells, work::kColumnCount, work::kColumnCount)) {
         if (!cell.isString() || cell.toString().size() > kMaxCellLength) {
             r.wrong(key::cells, QStringLiteral("holds a cell that is not a short text"));
         }
         t.cells << cell.toString();
     }
     readRecord(r, t);
-    const bool any = t.kind == RowKind::Failed;
-    const QJsonArray numbers = r.array(key::numbers, workflow::kNumMai + 1, workflow::kNumMai + 1);
+    const bool any = t.kind == work::RowKind::Failed;
+    const QJsonArray numbers = r.array(key::numbers, work::kNumMai + 1, work::kNumMai + 1);
     for (std::size_t i = 0; i < t.numbers.size(); ++i) {
         t.numbers.at(i) = r.numberOf(numbers.at(static_cast<qsizetype>(i)), key::numbers,
                                      -kMaxVolume, kMaxVolume, any);
@@ -257,16 +269,16 @@ void readTable(const ObjectReader &top, Document &d) {
     const ObjectReader r(top.object(key::table), QStringLiteral("the projection table"));
     const QString layout = r.string(key::layout, kMaxLabelLength);
     if (layout == QLatin1String(kLayoutWithMoney)) {
-        d.layout = workflow::HeaderLayout::WithMoney;
+        d.layout = work::HeaderLayout::WithMoney;
     } else if (layout == QLatin1String(kLayoutWithoutMoney)) {
-        d.layout = workflow::HeaderLayout::WithoutMoney;
+        d.layout = work::HeaderLayout::WithoutMoney;
     } else {
         r.wrong(key::layout, QStringLiteral("is no layout of the table"));
     }
     const QJsonArray rows = r.array(key::rows, 0, kMaxRows);
     int finalCuts = 0;
     for (qsizetype i = 0; i < rows.size(); ++i) {
-        TableRow row = readRow(rows.at(i), static_cast<int>(i) + 1);
+        work::TableRow row = readRow(rows.at(i), static_cast<int>(i) + 1);
         if (!d.rows.empty() && row.record.age < d.rows.back().record.age) {
             refuse(QStringLiteral("row ") + QString::number(i + 1) +
                    QStringLiteral(" is younger than the row before it: the rows are not in "
@@ -289,6 +301,9 @@ void readCashFlow(const ObjectReader &top, Document &d) {
     const ObjectReader r(top.object(key::cashFlow), QStringLiteral("the cash flow"));
     d.interestRate = r.number(key::interestRate, 0.0, kMaxInterestRate);
     d.cashFlowFirstYear = r.integer(key::firstYear, 0, std::numeric_limits<std::int16_t>::max());
+    // Written since version 2; without them the work takes the default costs.
+    d.establishmentCost = r.optionalNumber(key::establishmentCost, 0.0, kMaxCost);
+    d.annualCost = r.optionalNumber(key::annualCost, 0.0, kMaxCost);
     const QJsonArray years = r.array(key::years, 0, kMaxCashFlowYears);
     if (!years.isEmpty() && !d.felled) {
         r.wrong(key::years, QStringLiteral("are laid out before the final cut"));
@@ -304,7 +319,7 @@ void readCashFlow(const ObjectReader &top, Document &d) {
             refuse(place + QStringLiteral(" is not a group of fields"));
         }
         const ObjectReader y(years.at(i).toObject(), place);
-        economics::CashFlowRecord rec;
+        work::CashFlowRecord rec;
         const int expected = d.cashFlowFirstYear + static_cast<int>(i);
         rec.year = static_cast<std::int16_t>(y.integer(key::year, expected, expected));
         rec.operation = y.string(key::operation, kMaxOperationLength);
@@ -321,7 +336,7 @@ void readCashFlow(const ObjectReader &top, Document &d) {
 void readPrices(const ObjectReader &top, Document &d) {
     const ObjectReader r(top.object(key::prices), QStringLiteral("the prices in use"));
     d.priceSetInUse = static_cast<std::int16_t>(
-        r.integer(key::setInUse, economics::kCurrentPrices, economics::kPrivatePrices));
+        r.integer(key::setInUse, prices::kCurrentPrices, prices::kPrivatePrices));
     const QJsonArray prices =
         r.array(key::inUse, rotation::kPriceClassCount, rotation::kPriceClassCount);
     for (std::size_t i = 0; i < d.pricesInUse.size(); ++i) {

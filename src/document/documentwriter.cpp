@@ -11,7 +11,7 @@ namespace arbolex::document {
 
 namespace {
 
-using workflow::TableRow;
+using work::TableRow;
 
 QString name(const char *key) {
     return QLatin1String(key);
@@ -29,15 +29,15 @@ QJsonValue number(double value) {
     return value;
 }
 
-QJsonObject identificationJson(const SubCompartment &id) {
+QJsonObject identificationJson(const work::SubCompartment &id) {
     return {{name(key::forest), id.forest},
             {name(key::compartment), id.compartment},
             {name(key::subCompartment), id.subCompartment},
             {name(key::notes), id.notes}};
 }
 
-QJsonObject rowJson(const TableRow &row) {
-    const workflow::RowRecord &r = row.record;
+QJsonObject rowJson(const work::TableRow &row) {
+    const work::RowRecord &r = row.record;
     const float values[] = {r.age,           r.topHeight, r.basalArea,        r.stocking,
                             r.volume,        r.dbh,       r.removedBasalArea, r.removedStocking,
                             r.removedVolume, r.postDbh};
@@ -61,22 +61,22 @@ QJsonObject rowJson(const TableRow &row) {
 
 QJsonObject tableJson(const Document &d) {
     QJsonArray rows;
-    for (const TableRow &row : d.rows) {
+    for (const work::TableRow &row : d.rows) {
         rows.append(rowJson(row));
     }
-    return {{name(key::layout),
-             name(d.layout == workflow::HeaderLayout::WithMoney ? kLayoutWithMoney
-                                                                : kLayoutWithoutMoney)},
-            {name(key::currentRow), d.currentRow},
-            {name(key::selectionEnd), d.selectionEnd},
-            {name(key::standingVolume), number(d.standingVolume)},
-            {name(key::felled), d.felled},
-            {name(key::rows), rows}};
+    return {
+        {name(key::layout),
+         name(d.layout == work::HeaderLayout::WithMoney ? kLayoutWithMoney : kLayoutWithoutMoney)},
+        {name(key::currentRow), d.currentRow},
+        {name(key::selectionEnd), d.selectionEnd},
+        {name(key::standingVolume), number(d.standingVolume)},
+        {name(key::felled), d.felled},
+        {name(key::rows), rows}};
 }
 
 QJsonObject cashFlowJson(const Document &d) {
     QJsonArray years;
-    for (const economics::CashFlowRecord &y : d.cashFlow) {
+    for (const work::CashFlowRecord &y : d.cashFlow) {
         years.append(QJsonObject{{name(key::year), y.year},
                                  {name(key::operation), y.operation},
                                  {name(key::cost), number(y.cost)},
@@ -86,17 +86,26 @@ QJsonObject cashFlowJson(const Document &d) {
                                  {name(key::cashFlowValue), number(y.cashFlow)},
                                  {name(key::discountedCashFlow), number(y.discountedCashFlow)}});
     }
-    return {{name(key::interestRate), number(d.interestRate)},
-            {name(key::firstYear), d.cashFlowFirstYear},
-            {name(key::years), years}};
+    QJsonObject cashFlow{{name(key::interestRate), number(d.interestRate)},
+                         {name(key::firstYear), d.cashFlowFirstYear},
+                         {name(key::years), years}};
+    if (d.establishmentCost) {
+        cashFlow.insert(name(key::establishmentCost), number(*d.establishmentCost));
+    }
+    if (d.annualCost) {
+        cashFlow.insert(name(key::annualCost), number(*d.annualCost));
+    }
+    return cashFlow;
 }
 
 } // namespace
 
 QByteArray documentToJson(const Document &d) {
     QJsonObject fields;
-    for (std::size_t i = 0; i < workflow::kSnapshotFields.size(); ++i) {
-        fields.insert(workflow::controlName(workflow::kSnapshotFields.at(i)), d.fields.at(i));
+    for (std::size_t i = 0; i < work::kWorkFields.size(); ++i) {
+        const std::string_view name = work::workFieldName(work::kWorkFields.at(i));
+        fields.insert(QLatin1String(name.data(), static_cast<qsizetype>(name.size())),
+                      d.fields.at(i));
     }
     QJsonArray prices;
     for (double p : d.pricesInUse) {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "document/subcompartment.hpp"
+#include "work/subcompartment.hpp"
 
 #include <QString>
 #include <QStringList>
@@ -18,7 +18,7 @@ public:
     /// Where to save, starting from `suggestedPath`; empty when cancelled.
     virtual QString chooseFileToSave(const QString &suggestedPath) = 0;
     /// Lets the user edit `id`; false when cancelled (then `id` is unchanged).
-    virtual bool editIdentification(SubCompartment &id) = 0;
+    virtual bool editIdentification(work::SubCompartment &id) = 0;
     /// The list of Open Recent changed.
     virtual void recentFilesChanged(const QStringList &files) = 0;
 };

@@ -3,13 +3,14 @@
 #include "document/documentmessages.hpp"
 #include "document/documentreader.hpp"
 #include "shell/vbformat.hpp"
-#include "workflow/mainwindowlogic.hpp"
+#include "work/standwork.hpp"
+#include "workflow/iworkwindows.hpp"
 
 #include <QFileInfo>
 
 namespace arbolex::document {
 
-bool openDocumentInto(const QString &path, workflow::MainWindowLogic &main, QString &fault) {
+bool openDocumentInto(const QString &path, workflow::IMainCommands &main, QString &fault) {
     QString reason;
     const std::optional<Document> document = readDocumentFile(path, reason);
     if (!document) {
@@ -20,9 +21,9 @@ bool openDocumentInto(const QString &path, workflow::MainWindowLogic &main, QStr
     return true;
 }
 
-Document documentForStand(const workflow::MainWindowLogic &main, const rotation::Stand &stand,
-                          const SubCompartment &id, int targetAge, int step, double netArea) {
-    Document d = main.snapshot();
+Document documentForStand(const work::StandWork &work, const rotation::Stand &stand,
+                          const work::SubCompartment &id, int targetAge, int step, double netArea) {
+    Document d = work.snapshot();
     d.identification = id;
     d.modelId = stand.model;
     d.rows.clear();
@@ -33,6 +34,9 @@ Document documentForStand(const workflow::MainWindowLogic &main, const rotation:
     d.cashFlow.clear();
     d.siteIndex = 0.0f;
     d.siteIndexText.clear();
+    // A new sub-compartment: the data folder's costs, as the estate counts them.
+    d.establishmentCost = work.defaultEstablishmentCost();
+    d.annualCost = work.defaultAnnualCost();
     // The fields as SetGrowFrom writes them.
     d.fields = {shell::formatNumber(stand.age, u"##0"),
                 shell::formatNumber(stand.stocking, u"#####0"),

@@ -9,28 +9,32 @@
 
 #include <QString>
 
+namespace arbolex::work {
+class StandWork;
+}
+
 namespace arbolex::workflow {
-class MainWindowLogic;
+class IMainCommands;
 }
 
 namespace arbolex::document {
 
 /// Reads the sub-compartment saved in `path` (a .arbolex file) and puts it
-/// into `main` exactly as it was saved: the table, the records, the cash flow,
+/// back through `main` exactly as it was saved: the table, the records, the cash flow,
 /// the prices in use and the identification; growing goes on from the last
 /// row as if the program had never closed. Works on a headless session as on
 /// the window. A file that cannot be taken changes nothing in `main` and
 /// leaves in `fault` the "FAULT - " message that names the file and what is
 /// wrong. Asks nothing: the caller decides about unsaved work first.
-bool openDocumentInto(const QString &path, workflow::MainWindowLogic &main, QString &fault);
+bool openDocumentInto(const QString &path, workflow::IMainCommands &main, QString &fault);
 
 /// A new document for `stand` under `id`: the model and the grow-from fields
 /// of the stand as the window formats them, target age, step and net area,
-/// an empty table, and the prices and interest rate that `main` uses now.
-/// Restore it into a window (MainWindowLogic::restore), replay a regime
-/// through the window's handlers, then take MainWindowLogic::snapshot() to
-/// have the grown document.
-Document documentForStand(const workflow::MainWindowLogic &main, const rotation::Stand &stand,
-                          const SubCompartment &id, int targetAge, int step, double netArea);
+/// an empty table, the prices and interest rate that `work` uses now, and the
+/// data folder's costs.
+/// Put it back into a window (IMainCommands::restore), replay a regime, then
+/// take StandWork::snapshot() to have the grown document.
+Document documentForStand(const work::StandWork &work, const rotation::Stand &stand,
+                          const work::SubCompartment &id, int targetAge, int step, double netArea);
 
 } // namespace arbolex::document

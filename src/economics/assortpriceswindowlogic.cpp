@@ -1,9 +1,9 @@
 #include "economics/assortpriceswindowlogic.hpp"
 
-#include "economics/assortmentpricefile.hpp"
 #include "economics/assortpricesmessages.hpp"
 #include "economics/pricefieldkeys.hpp"
 #include "economics/timberpricesmessages.hpp"
+#include "prices/assortmentpricefile.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
@@ -35,7 +35,7 @@ QString windowLabel(const char *handler) {
 
 } // namespace
 
-AssortPricesWindowLogic::AssortPricesWindowLogic(PriceData &data, shell::ErrorLog &log,
+AssortPricesWindowLogic::AssortPricesWindowLogic(prices::PriceData &data, shell::ErrorLog &log,
                                                  IAssortPricesView &view,
                                                  shell::IInteractive &interactive)
     : m_data(data), m_log(log), m_view(view), m_interactive(interactive) {}
@@ -78,11 +78,12 @@ bool AssortPricesWindowLogic::acceptFields() {
     for (int k = 0; k < rotation::kAssortmentClassCount; ++k) {
         const auto i = static_cast<std::size_t>(k);
         typed.at(i) = m_view.text(field(k)).isEmpty() ? 0.0 : shell::val(m_view.text(field(k)));
-        if (typed.at(i) > kMaxAssortmentPrice) {
+        if (typed.at(i) > prices::kMaxAssortmentPrice) {
             m_interactive.message(
                 workflow::text::titleArbolex(),
-                text::priceOutOfRange(classCaption(i),
-                                      shell::formatNumber(kMaxAssortmentPrice, kPriceFormat)),
+                text::priceOutOfRange(
+                    classCaption(i),
+                    shell::formatNumber(prices::kMaxAssortmentPrice, kPriceFormat)),
                 shell::kExclamation);
             return false;
         }

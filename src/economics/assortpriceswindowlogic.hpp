@@ -5,7 +5,7 @@
 // and "Accept Changes" as the user's own timber prices are.
 
 #include "economics/iassortpricesview.hpp"
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 
 #include <QChar>
 #include <QString>
@@ -19,7 +19,7 @@ namespace arbolex::economics {
 
 class AssortPricesWindowLogic {
 public:
-    AssortPricesWindowLogic(PriceData &data, shell::ErrorLog &log, IAssortPricesView &view,
+    AssortPricesWindowLogic(prices::PriceData &data, shell::ErrorLog &log, IAssortPricesView &view,
                             shell::IInteractive &interactive);
 
     /// The window's load: captions, the prices ("#0.00") and the caption of
@@ -53,7 +53,7 @@ private:
     /// Stores the fields as the prices; false (after the message) when one is out of range.
     bool acceptFields();
 
-    PriceData &m_data;
+    prices::PriceData &m_data;
     shell::ErrorLog &m_log;
     IAssortPricesView &m_view;
     shell::IInteractive &m_interactive;

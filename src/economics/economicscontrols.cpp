@@ -1,5 +1,6 @@
 #include "economics/economicscontrols.hpp"
 
+#include "economics/economicsmessages.hpp"
 #include "shell/controlnames.hpp"
 
 #include <array>
@@ -36,6 +37,24 @@ std::optional<EconomicsControl> economicsControlFromName(const QString &name) {
 
 bool isEconomicsField(EconomicsControl control) {
     return control <= EconomicsControl::cboValuation;
+}
+
+std::vector<EconomicsFigure> valueFigures() {
+    namespace et = economicstext;
+    using C = EconomicsControl;
+    return {
+        {et::figureNpv(), C::lblNPV},
+        {et::figureLev(), C::lblLEV},
+        {et::figureEaa(), C::lblEAA},
+        {et::figureForestValue(), C::lblForestValue},
+        {et::figureIrr(), C::lblIRR},
+        {et::figureBreakEven(), C::lblBreakEven},
+        {et::figureRotation(), C::lblRotation},
+        {et::figureBiological(), C::lblBiological},
+        {et::figureEconomic(), C::lblEconomic},
+        {et::figureMai(), C::lblMAI},
+        {et::figureYieldClass(), C::lblYieldClass},
+    };
 }
 
 } // namespace arbolex::economics

@@ -3,6 +3,7 @@
 #include <QString>
 
 #include <optional>
+#include <vector>
 
 namespace arbolex::economics {
 
@@ -56,5 +57,15 @@ QString economicsControlName(EconomicsControl control);
 std::optional<EconomicsControl> economicsControlFromName(const QString &name);
 /// True for the fields the user types into (and the valuation choice).
 bool isEconomicsField(EconomicsControl control);
+
+/// A figure of the panel "Value of your regime": its caption and the label
+/// that shows it.
+struct EconomicsFigure {
+    QString caption;
+    EconomicsControl label;
+};
+/// The figures of the panel in order, from the net present value to the
+/// yield class; the window and the report show them alike.
+std::vector<EconomicsFigure> valueFigures();
 
 } // namespace arbolex::economics

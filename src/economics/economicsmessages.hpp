@@ -82,6 +82,15 @@ inline QString buttonCancel() {
 inline QString buttonApply() {
     return QStringLiteral("Apply");
 }
+inline QString hintEstablishmentCost() {
+    return QStringLiteral("Paid at planting: it counts in the LEV, the annuity, the IRR, the "
+                          "break-even and the economic rotation, never in the NPV of the stand "
+                          "standing today. Kept with the sub-compartment.");
+}
+inline QString hintAnnualCost() {
+    return QStringLiteral("Paid every year from age 1 to the final cut, in every figure. Kept "
+                          "with the sub-compartment.");
+}
 inline QString hintApply() {
     return QStringLiteral("Writes the chosen regime into the projection table: clear, grow, "
                           "thin and final cut, as if typed by hand.");
@@ -133,7 +142,9 @@ inline QString figureNotes() {
         "yearly rent. Forest value: the NPV and, after the final cut, the land's LEV. "
         "IRR: the rate at which planting just pays. Break-even: the share of today's timber "
         "prices at which the LEV is 0. Timber at the prices named above (long-term average "
-        "standing prices, or assortment prices); money per hectare.");
+        "standing prices, or assortment prices); money per hectare. The costs and other "
+        "revenues typed into the net present value window count in every figure; the "
+        "establishment cost, paid at planting, in all but the NPV.");
 }
 inline QString figureYieldClass() {
     return QStringLiteral("Yield class");

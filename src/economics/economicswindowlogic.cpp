@@ -5,16 +5,21 @@
 
 #include "economics/economicsformat.hpp"
 #include "economics/economicsmessages.hpp"
-#include "economics/prices.hpp"
+#include "prices/prices.hpp"
+#include "rotation/standmath.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
 #include "shell/vbtext.hpp"
-#include "workflow/mainwindowlogic.hpp"
-#include "workflow/standmath.hpp"
+#include "work/incrementrows.hpp"
+#include "work/regimereplay.hpp"
+#include "work/standwork.hpp"
+#include "workflow/iworkwindows.hpp"
 
+#include <algorithm>
 #include <cmath>
 #include <exception>
+#include <limits>
 
 namespace arbolex::economics {
 
@@ -48,8 +53,48 @@ QString pricesText(const rotation::Economics &e) {
 
 bool sameMoney(const rotation::Economics &a, const rotation::Economics &b) {
     return a.ratePercent == b.ratePercent && a.establishmentCost == b.establishmentCost &&
-           a.annualCost == b.annualCost && a.prices == b.prices && a.valuation == b.valuation &&
-           a.assortmentPrices == b.assortmentPrices;
+           a.annualCost == b.annualCost && a.entries == b.entries && a.prices == b.prices &&
+           a.valuation == b.valuation && a.assortmentPrices == b.assortmentPrices;
+}
+
+/// What the cash flow typed into the net present value window adds, for the
+/// line of the money: "" when nothing.
+QString entriesText(const std::vector<rotation::CashFlowEntry> &entries) {
+    double costs = 0.0;
+    double revenues = 0.0;
+    for (const rotation::CashFlowEntry &e : entries) {
+        costs += e.cost;
+        revenues += e.otherRevenue;
+    }
+    QStringList parts;
+    if (costs != 0.0) {
+        parts << QStringLiteral("costs ") + euroText(costs) + QStringLiteral(" €/ha");
+    }
+    if (revenues != 0.0) {
+        parts << QStringLiteral("other revenues ") + euroText(revenues) + QStringLiteral(" €/ha");
+    }
+    return parts.isEmpty()
+               ? QString()
+               : QStringLiteral(" · the cash flow's ") + parts.join(QStringLiteral(" and "));
+}
+
+/// A cost as its field shows it.
+QString costText(double euro) {
+    return shell::generalNumber(euro);
+}
+
+/// The rotation of the table valued, as the optimiser scores a candidate.
+rotation::Candidate candidateOf(const rotation::Regime &regime,
+                                const rotation::RotationValue &value) {
+    constexpr double kNone = -std::numeric_limits<double>::infinity();
+    rotation::Candidate c;
+    c.regime = regime;
+    c.rotation = value.rotation;
+    c.npv = value.npv.value_or(kNone);
+    c.lev = value.lev.value_or(kNone);
+    c.volume = value.mai * value.rotation;
+    c.score = c.lev;
+    return c;
 }
 
 QString irrText(const valuation::InternalRate &irr) {
@@ -89,10 +134,18 @@ std::optional<long long> wholeNumber(const QString &typed) {
 
 } // namespace
 
-EconomicsWindowLogic::EconomicsWindowLogic(workflow::MainWindowLogic &main,
-                                           thinning::ThinWindowLogic &thin, IEconomicsView &view,
-                                           shell::IInteractive &interactive)
-    : m_main(main), m_thin(thin), m_view(view), m_interactive(interactive) {}
+EconomicsWindowLogic::EconomicsWindowLogic(work::StandWork &work, workflow::IMainCommands &main,
+                                           IEconomicsView &view, shell::IInteractive &interactive)
+    : m_standWork(work), m_main(main), m_view(view), m_interactive(interactive) {
+    // The costs are the work's: the fields follow it (a document opened, a
+    // new one begun).
+    QObject::connect(&work, &work::StandWork::costsChanged, [this] { showCosts(); });
+}
+
+void EconomicsWindowLogic::showCosts() {
+    m_view.setText(C::txtEstablishmentCost, costText(m_standWork.establishmentCost()));
+    m_view.setText(C::txtAnnualCost, costText(m_standWork.annualCost()));
+}
 
 void EconomicsWindowLogic::message(const QString &text, EconomicsControl focus) {
     m_interactive.message(economicstext::titleEconomics(), text, shell::kExclamation);
@@ -105,16 +158,15 @@ void EconomicsWindowLogic::cmdEconomics_Click() {
 }
 
 void EconomicsWindowLogic::Form_Load() {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in frmEconomics.Form_Load()"), [&] {
-        m_view.setText(C::txtInterestRate, percentText(m_main.cashFlow().interestRate()));
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in frmEconomics.Form_Load()"), [&] {
+        m_view.setText(C::txtInterestRate, percentText(m_standWork.cashFlow().interestRate()));
         const rotation::MonteCarloSettings draws;
         const auto fill = [&](C c, const QString &value) {
             if (m_view.text(c).isEmpty()) {
                 m_view.setText(c, value);
             }
         };
-        fill(C::txtEstablishmentCost, QStringLiteral("0"));
-        fill(C::txtAnnualCost, QStringLiteral("0"));
+        showCosts();
         fill(C::txtDraws, QString::number(draws.draws));
         fill(C::txtSeed, QString::number(draws.seed));
         fill(C::txtPriceSpread, shell::generalNumber(draws.priceSpread * 100.0));
@@ -143,10 +195,12 @@ bool EconomicsWindowLogic::readEconomics() {
         }
         (c == C::txtEstablishmentCost ? e.establishmentCost : e.annualCost) = shell::val(typed);
     }
+    // The costs and other revenues typed into the net present value window.
+    e.entries = m_standWork.cashFlowEntries();
     // The cash flow's own prices: the long-term averages, as their absolute values.
-    Prices longTerm;
-    longTerm.data() = m_main.prices().data();
-    longTerm.selectPriceSet(kLongTermPrices);
+    prices::Prices longTerm;
+    longTerm.data() = m_standWork.prices().data();
+    longTerm.selectPriceSet(prices::kLongTermPrices);
     e.prices = longTerm.pricesInUse();
     // Or every harvest divided into the assortment report's classes and sold
     // at the assortment prices.
@@ -154,33 +208,42 @@ bool EconomicsWindowLogic::readEconomics() {
             .trimmed()
             .startsWith(QStringLiteral("assortment"), Qt::CaseInsensitive)) {
         e.valuation = rotation::Valuation::kAssortments;
-        e.assortmentPrices = m_main.prices().data().assortmentPrices;
+        e.assortmentPrices = m_standWork.prices().data().assortmentPrices;
     }
-    // One interest rate for the program: the cash flow's.
-    m_main.cashFlow().setInterestRate(e.ratePercent);
+    // One interest rate for the program: the cash flow's; the costs are the work's.
+    m_standWork.cashFlow().setInterestRate(e.ratePercent);
+    m_standWork.setCosts(e.establishmentCost, e.annualCost);
     m_economics = e;
     return true;
 }
 
 bool EconomicsWindowLogic::readStand() {
-    const std::int16_t model = m_main.grow().modelId();
-    if (const auto s = standFromTable(m_main.table(), model)) {
+    const std::int16_t model = m_standWork.grow().modelId();
+    if (const auto s = standFromTable(m_standWork.table(), model)) {
         m_stand = *s;
         return true;
     }
     // No table yet: the grow-from fields, checked as the grow command checks them.
-    if (!m_main.ChkGrowFromFlds() || !m_main.ChkGrowFromBnds()) {
+    if (!m_main.checkGrowFrom()) {
         return false;
     }
-    const workflow::GrowFrom g = m_main.GetGrowFrom();
+    const auto value = [&](work::WorkField f) {
+        return static_cast<float>(shell::val(m_standWork.field(f)));
+    };
+    const float stocking = value(work::WorkField::FromStocking);
+    const float typedBasalArea = value(work::WorkField::FromBasalArea);
     const float basalArea =
-        g.basalArea > 0.0f ? g.basalArea : workflow::basalAreaFromDbh(g.stocking, g.dbh);
-    m_stand = rotation::Stand{model, g.age, g.stocking, g.topHeight, basalArea};
+        typedBasalArea > 0.0f
+            ? typedBasalArea
+            : rotation::basalAreaFromDbh(stocking, value(work::WorkField::FromDbh));
+    m_stand = rotation::Stand{model, value(work::WorkField::FromAge), stocking,
+                              value(work::WorkField::FromHeight), basalArea};
     return true;
 }
 
 void EconomicsWindowLogic::clearFigures(const QString &why) {
     m_path.reset();
+    m_own.reset();
     m_value.reset();
     m_yours.reset();
     m_explorer = {};
@@ -195,43 +258,83 @@ void EconomicsWindowLogic::clearFigures(const QString &why) {
 }
 
 void EconomicsWindowLogic::cmdCompute_Click() {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in frmEconomics.cmdCompute_Click()"), [&] {
-        if (m_optimising) {
-            return;
-        }
-        const rotation::Stand before = m_stand;
-        const rotation::Economics money = m_economics;
-        if (!readEconomics() || !readStand()) {
-            return;
-        }
-        if (!sameStand(before, m_stand) || !sameMoney(money, m_economics)) {
-            // The optimiser's regimes belong to another stand or other money.
-            m_best.clear();
-            m_view.setText(C::lblOptimiser, QString());
-            m_view.setEnabled(C::cmdApply, false);
-            m_view.regimesChanged();
-        }
-        m_table = regimeFromTable(m_main.table());
-        rotation::GrowthFailure failure;
-        m_path = rotation::growPath(m_grow, m_stand, m_table.regime, failure);
-        if (!m_path) {
-            clearFigures(QString::fromStdString(failure.text));
-            return;
-        }
-        m_explorer = rotation::exploreRotations(*m_path, m_table.regime, m_economics);
-        m_rotation = m_table.finalCut.value_or(m_explorer.economicRotation);
-        if (const auto problem = rotation::rotationProblem(*m_path, m_table.regime, m_rotation)) {
-            clearFigures(QString::fromStdString(*problem));
-            return;
-        }
-        m_value = rotation::valueRotation(*m_path, m_rotation, m_economics);
-        m_tornado = rotation::tornado(*m_path, m_rotation, m_economics);
-        m_yours = rotation::scoreRotation(*m_path, m_table.regime, m_rotation, m_economics,
-                                          rotation::Objective::kLev);
-        showFigures();
-        m_view.regimesChanged();
-        cmdMonteCarlo_Click();
-    });
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in frmEconomics.cmdCompute_Click()"),
+                 [&] {
+                     if (m_optimising) {
+                         return;
+                     }
+                     const rotation::Stand before = m_stand;
+                     const rotation::Economics money = m_economics;
+                     if (!readEconomics() || !readStand()) {
+                         return;
+                     }
+                     if (!sameStand(before, m_stand) || !sameMoney(money, m_economics)) {
+                         // The optimiser's regimes belong to another stand or other money.
+                         m_best.clear();
+                         m_view.setText(C::lblOptimiser, QString());
+                         m_view.setEnabled(C::cmdApply, false);
+                         m_view.regimesChanged();
+                     }
+                     m_table = regimeFromTable(m_standWork.table());
+                     rotation::GrowthFailure failure;
+                     m_path = rotation::growPath(m_grow, m_stand, m_table.regime, failure);
+                     if (!m_path) {
+                         clearFigures(QString::fromStdString(failure.text));
+                         return;
+                     }
+                     m_explorer = rotation::exploreRotations(*m_path, m_table.regime, m_economics);
+                     m_own = harvestsFromTable(m_standWork.table(), m_path->volumeRatio);
+                     if (m_own) {
+                         valueTable();
+                     } else if (!valueEconomicRotation()) {
+                         return;
+                     }
+                     showFigures();
+                     m_view.regimesChanged();
+                     cmdMonteCarlo_Click();
+                 });
+}
+
+bool EconomicsWindowLogic::figuresOfTable() const {
+    if (!m_value) {
+        return false;
+    }
+    const auto stand = standFromTable(m_standWork.table(), m_standWork.grow().modelId());
+    if (!stand || !sameStand(*stand, m_stand)) {
+        return false;
+    }
+    const TableRegime now = regimeFromTable(m_standWork.table());
+    return now.ages == m_table.ages && now.volumes == m_table.volumes &&
+           now.finalCut == m_table.finalCut;
+}
+
+void EconomicsWindowLogic::valueTable() {
+    // The harvests as the table holds them: the figures of the stand today
+    // are the net present value window's.
+    m_rotation = m_own->rotation;
+    m_value = rotation::valueHarvests(*m_own, m_economics);
+    // The growth figures as the main window shows them.
+    std::vector<double> mai;
+    for (const int r : work::incrementRows(m_standWork.table())) {
+        mai.push_back(m_standWork.table().row(r).numbers[work::kNumMai]);
+    }
+    m_value->maxMai = mai.empty() ? 0.0 : *std::max_element(mai.begin(), mai.end());
+    m_value->yieldClass = m_standWork.yieldClass();
+    m_tornado = rotation::tornado(*m_own, m_economics);
+    m_yours = candidateOf(m_table.regime, *m_value);
+}
+
+bool EconomicsWindowLogic::valueEconomicRotation() {
+    m_rotation = m_explorer.economicRotation;
+    if (const auto problem = rotation::rotationProblem(*m_path, m_table.regime, m_rotation)) {
+        clearFigures(QString::fromStdString(*problem));
+        return false;
+    }
+    m_value = rotation::valueRotation(*m_path, m_rotation, m_economics);
+    m_tornado = rotation::tornado(*m_path, m_rotation, m_economics);
+    m_yours = rotation::scoreRotation(*m_path, m_table.regime, m_rotation, m_economics,
+                                      rotation::Objective::kLev);
+    return true;
 }
 
 QString EconomicsWindowLogic::rateText() const {
@@ -248,11 +351,12 @@ void EconomicsWindowLogic::showFigures() {
                        quantityText(s.height, 1) + QStringLiteral(" m · basal area ") +
                        quantityText(s.basalArea, 1) + QStringLiteral(" m²/ha · site index ") +
                        quantityText(m_path->siteIndex, 1) + QStringLiteral(" m"));
-    QString regime = describeRegime(m_table.regime, m_rotation);
-    if (const QString note = irregularNote(m_table); !note.isEmpty()) {
+    QString regime =
+        m_own ? describeTableRotation(*m_own) : describeRegime(m_table.regime, m_rotation);
+    if (const QString note = irregularNote(m_table, !m_own); !note.isEmpty()) {
         regime += QLatin1Char(' ') + note;
     }
-    if (!m_table.finalCut) {
+    if (!m_own) {
         regime += QStringLiteral(" The table has no final cut: the economic rotation is valued.");
     }
     m_view.setText(C::lblRegime, regime);
@@ -260,7 +364,8 @@ void EconomicsWindowLogic::showFigures() {
                                    pricesText(m_economics) + QStringLiteral(" · establishment ") +
                                    euroText(m_economics.establishmentCost) +
                                    QStringLiteral(" €/ha · annual cost ") +
-                                   euroText(m_economics.annualCost) + QStringLiteral(" €/ha/yr"));
+                                   euroText(m_economics.annualCost) + QStringLiteral(" €/ha/yr") +
+                                   entriesText(m_economics.entries));
     m_view.setText(C::lblNPV, euroPerHaText(v.npv));
     m_view.setText(C::lblLEV, euroPerHaText(v.lev));
     m_view.setText(C::lblEAA, v.eaa ? euroText(*v.eaa) + QStringLiteral(" €/ha/yr")
@@ -270,8 +375,8 @@ void EconomicsWindowLogic::showFigures() {
     m_view.setText(C::lblBreakEven, breakEvenText(v.breakEvenPriceFactor));
     m_view.setText(C::lblRotation,
                    QString::number(m_rotation) +
-                       (m_table.finalCut ? QStringLiteral(" years (the final cut of the table)")
-                                         : QStringLiteral(" years (the economic rotation)")));
+                       (m_own ? QStringLiteral(" years (the final cut of the table)")
+                              : QStringLiteral(" years (the economic rotation)")));
     double largestMai = 0.0;
     std::optional<double> largestLev;
     for (const rotation::RotationRow &row : m_explorer.rows) {
@@ -303,126 +408,129 @@ void EconomicsWindowLogic::showFigures() {
 }
 
 void EconomicsWindowLogic::cmdMonteCarlo_Click() {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in frmEconomics.cmdMonteCarlo_Click()"), [&] {
-        if (!m_path || !m_value) {
-            message(economicstext::noStand(), C::txtInterestRate);
-            return;
-        }
-        rotation::MonteCarloSettings s;
-        const auto draws = wholeNumber(m_view.text(C::txtDraws));
-        if (!draws || *draws < kFewestDraws || *draws > kMostDraws) {
-            message(economicstext::faultDraws(), C::txtDraws);
-            return;
-        }
-        s.draws = static_cast<int>(*draws);
-        const auto seed = wholeNumber(m_view.text(C::txtSeed));
-        if (!seed || *seed < 0) {
-            message(economicstext::faultSeed(), C::txtSeed);
-            return;
-        }
-        s.seed = static_cast<std::uint64_t>(*seed);
-        for (const C c : {C::txtPriceSpread, C::txtCostSpread}) {
-            const QString typed = m_view.text(c).trimmed();
-            const double percent = shell::val(typed);
-            if (!shell::isNumeric(typed) || percent < 0.0 || percent > 100.0) {
-                message(economicstext::faultSpread(), c);
+    shell::guard(
+        m_standWork.errorLog(), QStringLiteral(" in frmEconomics.cmdMonteCarlo_Click()"), [&] {
+            if (!m_path || !m_value) {
+                message(economicstext::noStand(), C::txtInterestRate);
                 return;
             }
-            (c == C::txtPriceSpread ? s.priceSpread : s.costSpread) = percent / 100.0;
-        }
-        const QString low = m_view.text(C::txtRateLow).trimmed();
-        const QString high = m_view.text(C::txtRateHigh).trimmed();
-        if (!shell::isNumeric(low) || !shell::isNumeric(high) || !(shell::val(low) > 0.0) ||
-            !(shell::val(low) < shell::val(high))) {
-            message(economicstext::faultRateRange(), C::txtRateLow);
-            return;
-        }
-        s.rateLow = shell::val(low);
-        s.rateHigh = shell::val(high);
-        m_monteCarlo = rotation::monteCarlo(*m_path, m_rotation, m_economics, s);
-        const rotation::MonteCarloResult &r = *m_monteCarlo;
-        m_view.setText(C::lblMonteCarlo, QStringLiteral("NPV P5 ") + euroText(r.npv.p5) +
-                                             QStringLiteral(" · P50 ") + euroText(r.npv.p50) +
-                                             QStringLiteral(" · P95 ") + euroText(r.npv.p95) +
-                                             QStringLiteral(" €/ha · P(NPV < 0) = ") +
-                                             quantityText(r.probabilityNpvBelowZero * 100.0, 1) +
-                                             QStringLiteral(" % · ") + quantityText(s.draws, 0) +
-                                             QStringLiteral(" draws at rates from ") +
-                                             percentText(s.rateLow) + QStringLiteral(" to ") +
-                                             percentText(s.rateHigh) + QStringLiteral(" % a year"));
-        m_view.monteCarloChanged();
-    });
+            rotation::MonteCarloSettings s;
+            const auto draws = wholeNumber(m_view.text(C::txtDraws));
+            if (!draws || *draws < kFewestDraws || *draws > kMostDraws) {
+                message(economicstext::faultDraws(), C::txtDraws);
+                return;
+            }
+            s.draws = static_cast<int>(*draws);
+            const auto seed = wholeNumber(m_view.text(C::txtSeed));
+            if (!seed || *seed < 0) {
+                message(economicstext::faultSeed(), C::txtSeed);
+                return;
+            }
+            s.seed = static_cast<std::uint64_t>(*seed);
+            for (const C c : {C::txtPriceSpread, C::txtCostSpread}) {
+                const QString typed = m_view.text(c).trimmed();
+                const double percent = shell::val(typed);
+                if (!shell::isNumeric(typed) || percent < 0.0 || percent > 100.0) {
+                    message(economicstext::faultSpread(), c);
+                    return;
+                }
+                (c == C::txtPriceSpread ? s.priceSpread : s.costSpread) = percent / 100.0;
+            }
+            const QString low = m_view.text(C::txtRateLow).trimmed();
+            const QString high = m_view.text(C::txtRateHigh).trimmed();
+            if (!shell::isNumeric(low) || !shell::isNumeric(high) || !(shell::val(low) > 0.0) ||
+                !(shell::val(low) < shell::val(high))) {
+                message(economicstext::faultRateRange(), C::txtRateLow);
+                return;
+            }
+            s.rateLow = shell::val(low);
+            s.rateHigh = shell::val(high);
+            m_monteCarlo = m_own ? rotation::monteCarlo(*m_own, m_economics, s)
+                                 : rotation::monteCarlo(*m_path, m_rotation, m_economics, s);
+            const rotation::MonteCarloResult &r = *m_monteCarlo;
+            m_view.setText(
+                C::lblMonteCarlo,
+                QStringLiteral("NPV P5 ") + euroText(r.npv.p5) + QStringLiteral(" · P50 ") +
+                    euroText(r.npv.p50) + QStringLiteral(" · P95 ") + euroText(r.npv.p95) +
+                    QStringLiteral(" €/ha · P(NPV < 0) = ") +
+                    quantityText(r.probabilityNpvBelowZero * 100.0, 1) + QStringLiteral(" % · ") +
+                    quantityText(s.draws, 0) + QStringLiteral(" draws at rates from ") +
+                    percentText(s.rateLow) + QStringLiteral(" to ") + percentText(s.rateHigh) +
+                    QStringLiteral(" % a year"));
+            m_view.monteCarloChanged();
+        });
 }
 
 void EconomicsWindowLogic::cmdOptimise_Click() {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in frmEconomics.cmdOptimise_Click()"), [&] {
-        if (m_optimising) {
-            return;
-        }
-        if (!m_path || !m_value) {
-            message(economicstext::noStand(), C::txtInterestRate);
-            return;
-        }
-        struct Job {
-            rotation::Stand stand;
-            rotation::Economics economics;
-            rotation::OptimiserSettings settings;
-            std::optional<rotation::OptimiserResult> result;
-            rotation::GrowthFailure failure;
-        };
-        auto job = std::make_shared<Job>();
-        job->stand = m_stand;
-        job->economics = m_economics;
-        m_optimising = true;
-        m_cancel = false;
-        for (const C c : {C::cmdOptimise, C::cmdApply, C::cmdCompute, C::cmdMonteCarlo}) {
-            m_view.setEnabled(c, false);
-        }
-        m_view.setEnabled(C::cmdCancel, true);
-        m_view.setText(C::lblOptimiser, QStringLiteral("Searching…"));
-        m_view.setProgress(0.0);
-        m_view.runInBackground(
-            [this, job] {
-                // Each thread grows with an engine of its own.
-                try {
-                    engine::Grow grow;
-                    job->result =
-                        rotation::optimise(grow, job->stand, job->economics, job->settings,
-                                           job->failure, [this](double fraction) {
-                                               m_view.setProgress(fraction);
-                                               return !m_cancel.load();
-                                           });
-                } catch (const std::exception &e) {
-                    job->result.reset();
-                    job->failure.text = e.what();
-                }
-            },
-            [this, job] {
-                m_optimising = false;
-                for (const C c : {C::cmdOptimise, C::cmdCompute, C::cmdMonteCarlo}) {
-                    m_view.setEnabled(c, true);
-                }
-                m_view.setEnabled(C::cmdCancel, false);
-                if (!job->result) {
-                    m_view.setText(C::lblOptimiser, QString());
-                    message(economicstext::optimiserFailed() +
-                                QString::fromStdString(job->failure.text),
-                            C::cmdOptimise);
-                    return;
-                }
-                m_best = job->result->best;
-                m_chosen = 1;
-                m_view.setEnabled(C::cmdApply, !m_best.empty());
-                const QString grown = quantityText(job->result->regimesGrown, 0);
-                m_view.setText(C::lblOptimiser,
-                               job->result->completed
-                                   ? grown + QStringLiteral(" regimes grown and valued at ") +
-                                         rateText() + QStringLiteral(" % a year.")
-                                   : QStringLiteral("Cancelled after ") + grown +
-                                         QStringLiteral(" regimes: the best found so far."));
-                m_view.regimesChanged();
-            });
-    });
+    shell::guard(
+        m_standWork.errorLog(), QStringLiteral(" in frmEconomics.cmdOptimise_Click()"), [&] {
+            if (m_optimising) {
+                return;
+            }
+            if (!m_path || !m_value) {
+                message(economicstext::noStand(), C::txtInterestRate);
+                return;
+            }
+            struct Job {
+                rotation::Stand stand;
+                rotation::Economics economics;
+                rotation::OptimiserSettings settings;
+                std::optional<rotation::OptimiserResult> result;
+                rotation::GrowthFailure failure;
+            };
+            auto job = std::make_shared<Job>();
+            job->stand = m_stand;
+            job->economics = m_economics;
+            m_optimising = true;
+            m_cancel = false;
+            for (const C c : {C::cmdOptimise, C::cmdApply, C::cmdCompute, C::cmdMonteCarlo}) {
+                m_view.setEnabled(c, false);
+            }
+            m_view.setEnabled(C::cmdCancel, true);
+            m_view.setText(C::lblOptimiser, QStringLiteral("Searching…"));
+            m_view.setProgress(0.0);
+            m_view.runInBackground(
+                [this, job] {
+                    // Each thread grows with an engine of its own.
+                    try {
+                        engine::Grow grow;
+                        job->result =
+                            rotation::optimise(grow, job->stand, job->economics, job->settings,
+                                               job->failure, [this](double fraction) {
+                                                   m_view.setProgress(fraction);
+                                                   return !m_cancel.load();
+                                               });
+                    } catch (const std::exception &e) {
+                        job->result.reset();
+                        job->failure.text = e.what();
+                    }
+                },
+                [this, job] {
+                    m_optimising = false;
+                    for (const C c : {C::cmdOptimise, C::cmdCompute, C::cmdMonteCarlo}) {
+                        m_view.setEnabled(c, true);
+                    }
+                    m_view.setEnabled(C::cmdCancel, false);
+                    if (!job->result) {
+                        m_view.setText(C::lblOptimiser, QString());
+                        message(economicstext::optimiserFailed() +
+                                    QString::fromStdString(job->failure.text),
+                                C::cmdOptimise);
+                        return;
+                    }
+                    m_best = job->result->best;
+                    m_chosen = 1;
+                    m_view.setEnabled(C::cmdApply, !m_best.empty());
+                    const QString grown = quantityText(job->result->regimesGrown, 0);
+                    m_view.setText(C::lblOptimiser,
+                                   job->result->completed
+                                       ? grown + QStringLiteral(" regimes grown and valued at ") +
+                                             rateText() + QStringLiteral(" % a year.")
+                                       : QStringLiteral("Cancelled after ") + grown +
+                                             QStringLiteral(" regimes: the best found so far."));
+                    m_view.regimesChanged();
+                });
+        });
 }
 
 std::vector<QStringList> EconomicsWindowLogic::regimeGrid() const {
@@ -489,6 +597,35 @@ bool EconomicsWindowLogic::press(EconomicsControl control) {
     default:
         return false;
     }
+}
+
+void EconomicsWindowLogic::cmdApply_Click(int rank) {
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in frmEconomics.cmdApply_Click()"), [&] {
+        if (m_optimising) {
+            return;
+        }
+        if (rank < 1 || rank > static_cast<int>(m_best.size())) {
+            message(economicstext::nothingToApply(), C::cmdOptimise);
+            return;
+        }
+        // The regime written as the window writes it when it is typed in, on
+        // a copy of the work; the main window then takes the copy whole.
+        const rotation::Candidate chosen = m_best[static_cast<std::size_t>(rank - 1)];
+        work::StandWork applied(m_standWork.grow(), m_standWork.prices(), m_standWork.errorLog());
+        applied.restore(m_standWork.snapshot());
+        const auto failed =
+            work::replayRegime(applied, m_stand, chosen.regime, chosen.rotation, m_interactive);
+        // What was typed into the cash flow stays, for the years the new
+        // rotation still has: the optimiser counted it so.
+        applied.cashFlow().copyTypedFrom(m_standWork.cashFlow());
+        m_main.restore(applied.snapshot());
+        if (failed) {
+            m_interactive.message(economicstext::titleEconomics(),
+                                  economicstext::applyStopped() + *failed, shell::kExclamation);
+        }
+        // The figures of the table as it now stands.
+        cmdCompute_Click();
+    });
 }
 
 } // namespace arbolex::economics

@@ -23,28 +23,33 @@ namespace arbolex::shell {
 class IInteractive;
 }
 
-namespace arbolex::thinning {
-class ThinWindowLogic;
+namespace arbolex::work {
+class StandWork;
 }
 
 namespace arbolex::workflow {
-class MainWindowLogic;
+class IMainCommands;
 }
 
 namespace arbolex::economics {
 
 class EconomicsWindowLogic {
 public:
-    EconomicsWindowLogic(workflow::MainWindowLogic &main, thinning::ThinWindowLogic &thin,
-                         IEconomicsView &view, shell::IInteractive &interactive);
+    /// The economics of `work`; "Apply" writes a regime into a copy of the
+    /// work and gives it to the main window through `main`.
+    EconomicsWindowLogic(work::StandWork &work, workflow::IMainCommands &main, IEconomicsView &view,
+                         shell::IInteractive &interactive);
 
     /// The main window's "Economics…": loads the window and shows it.
     void cmdEconomics_Click();
     /// The window's load: the interest rate of the cash flow, the defaults of
     /// the draws, then the figures.
     void Form_Load();
-    /// "Compute": reads the rate and the costs, derives the stand, the regime
-    /// and the final cut from the table, and values them.
+    /// "Compute": reads the rate and the costs (they become the work's), and
+    /// values the rotation of the table: its own thinnings and final cut with
+    /// the costs and other revenues of its cash flow, or without a final cut
+    /// the regime of its thinnings felled at the economic rotation. The
+    /// explorer and the optimiser work from that regime.
     void cmdCompute_Click();
     /// "Optimise": searches the regimes away from the window's thread.
     void cmdOptimise_Click();
@@ -70,6 +75,10 @@ public:
 
     /// True once the figures of a rotation are shown.
     bool valued() const { return m_value.has_value(); }
+    /// True when the figures shown are those of the table as it stands: the
+    /// stand of its first row, its thinnings and its final cut are the ones
+    /// valued (the table may have changed since).
+    bool figuresOfTable() const;
     const rotation::Stand &stand() const { return m_stand; }
     const rotation::Regime &regime() const { return m_table.regime; }
     int rotationAge() const { return m_rotation; }
@@ -97,9 +106,16 @@ private:
     bool readStand();
     void showFigures();
     void clearFigures(const QString &why);
+    /// The costs of the work in their fields.
+    void showCosts();
+    /// Values the table's own rotation (m_own).
+    void valueTable();
+    /// Values the regime felled at the economic rotation; false (the figures
+    /// cleared) when that rotation cannot be valued.
+    bool valueEconomicRotation();
 
-    workflow::MainWindowLogic &m_main;
-    thinning::ThinWindowLogic &m_thin;
+    work::StandWork &m_standWork;
+    workflow::IMainCommands &m_main;
     IEconomicsView &m_view;
     shell::IInteractive &m_interactive;
 
@@ -110,6 +126,9 @@ private:
     /// The engine of the figures; the optimiser grows with one of its own.
     engine::Grow m_grow;
     std::optional<rotation::GrowthPath> m_path;
+    /// The harvests of a felled table as it holds them; every figure but the
+    /// explorer's and the optimiser's values them.
+    std::optional<rotation::RotationHarvests> m_own;
     std::optional<rotation::RotationValue> m_value;
     rotation::RotationExplorer m_explorer;
     std::vector<rotation::TornadoBar> m_tornado;

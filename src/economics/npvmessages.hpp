@@ -13,17 +13,6 @@ inline QString npvCaption() {
 inline QString titleNetPresentValue() {
     return QStringLiteral("Net Present Value");
 }
-/// Headers of the columns of `NPV_Grid`, in order.
-inline QStringList npvHeaders() {
-    return {QStringLiteral("Year"),
-            QStringLiteral("Operation"),
-            QStringLiteral("Cost (€/ha)"),
-            QStringLiteral("Timber Revenue (€/ha)"),
-            QStringLiteral("Other Revenues (€/ha)"),
-            QStringLiteral("Total Revenues (€/ha)"),
-            QStringLiteral("Cash Flow (€/ha)"),
-            QStringLiteral("Discounted Cash Flow (€/ha)")};
-}
 inline QString typeInterestRate() {
     return QStringLiteral("Please type in a value for the Interest Rate");
 }

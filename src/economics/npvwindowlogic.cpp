@@ -1,4 +1,5 @@
 #include "economics/npvwindowlogic.hpp"
+#include "work/worktexts.hpp"
 
 #include "economics/npvmessages.hpp"
 #include "shell/apperror.hpp"
@@ -27,32 +28,31 @@ double valueOrZero(const QString &text) {
 
 } // namespace
 
-NpvWindowLogic::NpvWindowLogic(CashFlow &cashFlow, const TimberRevenue &revenue,
-                               shell::ErrorLog &log, INpvView &view,
+NpvWindowLogic::NpvWindowLogic(work::StandWork &work, INpvView &view,
                                shell::IInteractive &interactive, shell::IClipboard &clipboard)
-    : m_cashFlow(cashFlow), m_revenue(revenue), m_log(log), m_view(view),
+    : m_standWork(work), m_cashFlow(work.cashFlow()), m_log(work.errorLog()), m_view(view),
       m_interactive(interactive), m_clipboard(clipboard) {}
 
 void NpvWindowLogic::Form_Load() {
     shell::guard(m_log, QStringLiteral(" in frmNPV.Form_Load()"), [&] {
         const int years = m_cashFlow.years();
         m_grid.assign(static_cast<std::size_t>(years) + 1, QStringList());
-        m_grid[0] = text::npvHeaders();
+        m_grid[0] = work::text::cashFlowHeaders();
         for (int i = 0; i < years; ++i) {
             QStringList &row = m_grid[static_cast<std::size_t>(i) + 1];
-            for (int c = 0; c < kCashFlowColumnCount; ++c) {
+            for (int c = 0; c < work::kCashFlowColumnCount; ++c) {
                 row << QString();
             }
-            row[kCfYear] = QString::number(m_cashFlow.firstYear() + i);
+            row[work::kCfYear] = QString::number(m_cashFlow.firstYear() + i);
         }
-        m_cashFlow.LoadTimberRevenues(m_revenue);
+        m_cashFlow.LoadTimberRevenues(m_standWork.timberRevenue());
         LoadNPV_GridWithArray();
         m_view.setText(NpvControl::txtInterestRate,
                        formatNumber(m_cashFlow.interestRate(), u"0.00##"));
         showNetPresentValue();
         m_view.setGridWidened(years >= kScrollingYears);
         m_row = years > 0 ? 1 : 0;
-        m_column = kCfCost;
+        m_column = work::kCfCost;
         m_view.setCurrentCell(m_row, m_column);
         m_view.gridChanged();
     });
@@ -62,8 +62,8 @@ void NpvWindowLogic::LoadNPV_GridWithArray() {
     shell::guard(m_log, QStringLiteral(" in frmNPV.LoadNPV_GridWithArray()"), [&] {
         for (int i = 0; i < m_cashFlow.years(); ++i) {
             QStringList &row = m_grid.at(static_cast<std::size_t>(i) + 1);
-            row[kCfOperation] = m_cashFlow.operation(i);
-            for (int c = kCfCost; c < kCashFlowColumnCount; ++c) {
+            row[work::kCfOperation] = m_cashFlow.operation(i);
+            for (int c = work::kCfCost; c < work::kCashFlowColumnCount; ++c) {
                 row[c] = formatNumber(m_cashFlow.matrix(c, i), u"#0");
             }
         }
@@ -72,9 +72,10 @@ void NpvWindowLogic::LoadNPV_GridWithArray() {
 
 void NpvWindowLogic::writeComputedRow(int i) {
     QStringList &row = m_grid.at(static_cast<std::size_t>(i) + 1);
-    row[kCfTotalRevenues] = formatNumber(m_cashFlow.matrix(kCfTotalRevenues, i), u"#0");
-    row[kCfCashFlow] = formatNumber(m_cashFlow.matrix(kCfCashFlow, i), u"0");
-    row[kCfDiscountedCashFlow] = formatNumber(m_cashFlow.matrix(kCfDiscountedCashFlow, i), u"#0");
+    row[work::kCfTotalRevenues] = formatNumber(m_cashFlow.matrix(work::kCfTotalRevenues, i), u"#0");
+    row[work::kCfCashFlow] = formatNumber(m_cashFlow.matrix(work::kCfCashFlow, i), u"0");
+    row[work::kCfDiscountedCashFlow] =
+        formatNumber(m_cashFlow.matrix(work::kCfDiscountedCashFlow, i), u"#0");
 }
 
 void NpvWindowLogic::showNetPresentValue() {
@@ -92,10 +93,12 @@ void NpvWindowLogic::cmdNPV_Click() {
         showNetPresentValue();
     }
     m_view.gridChanged();
+    m_standWork.cashFlowEdited();
 }
 
 bool NpvWindowLogic::editable(int column) const {
-    return column == kCfOperation || column == kCfCost || column == kCfOtherRevenues;
+    return column == work::kCfOperation || column == work::kCfCost ||
+           column == work::kCfOtherRevenues;
 }
 
 void NpvWindowLogic::NPV_Grid_KeyPress(QChar key) {
@@ -116,7 +119,7 @@ void NpvWindowLogic::NPV_Grid_KeyPress(QChar key) {
         }
         const int i = m_row - 1;
         QString &cell = m_grid.at(static_cast<std::size_t>(m_row))[m_column];
-        if (m_column == kCfOperation) {
+        if (m_column == work::kCfOperation) {
             if (key == kBackspace) {
                 cell.chop(1);
             } else {
@@ -139,12 +142,13 @@ void NpvWindowLogic::NPV_Grid_KeyPress(QChar key) {
             m_cashFlow.setMatrix(m_column, i, valueOrZero(cell));
         }
         m_view.gridChanged();
+        m_standWork.cashFlowEdited();
     });
 }
 
 void NpvWindowLogic::selectCell(int row, int column) {
     m_row = std::clamp(row, 0, m_cashFlow.years());
-    m_column = std::clamp(column, 0, kCashFlowColumnCount - 1);
+    m_column = std::clamp(column, 0, work::kCashFlowColumnCount - 1);
     m_view.setCurrentCell(m_row, m_column);
 }
 
@@ -189,6 +193,7 @@ bool NpvWindowLogic::txtInterestRate_LostFocus() {
         return false;
     }
     m_cashFlow.setInterestRate(shell::val(typed));
+    m_standWork.cashFlowEdited();
     return true;
 }
 

@@ -5,7 +5,8 @@
 // into it, the interest rate, the computation and the copy to the clipboard.
 
 #include "economics/inpvview.hpp"
-#include "economics/mdlnpv.hpp"
+#include "work/mdlnpv.hpp"
+#include "work/standwork.hpp"
 
 #include <QString>
 #include <QStringList>
@@ -22,9 +23,9 @@ namespace arbolex::economics {
 
 class NpvWindowLogic {
 public:
-    /// `cashFlow` and `revenue` are the program's; the window shows and edits them.
-    NpvWindowLogic(CashFlow &cashFlow, const TimberRevenue &revenue, shell::ErrorLog &log,
-                   INpvView &view, shell::IInteractive &interactive, shell::IClipboard &clipboard);
+    /// The window shows and edits the cash flow of `work`.
+    NpvWindowLogic(work::StandWork &work, INpvView &view, shell::IInteractive &interactive,
+                   shell::IClipboard &clipboard);
 
     /// The window's load: headers, one row per year, the timber revenues, the
     /// values typed so far, the interest rate and the net present value.
@@ -67,15 +68,15 @@ private:
     void showNetPresentValue();
     bool editable(int column) const;
 
-    CashFlow &m_cashFlow;
-    const TimberRevenue &m_revenue;
+    work::StandWork &m_standWork;
+    work::CashFlow &m_cashFlow;
     shell::ErrorLog &m_log;
     INpvView &m_view;
     shell::IInteractive &m_interactive;
     shell::IClipboard &m_clipboard;
     std::vector<QStringList> m_grid;
     int m_row = 1;
-    int m_column = kCfCost;
+    int m_column = work::kCfCost;
 };
 
 } // namespace arbolex::economics

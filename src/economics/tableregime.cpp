@@ -1,6 +1,6 @@
 #include "economics/tableregime.hpp"
 
-#include "workflow/projectiontable.hpp"
+#include "work/projectiontable.hpp"
 
 #include <QLocale>
 
@@ -38,13 +38,13 @@ QString ageList(const std::vector<int> &ages) {
 
 } // namespace
 
-std::optional<rotation::Stand> standFromTable(const workflow::ProjectionTable &table,
+std::optional<rotation::Stand> standFromTable(const work::ProjectionTable &table,
                                               std::int16_t model) {
     for (int r = 1; r <= table.lastRow(); ++r) {
-        const workflow::TableRow &row = table.row(r);
+        const work::TableRow &row = table.row(r);
         if (row.isGrowth()) {
             // The stand before any thinning of that age.
-            const workflow::RowRecord &s = row.record;
+            const work::RowRecord &s = row.record;
             return rotation::Stand{model, s.age, s.stocking + s.removedStocking, s.topHeight,
                                    s.basalArea + s.removedBasalArea};
         }
@@ -52,10 +52,10 @@ std::optional<rotation::Stand> standFromTable(const workflow::ProjectionTable &t
     return std::nullopt;
 }
 
-TableRegime regimeFromTable(const workflow::ProjectionTable &table) {
+TableRegime regimeFromTable(const work::ProjectionTable &table) {
     TableRegime t;
     for (int r = 1; r <= table.lastRow(); ++r) {
-        const workflow::TableRow &row = table.row(r);
+        const work::TableRow &row = table.row(r);
         if (row.finalCut) {
             t.finalCut = wholeAge(row.record.age);
         } else if (row.isThinning()) {
@@ -93,6 +93,59 @@ TableRegime regimeFromTable(const workflow::ProjectionTable &table) {
     return t;
 }
 
+std::optional<rotation::RotationHarvests>
+harvestsFromTable(const work::ProjectionTable &table,
+                  const engine::VolumeRatioCoefficients &volumeRatio) {
+    rotation::RotationHarvests h;
+    h.volumeRatio = volumeRatio;
+    bool felled = false;
+    for (int r = 1; r <= table.lastRow() && !felled; ++r) {
+        const work::TableRow &row = table.row(r);
+        const work::RowRecord &s = row.record;
+        if (row.finalCut) {
+            felled = true;
+            h.rotation = wholeAge(s.age);
+            h.finalCut = rotation::finalCutHarvest(
+                h.rotation, {s.age, s.basalArea, s.stocking, s.topHeight, s.volume});
+        } else if (row.isThinning()) {
+            h.thinnings.push_back(rotation::thinningHarvest(
+                wholeAge(s.age), s.removedVolume, s.removedStocking, s.removedBasalArea,
+                {s.age, s.basalArea, s.stocking, s.topHeight, s.volume}));
+        }
+    }
+    if (!felled) {
+        return std::nullopt;
+    }
+    // The cash flow's first year.
+    h.presentAge = static_cast<int>(std::nearbyint(table.row(1).numbers[work::kNumAge]));
+    return h;
+}
+
+QString describeTableRotation(const rotation::RotationHarvests &h) {
+    const QString cut =
+        QStringLiteral("final cut at ") + QString::number(h.rotation) + QStringLiteral(" years");
+    if (h.thinnings.empty()) {
+        return QStringLiteral("No thinning; ") + cut + QLatin1Char('.');
+    }
+    std::vector<int> ages;
+    float lightest = h.thinnings.front().volume;
+    float heaviest = lightest;
+    for (const rotation::Harvest &t : h.thinnings) {
+        ages.push_back(t.age);
+        lightest = std::min(lightest, t.volume);
+        heaviest = std::max(heaviest, t.volume);
+    }
+    // Removals closer than kSameVolume read as one volume, as the typed one.
+    const QString volumes = heaviest - lightest > kSameVolume
+                                ? volumeText(std::round(lightest * 10.0f) / 10.0f) +
+                                      QStringLiteral(" to ") +
+                                      volumeText(std::round(heaviest * 10.0f) / 10.0f)
+                                : volumeText(std::round(lightest * 100.0f) / 100.0f);
+    return (ages.size() > 1 ? QStringLiteral("Thinnings of ") : QStringLiteral("Thinning of ")) +
+           volumes + QStringLiteral(" m³/ha at ") + ageList(ages) + QStringLiteral(" years; ") +
+           cut + QLatin1Char('.');
+}
+
 QString describeRegime(const rotation::Regime &regime, int rotation) {
     const QString cut =
         QStringLiteral("final cut at ") + QString::number(rotation) + QStringLiteral(" years");
@@ -109,17 +162,20 @@ QString describeRegime(const rotation::Regime &regime, int rotation) {
            QLatin1Char('.');
 }
 
-QString irregularNote(const TableRegime &t) {
+QString irregularNote(const TableRegime &t, bool everyFigure) {
     if (!t.irregular) {
         return {};
     }
     const auto [lightest, heaviest] = std::minmax_element(t.volumes.begin(), t.volumes.end());
     return QStringLiteral("Your thinnings are irregular (at ") + ageList(t.ages) +
            QStringLiteral(" years, ") + volumeText(*lightest) + QStringLiteral(" to ") +
-           volumeText(*heaviest) +
-           QStringLiteral(" m³/ha). Valued as a regular regime: their mean interval, ") +
-           QString::number(t.regime.thinEvery) + QStringLiteral(" years, and their mean volume, ") +
-           volumeText(t.regime.thinVolume) + QStringLiteral(" m³/ha.");
+           volumeText(*heaviest) + QStringLiteral(" m³/ha). ") +
+           (everyFigure ? QStringLiteral("Valued as a regular regime")
+                        : QStringLiteral("The explorer and the optimiser take them as a regular "
+                                         "regime")) +
+           QStringLiteral(": their mean interval, ") + QString::number(t.regime.thinEvery) +
+           QStringLiteral(" years, and their mean volume, ") + volumeText(t.regime.thinVolume) +
+           QStringLiteral(" m³/ha.");
 }
 
 } // namespace arbolex::economics

@@ -11,7 +11,7 @@
 #include <optional>
 #include <vector>
 
-namespace arbolex::workflow {
+namespace arbolex::work {
 class ProjectionTable;
 }
 
@@ -33,16 +33,29 @@ struct TableRegime {
 
 /// The stand of the table's first growth row, of model `model`; std::nullopt
 /// for a table without one.
-std::optional<rotation::Stand> standFromTable(const workflow::ProjectionTable &table,
+std::optional<rotation::Stand> standFromTable(const work::ProjectionTable &table,
                                               std::int16_t model);
 
 /// The regime of the table's thinning rows before its final cut.
-TableRegime regimeFromTable(const workflow::ProjectionTable &table);
+TableRegime regimeFromTable(const work::ProjectionTable &table);
+
+/// The rotation as the table holds it: every thinning row (one in the year of
+/// the final cut too) and the final-cut row, from the table's first year, for
+/// the rotation library to value; `volumeRatio` divides them into
+/// assortments. std::nullopt for a table without a final cut.
+std::optional<rotation::RotationHarvests>
+harvestsFromTable(const work::ProjectionTable &table,
+                  const engine::VolumeRatioCoefficients &volumeRatio);
+
+/// "Thinnings of 30 to 50 m³/ha at 20, 25 and 32 years; final cut at 45 years."
+QString describeTableRotation(const rotation::RotationHarvests &harvests);
 
 /// "40 m³/ha at 20, 25 and 30 years", or "no thinning".
 QString describeRegime(const rotation::Regime &regime, int rotation);
 
-/// What was assumed for irregular thinnings, empty for a regular regime.
-QString irregularNote(const TableRegime &regime);
+/// What was assumed for irregular thinnings, empty for a regular regime:
+/// every figure when `everyFigure`, else the rotation explorer's and the
+/// optimiser's (the table's own thinnings valued as they are).
+QString irregularNote(const TableRegime &regime, bool everyFigure = true);
 
 } // namespace arbolex::economics

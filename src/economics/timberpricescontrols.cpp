@@ -1,6 +1,6 @@
 #include "economics/timberpricescontrols.hpp"
 
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 #include "shell/controlnames.hpp"
 
 #include <array>
@@ -33,7 +33,7 @@ int elementCount(TimberPricesControl control) {
     case TimberPricesControl::txtTimbVal:
         return kPriceFieldCount;
     case TimberPricesControl::lblTimbCat:
-        return kPriceClassCount;
+        return prices::kPriceClassCount;
     case TimberPricesControl::fraTimbPrice:
         return kPriceBlockCount;
     default:

@@ -3,8 +3,8 @@
 #include "economics/assortpricesmessages.hpp"
 #include "economics/assortpriceswindowlogic.hpp"
 #include "economics/pricefieldkeys.hpp"
-#include "economics/pricelookup.hpp"
 #include "economics/timberpricesmessages.hpp"
+#include "prices/pricelookup.hpp"
 #include "shell/apperror.hpp"
 #include "shell/vbformat.hpp"
 #include "shell/vbtext.hpp"
@@ -19,7 +19,7 @@ namespace {
 constexpr char16_t kPriceFormat[] = u"#0.00";
 
 /// The first field of each block; the block number is the price set's.
-constexpr int kUserFirstField = kUserPrices * kPriceClassCount;
+constexpr int kUserFirstField = prices::kUserPrices * prices::kPriceClassCount;
 
 TimberPricesItem field(int index) {
     return {TimberPricesControl::txtTimbVal, index};
@@ -30,7 +30,7 @@ TimberPricesItem single(TimberPricesControl control) {
 }
 
 bool isUserField(int index) {
-    return index >= kUserFirstField && index < kUserFirstField + kPriceClassCount;
+    return index >= kUserFirstField && index < kUserFirstField + prices::kPriceClassCount;
 }
 
 QString windowLabel(const char *handler) {
@@ -39,16 +39,16 @@ QString windowLabel(const char *handler) {
 
 } // namespace
 
-TimberPricesWindowLogic::TimberPricesWindowLogic(Prices &prices, shell::ErrorLog &log,
+TimberPricesWindowLogic::TimberPricesWindowLogic(prices::Prices &prices, shell::ErrorLog &log,
                                                  ITimberPricesView &view)
     : m_prices(prices), m_log(log), m_view(view) {}
 
-PriceSet TimberPricesWindowLogic::priceSetOf(TimberPricesControl option) {
-    return static_cast<PriceSet>(static_cast<int>(option) -
-                                 static_cast<int>(TimberPricesControl::OptCurentPrices));
+prices::PriceSet TimberPricesWindowLogic::priceSetOf(TimberPricesControl option) {
+    return static_cast<prices::PriceSet>(static_cast<int>(option) -
+                                         static_cast<int>(TimberPricesControl::OptCurentPrices));
 }
 
-TimberPricesControl TimberPricesWindowLogic::optionOf(PriceSet set) {
+TimberPricesControl TimberPricesWindowLogic::optionOf(prices::PriceSet set) {
     return static_cast<TimberPricesControl>(static_cast<int>(TimberPricesControl::OptCurentPrices) +
                                             set);
 }
@@ -57,16 +57,16 @@ void TimberPricesWindowLogic::Form_Load() {
     shell::guard(m_log, windowLabel("Form_Load"), [&] {
         using C = TimberPricesControl;
         m_view.setCaption(text::timberPricesCaption());
-        for (int k = 0; k < kPriceClassCount; ++k) {
+        for (int k = 0; k < prices::kPriceClassCount; ++k) {
             m_view.setText({C::lblTimbCat, k},
-                           kTimberCategoryCaptions.at(static_cast<std::size_t>(k)));
+                           prices::kTimberCategoryCaptions.at(static_cast<std::size_t>(k)));
         }
         const QString frames[kPriceBlockCount] = {text::fraCurrent(), text::fraUser(),
                                                   text::fraLongTerm(), text::fraOvra()};
         for (int b = 0; b < kPriceBlockCount; ++b) {
             m_view.setText({C::fraTimbPrice, b}, frames[b]);
         }
-        const PriceData &data = m_prices.data();
+        const prices::PriceData &data = m_prices.data();
         const std::pair<C, QString> texts[] = {
             {C::OptCurentPrices, text::optCurentPrices()},
             {C::OptUserPrices, text::optUserPrices()},
@@ -86,7 +86,7 @@ void TimberPricesWindowLogic::Form_Load() {
             m_view.setText(single(control), caption);
         }
         FillPriceFields();
-        checkOption(static_cast<PriceSet>(m_prices.priceSetInUse()));
+        checkOption(static_cast<prices::PriceSet>(m_prices.priceSetInUse()));
         showChangesState();
     });
 }
@@ -98,16 +98,17 @@ void TimberPricesWindowLogic::show() {
 
 void TimberPricesWindowLogic::FillPriceFields() {
     for (int f = 0; f < kPriceFieldCount; ++f) {
-        const PriceList *list = m_prices.priceSet(static_cast<std::int16_t>(f / kPriceClassCount));
-        const double price = list->at(static_cast<std::size_t>(f % kPriceClassCount));
+        const prices::PriceList *list =
+            m_prices.priceSet(static_cast<std::int16_t>(f / prices::kPriceClassCount));
+        const double price = list->at(static_cast<std::size_t>(f % prices::kPriceClassCount));
         m_view.setText(field(f), shell::formatNumber(price, kPriceFormat));
         m_view.setNegative(f, price < 0.0);
     }
 }
 
-void TimberPricesWindowLogic::checkOption(PriceSet set) {
-    for (int s = kCurrentPrices; s <= kPrivatePrices; ++s) {
-        m_view.setChecked(optionOf(static_cast<PriceSet>(s)), s == set);
+void TimberPricesWindowLogic::checkOption(prices::PriceSet set) {
+    for (int s = prices::kCurrentPrices; s <= prices::kPrivatePrices; ++s) {
+        m_view.setChecked(optionOf(static_cast<prices::PriceSet>(s)), s == set);
     }
 }
 
@@ -127,8 +128,8 @@ void TimberPricesWindowLogic::cmdChangePrices_Click() {
         }
         m_prices.setPriceChanges(false);
         showChangesState();
-        PriceList &user = m_prices.data().userDefined;
-        for (int k = 0; k < kPriceClassCount; ++k) {
+        prices::PriceList &user = m_prices.data().userDefined;
+        for (int k = 0; k < prices::kPriceClassCount; ++k) {
             const int f = kUserFirstField + k;
             if (m_view.text(field(f)).isEmpty()) {
                 m_view.setText(field(f), QStringLiteral("0"));
@@ -138,13 +139,13 @@ void TimberPricesWindowLogic::cmdChangePrices_Click() {
             m_view.setNegative(f, price < 0.0);
         }
         // Prices in use are a copy: when they are the user's, they follow the edit.
-        if (m_prices.priceSetInUse() == kUserPrices) {
-            m_prices.selectPriceSet(kUserPrices);
+        if (m_prices.priceSetInUse() == prices::kUserPrices) {
+            m_prices.selectPriceSet(prices::kUserPrices);
         }
     });
 }
 
-void TimberPricesWindowLogic::selectPrices(PriceSet set, const char *label) {
+void TimberPricesWindowLogic::selectPrices(prices::PriceSet set, const char *label) {
     shell::guard(m_log, windowLabel(label), [&] {
         m_prices.selectPriceSet(set);
         checkOption(set);
@@ -152,19 +153,19 @@ void TimberPricesWindowLogic::selectPrices(PriceSet set, const char *label) {
 }
 
 void TimberPricesWindowLogic::OptCurentPrices_Click() {
-    selectPrices(kCurrentPrices, "OptCurentPrices_Click");
+    selectPrices(prices::kCurrentPrices, "OptCurentPrices_Click");
 }
 
 void TimberPricesWindowLogic::OptUserPrices_Click() {
-    selectPrices(kUserPrices, "OptUserPrices_Click");
+    selectPrices(prices::kUserPrices, "OptUserPrices_Click");
 }
 
 void TimberPricesWindowLogic::OptNPVprices_Click() {
-    selectPrices(kLongTermPrices, "OptNPVprices_Click");
+    selectPrices(prices::kLongTermPrices, "OptNPVprices_Click");
 }
 
 void TimberPricesWindowLogic::OptOvraPrices_Click() {
-    selectPrices(kPrivatePrices, "OptOvraPrices_Click");
+    selectPrices(prices::kPrivatePrices, "OptOvraPrices_Click");
 }
 
 void TimberPricesWindowLogic::cmdClosePricesList_Click() {

@@ -5,7 +5,7 @@
 // user-defined prices between "Allow Changes" and "Accept Changes".
 
 #include "economics/itimberpricesview.hpp"
-#include "economics/prices.hpp"
+#include "prices/prices.hpp"
 
 #include <QChar>
 #include <QString>
@@ -20,7 +20,7 @@ class AssortPricesWindowLogic;
 
 class TimberPricesWindowLogic {
 public:
-    TimberPricesWindowLogic(Prices &prices, shell::ErrorLog &log, ITimberPricesView &view);
+    TimberPricesWindowLogic(prices::Prices &prices, shell::ErrorLog &log, ITimberPricesView &view);
 
     /// The window's load: every caption, the four lists, the option of the
     /// set in use and the caption of `cmdChangePrices` for the price changes flag.
@@ -55,19 +55,19 @@ public:
     bool press(TimberPricesControl control);
 
     /// The price set an option button chooses, as numbered for the prices in use.
-    static PriceSet priceSetOf(TimberPricesControl option);
+    static prices::PriceSet priceSetOf(TimberPricesControl option);
     /// The option button of a price set.
-    static TimberPricesControl optionOf(PriceSet set);
+    static TimberPricesControl optionOf(prices::PriceSet set);
 
     ITimberPricesView &view() { return m_view; }
 
 private:
-    void selectPrices(PriceSet set, const char *label);
+    void selectPrices(prices::PriceSet set, const char *label);
     /// Checks the option button of `set` and clears the others.
-    void checkOption(PriceSet set);
+    void checkOption(prices::PriceSet set);
     void showChangesState();
 
-    Prices &m_prices;
+    prices::Prices &m_prices;
     shell::ErrorLog &m_log;
     ITimberPricesView &m_view;
     AssortPricesWindowLogic *m_assortPrices = nullptr;

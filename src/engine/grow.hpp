@@ -30,6 +30,44 @@ enum ModelPart : std::int16_t {
     kPartAssortment = 4,
 };
 
+/// How a thinning prescribed by volume came out.
+enum class VolumeThinningOutcome {
+    kDone,
+    /// The model has no thinning response: basal area and stocking are not tied.
+    kNoThinningResponse,
+    /// NEWTON did not converge or failed, and said so.
+    kSolverFailed,
+    /// The solution leaves no basal area or no stems.
+    kNothingLeft,
+};
+
+/// The stand after a thinning prescribed by volume.
+struct VolumeThinning {
+    VolumeThinningOutcome outcome = VolumeThinningOutcome::kDone;
+    float basalArea = 0.0f; ///< m²/ha
+    float stocking = 0.0f;  ///< stems/ha
+    float volume = 0.0f;    ///< m³/ha
+
+    bool done() const { return outcome == VolumeThinningOutcome::kDone; }
+};
+
+/// Volume a removal of `removal` m³/ha leaves of `volume` m³/ha, as the
+/// thinning window computes it: in double, stored in single precision.
+inline float residualVolume(float volume, double removal) {
+    return static_cast<float>(double{volume} - removal);
+}
+
+/// Messages of the thinning window about a prescription the engine refuses.
+namespace thinningtext {
+inline constexpr std::string_view kRemovalLeavesNoVolume =
+    "FAULT - Proposed thinning leads to negative or zero Volume.";
+inline constexpr std::string_view kNothingLeft =
+    "FAULT - Negative or zero Basal Area or Stocking predicted";
+inline constexpr std::string_view kNoThinningResponse =
+    "FAULT - The model in use has no thinning response: a thinning may only be prescribed by "
+    "Basal area & Stocking reductions.";
+} // namespace thinningtext
+
 /// A 3 × 3 single-precision matrix, rows then columns, 0-based.
 using Matrix3 = std::array<std::array<float, 3>, 3>;
 
@@ -41,6 +79,7 @@ public:
     explicit Grow(IEngineReport *report = nullptr) : m_report(report) {}
 
     void setReport(IEngineReport *report) { m_report = report; }
+    IEngineReport *report() const { return m_report; }
 
     // ---- Model catalogue -------------------------------------------------
 
@@ -135,6 +174,12 @@ public:
 
     /// Newton iteration limit.
     static constexpr int kNewtonIterationLimit = 100;
+
+    /// The thinning window's volume method: the stand (stocking N, basal area
+    /// G, top height H) thinned to `residualVolume` (m³/ha), its residual
+    /// basal area and stocking from the thinning response by NEWTON. A failure
+    /// of the solver has been shown by the engine itself.
+    VolumeThinning thinToVolume(float N, float G, float H, float residualVolume);
 
     // ---- Assortments (docs/assortments.md) -------------------------------
 

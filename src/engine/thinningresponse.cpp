@@ -147,4 +147,23 @@ bool Grow::NEWTON(float N, float G, float H, float Vt, float &Nr, float &Gr) {
     }
 }
 
+VolumeThinning Grow::thinToVolume(float N, float G, float H, float residualVolume) {
+    VolumeThinning t;
+    if (T(1) == 0.0) {
+        // Without a thinning response basal area and stocking are not tied.
+        t.outcome = VolumeThinningOutcome::kNoThinningResponse;
+        return t;
+    }
+    t.volume = residualVolume;
+    const unsigned faultsBefore = m_faultCount;
+    if (!NEWTON(N, G, H, t.volume, t.stocking, t.basalArea) || m_faultCount != faultsBefore) {
+        t.outcome = VolumeThinningOutcome::kSolverFailed;
+        return t;
+    }
+    if (!(t.basalArea > 0.0f) || !(t.stocking > 0.0f) || !std::isfinite(t.volume)) {
+        t.outcome = VolumeThinningOutcome::kNothingLeft;
+    }
+    return t;
+}
+
 } // namespace arbolex::engine

@@ -53,6 +53,7 @@ const std::vector<ResultColumn> &figureColumns() {
                                                       {"final_cut_volume_ha", kReal},
                                                       {"final_cut_volume", kReal},
                                                       {"max_mai", kReal},
+                                                      {"mai_final_cut", kReal},
                                                       {"npv_ha", kReal},
                                                       {"npv", kReal},
                                                       {"lev_ha", kReal},
@@ -81,6 +82,7 @@ void figureValues(const RowResult &row, std::vector<std::string> &values) {
     values.push_back(quantity(row.finalCutVolume));
     values.push_back(fixed(double{row.finalCutVolume} * area, 3));
     values.push_back(quantity(row.maxMai));
+    values.push_back(quantity(row.finalCutMai));
     values.push_back(money(row.npv));
     values.push_back(moneyForArea(row.npv, area));
     values.push_back(money(row.lev));

@@ -81,10 +81,11 @@ RowResult RowEvaluator::evaluate(const RowValues &values) {
 void RowEvaluator::grow(const RowPlan &plan, RowResult &result) {
     const unsigned faultsBefore = m_grow.faultCount();
     rotation::GrowthFailure failure;
-    // A given final cut needs the path only that far; the economic rotation
-    // is looked for over the whole path.
+    // The whole path, to the model's age limit, whatever the final cut: the
+    // economic rotation is looked for over it, and the yield class is the
+    // stand's productivity over it, not only up to an early final cut.
     const std::optional<rotation::GrowthPath> path =
-        rotation::growPath(m_grow, plan.stand, plan.regime, failure, nullptr, plan.rotation);
+        rotation::growPath(m_grow, plan.stand, plan.regime, failure);
     if (!path) {
         result.status = failure.badInput ? RowStatus::kRefused : RowStatus::kFailed;
         // The engine's own message, when it gave one, says more.
@@ -119,11 +120,12 @@ void RowEvaluator::grow(const RowPlan &plan, RowResult &result) {
                                whole(double{f.volume} * plan.areaHa * 1000.0),
                                whole(f.revenue * plan.areaHa * 100.0)});
     result.thinningCount = static_cast<int>(value.thinnings.size());
-    result.yieldClass = value.yieldClass;
+    result.yieldClass = rotation::pathYieldClass(*path);
     result.finalCutAge = f.age;
     result.finalCutYear = presentYear + f.age;
     result.finalCutVolume = f.volume;
     result.maxMai = value.maxMai;
+    result.finalCutMai = value.mai;
     result.npv = value.npv;
     result.lev = value.lev;
     result.forestValue = value.forestValue;

@@ -46,6 +46,7 @@ struct RowResult {
     double areaHa = 0.0;
     /// Site index, m.
     float siteIndex = 0.0f;
+    /// Yield class over the stand's path to the model's age limit.
     int yieldClass = 0;
     int thinningCount = 0;
     /// Volume of all thinnings, m³/ha.
@@ -55,8 +56,10 @@ struct RowResult {
     int finalCutYear = 0;
     /// Standing volume at the final cut, m³/ha.
     float finalCutVolume = 0.0f;
-    /// Largest mean annual increment, m³/ha/year.
+    /// Largest mean annual increment up to the final cut, m³/ha/year.
     double maxMai = 0.0;
+    /// Mean annual increment at the final cut, m³/ha/year.
+    double finalCutMai = 0.0;
     /// Money, euro/ha.
     std::optional<double> npv;
     std::optional<double> lev;

@@ -44,15 +44,6 @@ inline QString summary(long long rows, long long notGrown) {
            QString::number(notGrown) +
            QStringLiteral(" not grown. Double-click a sub-compartment to open it.");
 }
-inline QString chartTitle() {
-    return QStringLiteral("Harvest forecast by year and species");
-}
-inline QString chartValueAxis() {
-    return QStringLiteral("Volume harvested, m³ to 7 cm top");
-}
-inline QString chartYearAxis() {
-    return QStringLiteral("Year");
-}
 inline QString tabTable() {
     return QStringLiteral("Sub-compartments");
 }

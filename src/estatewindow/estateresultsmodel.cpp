@@ -1,33 +1,53 @@
 #include "estatewindow/estateresultsmodel.hpp"
 
+#include "estate/resulttable.hpp"
 #include "estatewindow/estatemessages.hpp"
 #include "shell/vbformat.hpp"
 
 #include <array>
+#include <string_view>
 
 namespace arbolex::estatewindow {
 
 namespace {
 
-/// Where each column of the table is among estate::figureValues; -1 for the
-/// columns that are not figures.
-constexpr std::array<int, EstateResultsModel::kColumnCount> kFigureOf = {
-    -1, // id
-    0,  // model label
-    -1, // area
-    1,  // site index
-    2,  // yield class
-    3,  // thinnings
-    5,  // thinning volume of the sub-compartment, m³
-    6,  // final-cut age
-    7,  // final-cut year
-    9,  // final-cut volume of the sub-compartment, m³
-    11, // NPV, euro/ha
-    13, // LEV, euro/ha
-    15, // forest value, euro/ha
-    17, // status
-    -1, // message
+/// The figure of estate::figureColumns each column of the table shows, by
+/// name; empty for the columns that are not figures.
+constexpr std::array<std::string_view, EstateResultsModel::kColumnCount> kFigureName = {
+    "",                 // id
+    "model_label",      //
+    "",                 // area
+    "site_index",       //
+    "yield_class",      //
+    "thinnings",        //
+    "thinning_volume",  // of the sub-compartment, m³
+    "final_cut_age",    //
+    "final_cut_year",   //
+    "final_cut_volume", // of the sub-compartment, m³
+    "npv_ha",           //
+    "lev_ha",           //
+    "forest_value_ha",  //
+    "status",           //
+    "",                 // message
 };
+
+/// Where column `column` is among estate::figureValues; -1 for none.
+int figureOf(int column) {
+    static const std::array<int, EstateResultsModel::kColumnCount> positions = [] {
+        std::array<int, EstateResultsModel::kColumnCount> p{};
+        const std::vector<estate::ResultColumn> &figures = estate::figureColumns();
+        for (std::size_t c = 0; c < p.size(); ++c) {
+            p[c] = -1;
+            for (std::size_t f = 0; f < figures.size(); ++f) {
+                if (!kFigureName[c].empty() && figures[f].name == kFigureName[c]) {
+                    p[c] = static_cast<int>(f);
+                }
+            }
+        }
+        return p;
+    }();
+    return positions.at(static_cast<std::size_t>(column));
+}
 
 bool isTextColumn(int column) {
     return column == EstateResultsModel::kIdColumn || column == EstateResultsModel::kModelColumn ||
@@ -63,7 +83,7 @@ QString EstateResultsModel::cellText(int row, int column) const {
     default:
         break;
     }
-    const int figure = kFigureOf.at(static_cast<std::size_t>(column));
+    const int figure = figureOf(column);
     if (figure < 0 || static_cast<std::size_t>(figure) >= r.figures.size()) {
         return {};
     }

@@ -2,14 +2,15 @@
 
 #include "document/documentcontroller.hpp"
 #include "document/opendocument.hpp"
-#include "economics/prices.hpp"
-#include "economics/regimereplay.hpp"
 #include "estate/resulttable.hpp"
 #include "estateio/gdallayer.hpp"
 #include "estatewindow/estatemessages.hpp"
+#include "prices/prices.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
-#include "workflow/mainwindowlogic.hpp"
+#include "work/regimereplay.hpp"
+#include "work/standwork.hpp"
+#include "workflow/iworkwindows.hpp"
 
 #include <QDate>
 #include <QFileInfo>
@@ -24,7 +25,7 @@ namespace arbolex::estatewindow {
 namespace {
 
 /// Grow step of an opened sub-compartment, years.
-constexpr int kOpenedStep = 5;
+constexpr int kOpenedStep = 1;
 /// Rows handed to a thread at a time: small enough that the progress moves.
 constexpr std::size_t kChunkRows = 64;
 
@@ -69,8 +70,8 @@ struct Job {
     QString failure;
 };
 
-ForecastChart chartOf(const estate::Forecast &forecast, int firstYear) {
-    ForecastChart chart;
+charts::HarvestForecast chartOf(const estate::Forecast &forecast, int firstYear) {
+    charts::HarvestForecast chart;
     const std::vector<estate::Forecast::Line> lines = forecast.lines(firstYear);
     for (const estate::Forecast::Line &line : lines) {
         const QString species = QString::fromStdString(line.species);
@@ -99,11 +100,11 @@ ForecastChart chartOf(const estate::Forecast &forecast, int firstYear) {
 
 } // namespace
 
-EstateWindowLogic::EstateWindowLogic(workflow::MainWindowLogic &main,
-                                     thinning::ThinWindowLogic &thin,
+EstateWindowLogic::EstateWindowLogic(work::StandWork &work, workflow::IMainCommands &main,
                                      document::DocumentController &documents, IEstateView &view,
                                      shell::IInteractive &interactive)
-    : m_main(main), m_thin(thin), m_documents(documents), m_view(view), m_interactive(interactive) {
+    : m_standWork(work), m_main(main), m_documents(documents), m_view(view),
+      m_interactive(interactive) {
     m_settings.threads = static_cast<int>(std::max(1U, std::thread::hardware_concurrency()));
     m_settings.chunkRows = kChunkRows;
 }
@@ -111,11 +112,14 @@ EstateWindowLogic::EstateWindowLogic(workflow::MainWindowLogic &main,
 estate::EstateDefaults EstateWindowLogic::defaults() const {
     estate::EstateDefaults d;
     d.year = QDate::currentDate().year();
-    d.economics.ratePercent = m_main.cashFlow().interestRate();
-    economics::Prices longTerm;
-    longTerm.data() = m_main.prices().data();
-    longTerm.selectPriceSet(economics::kLongTermPrices);
+    d.economics.ratePercent = m_standWork.cashFlow().interestRate();
+    prices::Prices longTerm;
+    longTerm.data() = m_standWork.prices().data();
+    longTerm.selectPriceSet(prices::kLongTermPrices);
     d.economics.prices = longTerm.pricesInUse();
+    // Every sub-compartment at the data folder's costs, as arbolex-cli estate counts it.
+    d.economics.establishmentCost = m_standWork.defaultEstablishmentCost();
+    d.economics.annualCost = m_standWork.defaultAnnualCost();
     return d;
 }
 
@@ -131,83 +135,85 @@ void EstateWindowLogic::mnuOpenEstate_Click() {
 }
 
 void EstateWindowLogic::openEstate(const QString &path) {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in frmEstate.mnuOpenEstate_Click()"), [&] {
-        if (m_running) {
-            return;
-        }
-        auto job = std::make_shared<Job>();
-        job->path = QFileInfo(path).absoluteFilePath().toStdString();
-        job->defaults = defaults();
-        job->settings = m_settings;
-        m_running = true;
-        m_cancel = false;
-        m_view.setProgress(0, -1);
-        m_view.runInBackground(
-            [this, job] {
-                try {
-                    estateio::LayerReader reader(job->path, std::string(), false);
-                    std::string problem;
-                    job->layout = estateio::layoutOf(reader, problem);
-                    if (!job->layout) {
-                        job->fault = QString::fromStdString(problem);
+    shell::guard(
+        m_standWork.errorLog(), QStringLiteral(" in frmEstate.mnuOpenEstate_Click()"), [&] {
+            if (m_running) {
+                return;
+            }
+            auto job = std::make_shared<Job>();
+            job->path = QFileInfo(path).absoluteFilePath().toStdString();
+            job->defaults = defaults();
+            job->settings = m_settings;
+            m_running = true;
+            m_cancel = false;
+            m_view.setProgress(0, -1);
+            m_view.runInBackground(
+                [this, job] {
+                    try {
+                        estateio::LayerReader reader(job->path, std::string(), false);
+                        std::string problem;
+                        job->layout = estateio::layoutOf(reader, problem);
+                        if (!job->layout) {
+                            job->fault = QString::fromStdString(problem);
+                            return;
+                        }
+                        const long long inInput = reader.rowCount();
+                        KeepingSink sink(*job->layout);
+                        job->summary =
+                            estate::runEstate(reader, sink, *job->layout, job->defaults,
+                                              job->settings, [this, inInput](long long done) {
+                                                  m_view.setProgress(done, inInput);
+                                                  return !m_cancel.load();
+                                              });
+                        job->rows = std::move(sink.rows);
+                        job->logLines = std::move(sink.logLines);
+                    } catch (const estateio::GdalError &e) {
+                        job->fault = QString::fromUtf8(e.what());
+                    } catch (const std::exception &e) {
+                        job->failure = QString::fromUtf8(e.what());
+                    }
+                },
+                [this, job, path] {
+                    m_running = false;
+                    shell::ErrorLog &log = m_standWork.errorLog();
+                    for (const std::string &line : job->logLines) {
+                        log.append(QString::fromStdString(line));
+                    }
+                    if (!job->failure.isEmpty()) {
+                        log.append(shell::windowFaultLine(
+                            {shell::RuntimeError::internal(job->failure), 0},
+                            QStringLiteral(" in frmEstate.mnuOpenEstate_Click()")));
+                        m_interactive.message(text::titleEstate(),
+                                              QStringLiteral("ERROR - ") + job->failure,
+                                              shell::kExclamation);
                         return;
                     }
-                    const long long inInput = reader.rowCount();
-                    KeepingSink sink(*job->layout);
-                    job->summary =
-                        estate::runEstate(reader, sink, *job->layout, job->defaults, job->settings,
-                                          [this, inInput](long long done) {
-                                              m_view.setProgress(done, inInput);
-                                              return !m_cancel.load();
-                                          });
-                    job->rows = std::move(sink.rows);
-                    job->logLines = std::move(sink.logLines);
-                } catch (const estateio::GdalError &e) {
-                    job->fault = QString::fromUtf8(e.what());
-                } catch (const std::exception &e) {
-                    job->failure = QString::fromUtf8(e.what());
-                }
-            },
-            [this, job, path] {
-                m_running = false;
-                shell::ErrorLog &log = m_main.errorLog();
-                for (const std::string &line : job->logLines) {
-                    log.append(QString::fromStdString(line));
-                }
-                if (!job->failure.isEmpty()) {
-                    log.append(shell::windowFaultLine(
-                        {shell::RuntimeError::internal(job->failure), 0},
-                        QStringLiteral(" in frmEstate.mnuOpenEstate_Click()")));
-                    m_interactive.message(text::titleEstate(),
-                                          QStringLiteral("ERROR - ") + job->failure,
-                                          shell::kExclamation);
-                    return;
-                }
-                if (!job->fault.isEmpty()) {
-                    m_interactive.message(text::titleEstate(), text::faultEstateFile(job->fault),
-                                          shell::kExclamation);
-                    return;
-                }
-                if (job->summary.cancelled) {
-                    m_interactive.message(text::titleEstate(), text::estateCancelled(),
-                                          shell::kInformation);
-                    return;
-                }
-                m_file = path;
-                m_layout = job->layout;
-                m_defaults = job->defaults;
-                m_model.setRows(std::move(job->rows));
-                m_forecast = chartOf(job->summary.forecast, job->defaults.year);
-                m_summary =
-                    text::summary(job->summary.rows, job->summary.refused + job->summary.failed);
-                m_view.resultsChanged();
-                m_view.showWindow();
-            });
-    });
+                    if (!job->fault.isEmpty()) {
+                        m_interactive.message(text::titleEstate(),
+                                              text::faultEstateFile(job->fault),
+                                              shell::kExclamation);
+                        return;
+                    }
+                    if (job->summary.cancelled) {
+                        m_interactive.message(text::titleEstate(), text::estateCancelled(),
+                                              shell::kInformation);
+                        return;
+                    }
+                    m_file = path;
+                    m_layout = job->layout;
+                    m_defaults = job->defaults;
+                    m_model.setRows(std::move(job->rows));
+                    m_forecast = chartOf(job->summary.forecast, job->defaults.year);
+                    m_summary = text::summary(job->summary.rows,
+                                              job->summary.refused + job->summary.failed);
+                    m_view.resultsChanged();
+                    m_view.showWindow();
+                });
+        });
 }
 
 void EstateWindowLogic::openSubCompartment(int row) {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in frmEstate.grdEstate_DblClick()"), [&] {
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in frmEstate.grdEstate_DblClick()"), [&] {
         if (m_running || !m_layout || row < 0 || row >= m_model.rowCount()) {
             return;
         }
@@ -228,14 +234,19 @@ void EstateWindowLogic::openSubCompartment(int row) {
             return;
         }
         const auto &plan = std::get<estate::RowPlan>(planned);
-        document::SubCompartment id;
+        work::SubCompartment id;
         id.subCompartment = r.id;
         id.notes =
             QFileInfo(m_file).fileName() + QStringLiteral(", line ") + QString::number(r.line);
-        m_main.restore(document::documentForStand(m_main, plan.stand, id, r.finalCutAge,
+        // The sub-compartment written on a copy of the work, as the main
+        // window writes its regime when it is typed in; the window then takes
+        // the copy whole.
+        work::StandWork opened(m_standWork.grow(), m_standWork.prices(), m_standWork.errorLog());
+        opened.restore(document::documentForStand(m_standWork, plan.stand, id, r.finalCutAge,
                                                   kOpenedStep, plan.areaHa));
         const std::optional<QString> failed =
-            economics::replayRegime(m_main, m_thin, plan.stand, plan.regime, r.finalCutAge);
+            work::replayRegime(opened, plan.stand, plan.regime, r.finalCutAge, m_interactive);
+        m_main.restore(opened.snapshot());
         m_documents.adoptNew(r.id);
         if (failed) {
             m_interactive.message(text::titleEstate(), text::openStopped(r.id, *failed),

@@ -7,6 +7,7 @@
 // the table becomes a new document of the main window, grown, thinned and
 // felled by its regime through the main window's own commands.
 
+#include "charts/estatecharts.hpp"
 #include "estate/estaterun.hpp"
 #include "estatewindow/estateresultsmodel.hpp"
 #include "estatewindow/iestateview.hpp"
@@ -26,32 +27,19 @@ namespace arbolex::shell {
 class IInteractive;
 }
 
-namespace arbolex::thinning {
-class ThinWindowLogic;
+namespace arbolex::work {
+class StandWork;
 }
 
 namespace arbolex::workflow {
-class MainWindowLogic;
+class IMainCommands;
 }
 
 namespace arbolex::estatewindow {
 
-/// The harvest forecast as a stacked bar chart draws it.
-struct ForecastChart {
-    /// Every calendar year from the estate's year to the last harvest.
-    std::vector<int> years;
-    /// Species harvested, by name.
-    QStringList species;
-    /// Thinning and final-cut volume, m³ to 7 cm top, of `species[s]` in
-    /// `years[y]`: volumes[s][y].
-    std::vector<std::vector<double>> volumes;
-
-    bool empty() const { return years.empty(); }
-};
-
 class EstateWindowLogic {
 public:
-    EstateWindowLogic(workflow::MainWindowLogic &main, thinning::ThinWindowLogic &thin,
+    EstateWindowLogic(work::StandWork &work, workflow::IMainCommands &main,
                       document::DocumentController &documents, IEstateView &view,
                       shell::IInteractive &interactive);
 
@@ -79,15 +67,15 @@ public:
 
     // ---- What the window shows -------------------------------------------------------
     EstateResultsModel &model() { return m_model; }
-    const ForecastChart &forecast() const { return m_forecast; }
+    const charts::HarvestForecast &forecast() const { return m_forecast; }
     /// The estate's file, empty before the first run.
     const QString &estateFile() const { return m_file; }
     /// "12 sub-compartments, 1 not grown. …"
     const QString &summaryText() const { return m_summary; }
 
 private:
-    workflow::MainWindowLogic &m_main;
-    thinning::ThinWindowLogic &m_thin;
+    work::StandWork &m_standWork;
+    workflow::IMainCommands &m_main;
     document::DocumentController &m_documents;
     IEstateView &m_view;
     shell::IInteractive &m_interactive;
@@ -96,7 +84,7 @@ private:
     bool m_running = false;
 
     EstateResultsModel m_model;
-    ForecastChart m_forecast;
+    charts::HarvestForecast m_forecast;
     QString m_file;
     QString m_summary;
     /// The layout and defaults of the shown run, to plan a row again.

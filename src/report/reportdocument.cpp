@@ -25,7 +25,7 @@ QString styleSheet() {
         "table.grid td { text-align: right; }"
         "table.grid td.label { text-align: left; }"
         "table.facts td { padding-right: 14px; }"
-        "td.caption { color: #555555; }"
+        ".caption { color: #555555; }"
         "p.note { color: #555555; }");
 }
 
@@ -40,6 +40,12 @@ QString factsHtml(const std::vector<std::pair<QString, QString>> &facts) {
                     .arg(esc(caption), esc(value));
     }
     return html + QStringLiteral("</table>");
+}
+
+/// A document of the report's style around `body`.
+QString styled(const QString &body) {
+    return QStringLiteral("<html><head><style>") + styleSheet() +
+           QStringLiteral("</style></head><body>") + body + QStringLiteral("</body></html>");
 }
 
 } // namespace
@@ -76,7 +82,8 @@ QString tableHtml(const charts::ReportTable &table) {
             const QString cell = row.value(c).trimmed();
             bool number = cell.isEmpty();
             if (!number) {
-                cell.toDouble(&number);
+                // Money reads "12,345" and "−1,234" (economics window).
+                QString(cell).remove(u',').replace(u'\u2212', u'-').toDouble(&number);
             }
             html += c > 0 && number ? QStringLiteral("<td>%1</td>").arg(esc(cell))
                                     : QStringLiteral("<td class=\"label\">%1</td>").arg(esc(cell));
@@ -87,9 +94,7 @@ QString tableHtml(const charts::ReportTable &table) {
 }
 
 QString reportHtml(const charts::ReportContent &content, const QString &printed) {
-    QString html = QStringLiteral("<html><head><style>") + styleSheet() +
-                   QStringLiteral("</style></head><body>");
-    html += QStringLiteral("<h1>%1</h1>").arg(esc(text::reportTitle()));
+    QString html = QStringLiteral("<h1>%1</h1>").arg(esc(text::reportTitle()));
     html += QStringLiteral("<table width=\"100%\" cellspacing=\"0\"><tr><td width=\"50%\">");
     html += factsHtml({{text::forest(), content.forest},
                        {text::compartment(), content.compartment},
@@ -124,7 +129,22 @@ QString reportHtml(const charts::ReportContent &content, const QString &printed)
         html += tableHtml(content.cashFlow);
         html += QStringLiteral("<p class=\"note\">%1</p>").arg(esc(text::quietYearsLeftOut()));
     }
-    return html + QStringLiteral("</body></html>");
+    return styled(html);
+}
+
+EconomicsHtml economicsHtml(const charts::EconomicsPage &page) {
+    EconomicsHtml html;
+    html.head =
+        styled(QStringLiteral("<h2>%1</h2><p><b>%2</b><br>%3<br>"
+                              "<span class=\"caption\">%4</span></p>")
+                   .arg(esc(page.title), esc(page.stand), esc(page.regime), esc(page.money)));
+    html.figures = styled(factsHtml(page.figures));
+    if (!page.regimes.empty()) {
+        html.regimes = styled(
+            QStringLiteral("<h2>%1</h2>").arg(esc(page.regimesTitle)) + tableHtml(page.regimes) +
+            QStringLiteral("<p class=\"note\">%1</p>").arg(esc(page.regimesNote)));
+    }
+    return html;
 }
 
 } // namespace arbolex::report

@@ -14,6 +14,16 @@ namespace arbolex::report {
 /// title block.
 QString reportHtml(const charts::ReportContent &content, const QString &printed);
 
+/// The text of the economics page in the three parts laid out around its
+/// chart: the head across the page, the figures beside the chart and the
+/// optimiser's regimes under both (empty without them).
+struct EconomicsHtml {
+    QString head;
+    QString figures;
+    QString regimes;
+};
+EconomicsHtml economicsHtml(const charts::EconomicsPage &page);
+
 /// One table as HTML: the groups (when any) over the captions in the header,
 /// then the rows.
 QString tableHtml(const charts::ReportTable &table);

@@ -27,6 +27,10 @@ constexpr qreal kLayoutDpi = 96.0;
 constexpr qreal kFooterHeight = 22.0;
 /// Page margins, millimetres.
 constexpr qreal kMarginMm = 12.0;
+/// Share of the economics page's width the figures take beside the chart.
+constexpr qreal kFiguresShare = 0.38;
+/// Space between the parts of the economics page, layout units.
+constexpr qreal kGap = 12.0;
 
 void paintFooter(QPainter &painter, const QRectF &page, const QString &left, int number,
                  int count) {
@@ -58,6 +62,45 @@ QString footerText(const charts::ReportContent &content) {
     return parts.join(QStringLiteral("  ·  "));
 }
 
+/// A piece of the report's text laid out `width` wide.
+void layOut(QTextDocument &document, const QString &html, qreal width) {
+    document.setDocumentMargin(0.0);
+    document.setTextWidth(width);
+    document.setHtml(html);
+}
+
+void drawAt(QPainter &painter, QTextDocument &document, QPointF at) {
+    painter.save();
+    painter.translate(at);
+    document.drawContents(&painter);
+    painter.restore();
+}
+
+/// The economics page: its head across the top, the figures on the left
+/// with the chart of NPV, LEV and MAI beside them, the optimiser's regimes
+/// along the bottom.
+void paintEconomics(QPainter &painter, const QSizeF &body, const charts::EconomicsPage &page) {
+    const EconomicsHtml html = economicsHtml(page);
+    QTextDocument head;
+    layOut(head, html.head, body.width());
+    QTextDocument figures;
+    const qreal figuresWidth = body.width() * kFiguresShare;
+    layOut(figures, html.figures, figuresWidth);
+    QTextDocument regimes;
+    layOut(regimes, html.regimes, body.width());
+    const qreal top = head.size().height() + kGap;
+    const qreal bottom =
+        html.regimes.isEmpty() ? body.height() : body.height() - regimes.size().height();
+    drawAt(painter, head, QPointF(0.0, 0.0));
+    drawAt(painter, figures, QPointF(0.0, top));
+    paintChart(page.rotations, painter,
+               QRectF(QPointF(figuresWidth + kGap, top),
+                      QPointF(body.width(), bottom - (html.regimes.isEmpty() ? 0.0 : kGap))));
+    if (!html.regimes.isEmpty()) {
+        drawAt(painter, regimes, QPointF(0.0, bottom));
+    }
+}
+
 } // namespace
 
 int paintReport(QPagedPaintDevice &device, const charts::ReportContent &content,
@@ -84,7 +127,8 @@ int paintReport(QPagedPaintDevice &device, const charts::ReportContent &content,
         }
     }
     const int textPages = document.pageCount();
-    const int pages = textPages + static_cast<int>(charts.size());
+    const int pages =
+        textPages + static_cast<int>(charts.size()) + (content.economics.has_value() ? 1 : 0);
     const QString footer = footerText(content);
 
     for (int p = 0; p < textPages; ++p) {
@@ -101,6 +145,11 @@ int paintReport(QPagedPaintDevice &device, const charts::ReportContent &content,
         device.newPage();
         paintChart(*charts[c], painter, QRectF(QPointF(0.0, 0.0), body));
         paintFooter(painter, page, footer, textPages + static_cast<int>(c) + 1, pages);
+    }
+    if (content.economics) {
+        device.newPage();
+        paintEconomics(painter, body, *content.economics);
+        paintFooter(painter, page, footer, pages, pages);
     }
     painter.end();
     return pages;

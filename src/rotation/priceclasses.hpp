@@ -6,6 +6,7 @@
 // from these texts.
 
 #include <array>
+#include <cstddef>
 #include <string_view>
 
 namespace arbolex::rotation {
@@ -35,11 +36,71 @@ constexpr std::string_view lowerBoundText(std::string_view caption) {
     return caption.substr(0, 4);
 }
 
-/// Price class 0 to 12 of a mean tree volume (m³ per tree), the bounds read
-/// from the captions with a parser that ignores the locale: class 0 when its
-/// upper bound is ≥ the volume (zero and negative volumes too), class 1 to 11
-/// when lower bound ≤ volume ≤ upper bound, class 12 for everything else,
-/// including volumes in the 0.001 gaps between two classes (0.0745 is class 12).
+/// Which bound of a caption a lookup reads.
+enum class PriceBound { kLower, kUpper };
+
+/// Statement numbers of the three caption conversions, as a failed lookup
+/// reports them.
+enum PriceLookupLine : int { kFirstUpperBound = 10, kLowerBound = 20, kUpperBound = 30 };
+
+/// Outcome of walking the class captions for one mean tree volume.
+struct PriceClassWalk {
+    /// Class 0 to 12 that holds the volume; 0 after a failure.
+    int priceClass = 0;
+    /// Statement number of the bound that did not convert; 0 when every bound did.
+    int failedLine = 0;
+
+    bool failed() const { return failedLine != 0; }
+};
+
+/// The text of one bound of caption `index`.
+constexpr std::string_view boundText(std::size_t index, PriceBound side) {
+    return side == PriceBound::kLower ? lowerBoundText(kTimberCategoryCaptions[index])
+                                      : upperBoundText(kTimberCategoryCaptions[index]);
+}
+
+/// The price-class lookup: finds the class of `meanTreeVolume` (m³ per tree)
+/// from the captions in ascending order, reading each bound with
+/// `read(index, side)` (std::optional<double>, empty when the text does not
+/// convert) only when the walk needs it. Class 0 when its upper bound is ≥ the
+/// volume (zero and negative volumes too), class 1 to 11 when lower bound ≤
+/// volume ≤ upper bound (the upper bound read only when the lower one holds),
+/// class 12 for everything else, including volumes that fall in the 0.001
+/// gaps between two classes (0.0745 is class 12, the top price); the caption
+/// of class 12 is never read. A bound that does not convert ends the walk with
+/// class 0 and the statement number of that conversion.
+template <typename ReadBound>
+PriceClassWalk walkPriceClasses(double meanTreeVolume, ReadBound &&read) {
+    PriceClassWalk walk;
+    constexpr std::size_t lastClass = kPriceClassCount - 1;
+    for (std::size_t i = 0; i < lastClass; ++i) {
+        if (i > 0) {
+            const auto lower = read(i, PriceBound::kLower);
+            if (!lower) {
+                walk.failedLine = kLowerBound;
+                return walk;
+            }
+            if (!(*lower <= meanTreeVolume)) {
+                continue;
+            }
+        }
+        const auto upper = read(i, PriceBound::kUpper);
+        if (!upper) {
+            walk.failedLine = i == 0 ? kFirstUpperBound : kUpperBound;
+            return walk;
+        }
+        if (*upper >= meanTreeVolume) {
+            walk.priceClass = static_cast<int>(i);
+            return walk;
+        }
+    }
+    walk.priceClass = static_cast<int>(lastClass);
+    return walk;
+}
+
+/// Price class 0 to 12 of a mean tree volume (m³ per tree) by walkPriceClasses,
+/// the bounds read in the C notation whatever the user's locale (so no bound
+/// fails).
 int priceClassOf(double meanTreeVolume);
 
 } // namespace arbolex::rotation

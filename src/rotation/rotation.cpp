@@ -1,13 +1,15 @@
 #include "rotation/rotation.hpp"
 
 #include "engine/vectorstate.hpp"
+#include "format/displayformat.hpp"
+#include "rotation/growcommand.hpp"
 #include "rotation/optimiser.hpp"
+#include "rotation/standchecks.hpp"
 #include "rotation/yieldclass.hpp"
 #include "valuation/discounting.hpp"
 
 #include <algorithm>
 #include <cmath>
-#include <cstdio>
 #include <limits>
 
 namespace arbolex::rotation {
@@ -16,13 +18,6 @@ namespace {
 
 std::string ageText(int age) {
     return std::to_string(age);
-}
-
-/// Volume, m³, written with two decimals as the thinning window shows it.
-std::string volumeText(float volume) {
-    char text[32];
-    std::snprintf(text, sizeof text, "%.2f", static_cast<double>(volume));
-    return text;
 }
 
 /// Last thinning age the regime names below `ageLimit`, or std::nullopt.
@@ -43,12 +38,6 @@ double meanTree(float volume, float stocking) {
     return trees > 0.0 ? double{volume} / trees : 0.0;
 }
 
-/// The final cut's mean tree as the projection table shows it, to the litre:
-/// its price class is read from that figure.
-double shownMeanTree(float volume, float stocking) {
-    return std::round(meanTree(volume, stocking) * 1000.0) / 1000.0;
-}
-
 /// Stand volume removed by the thinnings before `age`, m³/ha.
 double removedBefore(const GrowthPath &path, int age) {
     double removed = 0.0;
@@ -64,25 +53,36 @@ double meanAnnualIncrement(const GrowthPath &path, int age) {
     return age > 0 ? (double{path.at(age).volume} + removedBefore(path, age)) / age : 0.0;
 }
 
-/// Cash flow by age 0..rotation and the harvests valued at `economics.prices`.
+/// Cash flow by age 0..rotation: timber revenue, other revenues, costs and
+/// their net.
 struct Flows {
     std::vector<double> revenue;
+    std::vector<double> other;
     std::vector<double> cost;
     std::vector<double> net;
 };
 
 Flows cashFlows(const std::vector<Harvest> &harvests, int rotation, const Economics &economics) {
     const auto years = static_cast<std::size_t>(rotation) + 1;
-    Flows f{std::vector<double>(years, 0.0), std::vector<double>(years, 0.0), {}};
+    Flows f{std::vector<double>(years, 0.0), std::vector<double>(years, 0.0),
+            std::vector<double>(years, 0.0), std::vector<double>(years, 0.0)};
     for (std::size_t a = 0; a < years; ++a) {
         f.cost[a] = a == 0 ? economics.establishmentCost : economics.annualCost;
+    }
+    // An entry counts in every rotation that reaches its age.
+    for (const CashFlowEntry &e : economics.entries) {
+        if (e.age >= 0 && e.age <= rotation) {
+            const auto a = static_cast<std::size_t>(e.age);
+            f.cost[a] += e.cost;
+            f.other[a] += e.otherRevenue;
+        }
     }
     for (const Harvest &h : harvests) {
         f.revenue[static_cast<std::size_t>(h.age)] += h.revenue;
     }
-    f.net.resize(years);
+    // Revenues first, then the costs, as the cash-flow window sums a year.
     for (std::size_t a = 0; a < years; ++a) {
-        f.net[a] = f.revenue[a] - f.cost[a];
+        f.net[a] = f.revenue[a] + f.other[a] - f.cost[a];
     }
     return f;
 }
@@ -108,10 +108,12 @@ Figures figures(const Flows &f, int presentAge, double ratePercent) {
 }
 
 /// Values `h` as `economics` says; valued by assortments, the harvest is
-/// first divided into its classes unless it was `divided` before.
-void price(Harvest &h, const GrowthPath &path, const Economics &economics, bool divided) {
+/// first divided into its classes by `volumeRatio` unless it was `divided`
+/// before.
+void price(Harvest &h, const engine::VolumeRatioCoefficients &volumeRatio,
+           const Economics &economics, bool divided) {
     if (economics.valuation == Valuation::kAssortments && !divided) {
-        h.assortments = divideHarvest(h.volume, h.basalArea, h.stocking, path.volumeRatio);
+        h.assortments = divideHarvest(h.volume, h.basalArea, h.stocking, volumeRatio);
     }
     h.revenue = harvestRevenue(h, economics);
 }
@@ -123,23 +125,48 @@ std::vector<Harvest> harvests(const GrowthPath &path, int rotation, const Econom
     for (const Harvest &t : path.thinnings) {
         if (t.age < rotation) {
             all.push_back(t);
-            price(all.back(), path, economics, path.thinningsDivided);
+            price(all.back(), path.volumeRatio, economics, path.thinningsDivided);
         }
     }
-    const engine::StandState &s = path.at(rotation);
-    finalCut = {};
-    finalCut.age = rotation;
-    finalCut.volume = s.volume;
-    finalCut.stocking = s.stocking;
-    finalCut.basalArea = s.basalArea;
-    finalCut.meanTreeVolume = shownMeanTree(s.volume, s.stocking);
-    finalCut.priceClass = priceClassOf(finalCut.meanTreeVolume);
-    price(finalCut, path, economics, false);
+    finalCut = finalCutHarvest(rotation, path.at(rotation));
+    price(finalCut, path.volumeRatio, economics, false);
     all.push_back(finalCut);
     return all;
 }
 
 } // namespace
+
+double removedMeanTree(float removedVolume, float removedStocking) {
+    return removedVolume > 0.0f ? meanTree(removedVolume, std::fabs(removedStocking)) : 0.0;
+}
+
+double felledMeanTree(float volume, float stocking) {
+    return volume > 0.0f ? format::shownValue(meanTree(volume, stocking), kMeanTreeCell) : 0.0;
+}
+
+Harvest thinningHarvest(int age, float volume, float stocking, float basalArea,
+                        const engine::StandState &residual) {
+    Harvest t;
+    t.age = age;
+    t.volume = volume;
+    t.stocking = stocking;
+    t.basalArea = basalArea;
+    t.meanTreeVolume = removedMeanTree(volume, stocking);
+    t.priceClass = priceClassOf(t.meanTreeVolume);
+    t.residual = residual;
+    return t;
+}
+
+Harvest finalCutHarvest(int age, const engine::StandState &crop) {
+    Harvest finalCut;
+    finalCut.age = age;
+    finalCut.volume = crop.volume;
+    finalCut.stocking = crop.stocking;
+    finalCut.basalArea = crop.basalArea;
+    finalCut.meanTreeVolume = felledMeanTree(crop.volume, crop.stocking);
+    finalCut.priceClass = priceClassOf(finalCut.meanTreeVolume);
+    return finalCut;
+}
 
 double harvestRevenue(const Harvest &harvest, const Economics &economics, double volumeFactor) {
     if (economics.valuation == Valuation::kAssortments) {
@@ -184,6 +211,10 @@ std::optional<std::string> rotationProblem(const GrowthPath &path, const Regime 
         return "the rotation (age " + ageText(rotation) + ") is past the model's age limit " +
                ageText(path.ageLimit);
     }
+    if (rotation > path.lastAge() && path.stop && !path.stop->text.empty()) {
+        // The window refuses to go on where the path stops.
+        return path.stop->text;
+    }
     if (rotation < path.presentAge || rotation < 1) {
         return "the rotation (age " + ageText(rotation) + ") is before the present age " +
                ageText(path.presentAge);
@@ -203,112 +234,159 @@ std::optional<std::string> rotationProblem(const GrowthPath &path, const Regime 
     return std::nullopt;
 }
 
+namespace {
+
+/// The engine's reports passed on as they are, the text of the last message
+/// kept: a rotation refused because the engine failed says what the window
+/// would have shown.
+class KeepingLastMessage : public engine::IEngineReport {
+public:
+    explicit KeepingLastMessage(engine::Grow &grow) : m_grow(grow), m_next(grow.report()) {
+        m_grow.setReport(this);
+    }
+    ~KeepingLastMessage() override { m_grow.setReport(m_next); }
+    KeepingLastMessage(const KeepingLastMessage &) = delete;
+    KeepingLastMessage &operator=(const KeepingLastMessage &) = delete;
+
+    void showMessage(std::string_view title, std::string_view text, int style) override {
+        m_last = text;
+        if (m_next != nullptr) {
+            m_next->showMessage(title, text, style);
+        }
+    }
+    void logError(std::string_view message) override {
+        if (m_last.empty()) {
+            m_last = message;
+        }
+        if (m_next != nullptr) {
+            m_next->logError(message);
+        }
+    }
+    /// The last message, or `otherwise` when the engine showed none.
+    std::string lastOr(std::string_view otherwise) const {
+        return m_last.empty() ? std::string(otherwise) : m_last;
+    }
+
+private:
+    engine::Grow &m_grow;
+    engine::IEngineReport *m_next;
+    std::string m_last;
+};
+
+} // namespace
+
 std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const Regime &regime,
                                    GrowthFailure &failure, const ThinningLimits *limits,
                                    std::optional<int> finalCut) {
     engine::clearUpperVectorState();
+    KeepingLastMessage messages(grow);
     const unsigned faultsBefore = grow.faultCount();
-    auto engineFailed = [&](std::string text) {
-        failure = {false, std::move(text)};
+    const auto engineFailed = [&](std::string_view text) {
+        failure = {false, messages.lastOr(text)};
         return std::nullopt;
     };
+    // The model chosen with the stand's site index in force, as the window
+    // does when the model is chosen again after the stand is typed: the
+    // correction factor follows the site index current at selection.
     grow.GetModel(stand.model);
-    // The correction factor follows the site index current at selection.
+    grow.SiteIndex(stand.age, stand.height);
     grow.GetVCF();
     GrowthPath path;
     path.ageLimit = modelAgeLimit(stand.model);
-    if (!grow.SiteIndex(stand.age, stand.height) || grow.faultCount() != faultsBefore) {
-        return engineFailed("the site index of the stand could not be computed");
-    }
-    float siteIndex = grow.siteIndex();
-    path.siteIndex = siteIndex;
     path.volumeRatio = grow.volumeRatio();
-    grow.TM(siteIndex);
-    float age = stand.age;
-    float basalArea = stand.basalArea;
-    float stocking = stand.stocking;
-    float height = stand.height;
-    auto target = static_cast<float>(path.ageLimit);
-    grow.STATEYR(age, basalArea, stocking, height, target, siteIndex);
-    path.presentAge = static_cast<int>(age);
-    if (path.presentAge > path.ageLimit) {
-        failure = {true, "the stand (age " + ageText(path.presentAge) +
+    if (auto fault = standFault(stand, grow.maxTopHeight())) {
+        failure = {true, std::move(*fault)};
+        return std::nullopt;
+    }
+    const auto presentAge = static_cast<int>(std::nearbyint(stand.age));
+    if (presentAge > path.ageLimit) {
+        failure = {true, "the stand (age " + ageText(presentAge) +
                              ") is past the model's age limit " + ageText(path.ageLimit)};
         return std::nullopt;
     }
-    if (const auto problem = regimeProblem(regime, path.presentAge, path.ageLimit)) {
+    if (const auto problem = regimeProblem(regime, presentAge, path.ageLimit)) {
         failure = {true, *problem};
         return std::nullopt;
     }
-    if (regime.thins() && grow.T(1) == 0.0) {
+    if (regime.thins() && !grow.isThinnedModel()) {
         failure = {true, "model " + ageText(stand.model) + " (" + grow.label() +
                              ") has no thinning response: it cannot be thinned"};
         return std::nullopt;
     }
-    path.years.push_back(
-        {age, basalArea, stocking, height, grow.GetV7(basalArea, stocking, height)});
 
     const int growTo = finalCut ? std::min(*finalCut, path.ageLimit) : path.ageLimit;
     const std::optional<int> lastThinning = lastThinningAge(regime, growTo);
     int nextThinning = regime.thinFrom;
-    // Where growth goes on from: the last state recorded, or the stand just
-    // thinned (the record of a thinning age keeps the crop before it).
-    engine::StandState current = path.years.back();
-    std::vector<engine::StandState> states;
+    // Each press of Grow: from its stand (the typed one, then each thinned
+    // one, exact as the table keeps it) to the next thinning or the end.
+    engine::StandState from{stand.age, stand.basalArea, stand.stocking, stand.height, 0.0f};
+    bool first = true;
     while (true) {
         const bool thinning = lastThinning && nextThinning <= *lastThinning;
-        const int stop = thinning ? nextThinning : growTo;
-        if (stop > static_cast<int>(current.age)) {
-            states.clear();
-            if (!grow.PROJ(current.age, current.basalArea, current.stocking, current.topHeight,
-                           static_cast<float>(stop), 1.0f, states) ||
-                grow.faultCount() != faultsBefore) {
-                return engineFailed("the projection to age " + ageText(stop) +
-                                    " could not be completed");
+        const int target = thinning ? nextThinning : growTo;
+        if (!first) {
+            // The window checks what its fields show of the thinned stand.
+            if (auto fault = growFromFault(shownGrowFrom(from, static_cast<float>(target)),
+                                           grow.maxTopHeight(), path.ageLimit)) {
+                path.stop = GrowthPath::Stop{static_cast<int>(from.age), std::move(fault->text)};
+                break;
             }
-            // The first state is where the projection started from.
-            path.years.insert(path.years.end(), states.begin() + 1, states.end());
-            current = path.years.back();
         }
+        Growth growth = growStand(grow, from.age, from.basalArea, from.stocking, from.topHeight,
+                                  static_cast<float>(target), 1.0f);
+        if (!growth.projected || grow.faultCount() != faultsBefore) {
+            return engineFailed(standtext::kProjectionFailed);
+        }
+        if (first) {
+            path.presentAge = static_cast<int>(growth.age);
+            path.siteIndex = growth.siteIndex;
+            path.years.push_back(growth.states.front());
+            first = false;
+        }
+        // The first state is where the projection started from.
+        path.years.insert(path.years.end(), growth.states.begin() + 1, growth.states.end());
         if (!thinning) {
             break;
         }
+        const engine::StandState pre = path.years.back();
         if (limits != nullptr &&
-            double{regime.thinVolume} > limits->maxRemovalShare * double{current.volume}) {
+            double{regime.thinVolume} > limits->maxRemovalShare * double{pre.volume}) {
+            path.stop = GrowthPath::Stop{target, {}, true};
             break;
         }
-        const float residualVolume = current.volume - regime.thinVolume;
-        if (!(residualVolume > 0.0f)) {
-            failure = {true, "the thinning at age " + ageText(stop) + " removes " +
-                                 volumeText(regime.thinVolume) + " m3/ha of the " +
-                                 volumeText(current.volume) + " m3/ha standing"};
-            return std::nullopt;
-        }
-        float residualStocking = 0.0f;
-        float residualBasalArea = 0.0f;
-        if (!grow.NEWTON(current.stocking, current.basalArea, current.topHeight, residualVolume,
-                         residualStocking, residualBasalArea) ||
-            grow.faultCount() != faultsBefore || !(residualStocking > 0.0f) ||
-            !(residualBasalArea > 0.0f)) {
-            return engineFailed("the thinning response could not remove " +
-                                volumeText(regime.thinVolume) + " m3/ha at age " + ageText(stop));
-        }
-        if (limits != nullptr && residualStocking < limits->minStocking) {
+        const VolumeThinningStep step = thinByVolume(grow, pre, double{regime.thinVolume});
+        if (step.thinned.outcome == engine::VolumeThinningOutcome::kSolverFailed ||
+            grow.faultCount() != faultsBefore) {
+            path.stop = GrowthPath::Stop{target, messages.lastOr(standtext::kProjectionFailed)};
             break;
         }
-        Harvest t;
-        t.age = stop;
-        t.volume = current.volume - residualVolume;
-        t.stocking = current.stocking - residualStocking;
-        t.basalArea = current.basalArea - residualBasalArea;
-        t.meanTreeVolume = meanTree(t.volume, t.stocking);
-        t.priceClass = priceClassOf(t.meanTreeVolume);
+        if (step.refusal) {
+            path.stop = GrowthPath::Stop{target, *step.refusal};
+            break;
+        }
+        if (limits != nullptr && step.thinned.stocking < limits->minStocking) {
+            path.stop = GrowthPath::Stop{target, {}, true};
+            break;
+        }
+        const Harvest t = thinningHarvest(target, std::fabs(pre.volume - step.thinned.volume),
+                                          pre.stocking - step.thinned.stocking,
+                                          pre.basalArea - step.thinned.basalArea,
+                                          {pre.age, step.thinned.basalArea, step.thinned.stocking,
+                                           pre.topHeight, step.thinned.volume});
         path.thinnings.push_back(t);
-        current = {current.age, residualBasalArea, residualStocking, current.topHeight,
-                   residualVolume};
+        from = t.residual;
         nextThinning += regime.thinEvery;
     }
     return path;
+}
+
+int pathYieldClass(const GrowthPath &path) {
+    std::vector<double> mai;
+    mai.reserve(path.years.size());
+    for (int a = path.presentAge; a <= path.lastAge(); ++a) {
+        mai.push_back(meanAnnualIncrement(path, a));
+    }
+    return yieldClass(mai);
 }
 
 void divideThinnings(GrowthPath &path) {
@@ -319,26 +397,45 @@ void divideThinnings(GrowthPath &path) {
     path.thinningsDivided = true;
 }
 
-RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics,
+RotationHarvests rotationHarvests(const GrowthPath &path, int rotation) {
+    RotationHarvests h;
+    h.presentAge = path.presentAge;
+    h.rotation = rotation;
+    h.volumeRatio = path.volumeRatio;
+    h.thinningsDivided = path.thinningsDivided;
+    for (const Harvest &t : path.thinnings) {
+        if (t.age < rotation) {
+            h.thinnings.push_back(t);
+        }
+    }
+    h.finalCut = finalCutHarvest(rotation, path.at(rotation));
+    return h;
+}
+
+RotationValue valueHarvests(const RotationHarvests &harvests, const Economics &economics,
                             Appraisal appraisal) {
     engine::clearUpperVectorState();
     RotationValue v;
+    const int rotation = harvests.rotation;
     v.rotation = rotation;
-    std::vector<Harvest> all = harvests(path, rotation, economics, v.finalCut);
-    v.thinnings.assign(all.begin(), all.end() - 1);
+    v.thinnings = harvests.thinnings;
+    double removed = 0.0;
+    for (Harvest &t : v.thinnings) {
+        price(t, harvests.volumeRatio, economics, harvests.thinningsDivided);
+        removed += double{t.volume};
+    }
+    v.finalCut = harvests.finalCut;
+    price(v.finalCut, harvests.volumeRatio, economics, false);
+    std::vector<Harvest> all = v.thinnings;
+    all.push_back(v.finalCut);
     const Flows f = cashFlows(all, rotation, economics);
     for (int a = 0; a <= rotation; ++a) {
         const auto i = static_cast<std::size_t>(a);
-        v.cashflow.push_back({a, f.cost[i], f.revenue[i]});
+        v.cashflow.push_back({a, f.cost[i], f.revenue[i], f.other[i]});
     }
-    v.mai = meanAnnualIncrement(path, rotation);
-    std::vector<double> mai;
-    for (int a = path.presentAge; a <= rotation; ++a) {
-        mai.push_back(meanAnnualIncrement(path, a));
-    }
-    v.maxMai = mai.empty() ? 0.0 : *std::max_element(mai.begin(), mai.end());
-    v.yieldClass = yieldClass(mai);
-    const Figures fig = figures(f, path.presentAge, economics.ratePercent);
+    // Total production: the crop felled and everything thinned before it.
+    v.mai = rotation > 0 ? (double{v.finalCut.volume} + removed) / rotation : 0.0;
+    const Figures fig = figures(f, harvests.presentAge, economics.ratePercent);
     v.npv = fig.npv;
     v.lev = fig.lev;
     v.forestValue = fig.forestValue;
@@ -349,8 +446,26 @@ RotationValue valueRotation(const GrowthPath &path, int rotation, const Economic
         return v;
     }
     v.irr = valuation::internalRateOfReturn(f.net);
+    // Other revenues do not follow timber prices: they lower the costs the
+    // timber must pay for.
+    std::vector<double> netCost(f.cost.size());
+    for (std::size_t a = 0; a < netCost.size(); ++a) {
+        netCost[a] = f.cost[a] - f.other[a];
+    }
     v.breakEvenPriceFactor =
-        valuation::breakEvenPriceFactor(f.revenue, f.cost, economics.ratePercent);
+        valuation::breakEvenPriceFactor(f.revenue, netCost, economics.ratePercent);
+    return v;
+}
+
+RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics,
+                            Appraisal appraisal) {
+    RotationValue v = valueHarvests(rotationHarvests(path, rotation), economics, appraisal);
+    std::vector<double> mai;
+    for (int a = path.presentAge; a <= rotation; ++a) {
+        mai.push_back(meanAnnualIncrement(path, a));
+    }
+    v.maxMai = mai.empty() ? 0.0 : *std::max_element(mai.begin(), mai.end());
+    v.yieldClass = yieldClass(mai);
     return v;
 }
 
@@ -392,6 +507,11 @@ RotationChoice chooseRotation(const GrowthPath &path, const Regime &regime,
                               const Economics &economics, std::optional<int> rotation) {
     RotationChoice choice;
     choice.age = rotation ? *rotation : exploreRotations(path, regime, economics).economicRotation;
+    if (!rotation && choice.age == 0 && path.stop && !path.stop->text.empty()) {
+        // No rotation to value: the window refuses the regime before any.
+        choice.problem = path.stop->text;
+        return choice;
+    }
     choice.problem = rotationProblem(path, regime, choice.age);
     return choice;
 }

@@ -14,6 +14,7 @@
 #include <cstdint>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace arbolex::rotation {
@@ -58,11 +59,23 @@ enum class Valuation {
     kAssortments,
 };
 
+/// A cost and a revenue other than timber at one age, euro/ha: an entry of the
+/// cash flow the user typed for the work.
+struct CashFlowEntry {
+    /// Age, years.
+    int age = 0;
+    double cost = 0.0;
+    double otherRevenue = 0.0;
+
+    bool operator==(const CashFlowEntry &) const = default;
+};
+
 /// What the money of a rotation is counted with.
 struct Economics {
     /// Interest rate, percent.
     double ratePercent = 0.0;
-    /// Cost of establishment, euro/ha, at age 0.
+    /// Cost of establishment, euro/ha, at age 0 (planting): it counts in the
+    /// figures of bare land, never in the value of the stand standing today.
     double establishmentCost = 0.0;
     /// Yearly cost, euro/ha, at every age from 1 to the final cut.
     double annualCost = 0.0;
@@ -71,6 +84,9 @@ struct Economics {
     Valuation valuation = Valuation::kStandingPrice;
     /// Prices of the top-diameter classes, euro/m³, when valued by assortments.
     AssortmentPriceList assortmentPrices{};
+    /// Further costs and other revenues by age; an entry counts in every
+    /// rotation that reaches its age.
+    std::vector<CashFlowEntry> entries{};
 };
 
 /// A thinning or the final cut, per hectare.
@@ -93,7 +109,32 @@ struct Harvest {
     /// Revenue, euro/ha: volume × standing price of the mean tree's class, or
     /// the sum of the classes' volumes × their prices.
     double revenue = 0.0;
+    /// The stand a thinning leaves (the record of its row in the table); the
+    /// final cut leaves none.
+    engine::StandState residual{};
 };
+
+/// Pattern of a mean tree volume in the projection table, m³.
+inline constexpr std::string_view kMeanTreeCell = "#0.000";
+
+/// Mean tree of a thinning's removal, m³: the volume removed over the whole
+/// number of stems removed; 0 without stems or without volume.
+double removedMeanTree(float removedVolume, float removedStocking);
+
+/// Mean tree of a felled crop as the table shows it (its volume over its whole
+/// number of stems, in kMeanTreeCell), read back: the final cut's price class
+/// is read from that figure. 0 without stems or without volume.
+double felledMeanTree(float volume, float stocking);
+
+/// A thinning at `age` that removes `volume` (m³/ha), `stocking` (stems/ha)
+/// and `basalArea` (m²/ha) and leaves `residual`: its mean tree and price
+/// class, not yet valued.
+Harvest thinningHarvest(int age, float volume, float stocking, float basalArea,
+                        const engine::StandState &residual);
+
+/// The final cut at `age` of the standing crop `crop`: its mean tree as the
+/// table shows it and its price class, not yet valued.
+Harvest finalCutHarvest(int age, const engine::StandState &crop);
 
 /// Revenue of `harvest`, euro/ha, valued as `economics` says, with its volume
 /// and mean tree times `volumeFactor` (at the same stems, so the mean tree may
@@ -121,6 +162,15 @@ struct GrowthPath {
     std::vector<Harvest> thinnings;
     /// True once divideThinnings has divided the thinnings into assortments.
     bool thinningsDivided = false;
+    /// Why the path ends before the age it was grown to, when it does: the
+    /// window refuses to go on from there (a thinning, or the grow from the
+    /// thinned stand) with `text`, or the optimiser's limits stop it.
+    struct Stop {
+        int age = 0;
+        std::string text;
+        bool byLimits = false;
+    };
+    std::optional<Stop> stop;
 
     /// Last age grown, years: the age limit, or the age of a thinning the
     /// limits did not allow.
@@ -157,20 +207,33 @@ struct ThinningLimits {
     float minStocking = 0.0f;
 };
 
-/// Grows `stand` under `regime` to the model's age limit with `grow` (the
-/// model is made active with its volume correction factor and the site index
-/// computed, as the model menu and the grow command do). Each thinning is the
-/// thinning window's volume method: the residual volume is the standing
-/// volume less `thinVolume`, and NEWTON gives the residual basal area and
-/// stocking. With `limits`, the path ends at the first thinning they do not
-/// allow (its crop recorded, the thinning not made). With `finalCut`, the
-/// path ends at that age (the age limit still bounds it): enough for the one
-/// rotation felled there, and no thinning after it can stop the path; the
-/// explorer needs a path grown to the limit. Returns std::nullopt and fills
-/// `failure` when it cannot.
+/// Grows `stand` under `regime` to the model's age limit with `grow`, as the
+/// main window does when the regime is typed into it: the model chosen with
+/// the stand's site index in force (so its volume correction factor is the
+/// window's), the stand grown by one-year steps to the first thinning, each
+/// thinning the thinning window's volume method (the volume removal checked
+/// against the volume the window shows, then Grow::thinToVolume), and the
+/// thinned stand grown on to the next one. Every stand the window grows from
+/// passes the grow command's range checks on what its fields show
+/// (shownGrowFrom); every projection starts with the site index of its stand
+/// and age, as each press of Grow does. A thinning or a grow the window would
+/// refuse ends the path there (`stop`, with the window's message); a
+/// rotation past it is refused with that message. With `limits`, the path
+/// also ends at the first thinning they do not allow (its crop recorded, the
+/// thinning not made). With `finalCut`, the path ends at that age (the age
+/// limit still bounds it): enough for the one rotation felled there, and no
+/// thinning after it can stop the path; the explorer needs a path grown to
+/// the limit. Returns std::nullopt and fills `failure` when the stand itself
+/// is refused or the engine fails.
 std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const Regime &regime,
                                    GrowthFailure &failure, const ThinningLimits *limits = nullptr,
                                    std::optional<int> finalCut = std::nullopt);
+
+/// Yield class of the stand over its whole path (grown to the model's age
+/// limit, or to where the window stops), as the window shows it after growing
+/// the stand under its regime by one-year steps that far: 0 only when the
+/// mean annual increment never culminates on the path.
+int pathYieldClass(const GrowthPath &path);
 
 /// Divides the thinnings of `path` into their assortments once, so that
 /// valuing its rotations by assortments reads them instead of dividing them
@@ -180,9 +243,34 @@ void divideThinnings(GrowthPath &path);
 /// One year of the cash flow of a rotation from bare land, euro/ha.
 struct CashFlowYear {
     int age = 0;
+    /// The establishment or yearly cost and the entries' costs of the age.
     double cost = 0.0;
+    /// Timber revenue: what the harvests of the age earn.
     double revenue = 0.0;
+    /// The entries' other revenues of the age.
+    double otherRevenue = 0.0;
 };
+
+/// The harvests of one rotation, before any money is counted: the thinnings
+/// and the final cut of a grown path, or those of a projection table.
+struct RotationHarvests {
+    /// Present age, years: the value of the stand today counts from here.
+    int presentAge = 0;
+    /// Final-cut age, years.
+    int rotation = 0;
+    /// The thinnings, oldest first, none after the final cut.
+    std::vector<Harvest> thinnings;
+    Harvest finalCut;
+    /// The model's volume-ratio function, which divides a harvest into
+    /// assortments.
+    engine::VolumeRatioCoefficients volumeRatio{};
+    /// True when the thinnings are divided into assortments already.
+    bool thinningsDivided = false;
+};
+
+/// The harvests of the rotation felled at `rotation` on `path`: the thinnings
+/// before it and the whole standing crop at it.
+RotationHarvests rotationHarvests(const GrowthPath &path, int rotation);
 
 /// A rotation valued.
 struct RotationValue {
@@ -227,8 +315,16 @@ enum class Appraisal {
     kWithoutRates,
 };
 
+/// Values `harvests` and the cash flow of `economics`: every harvest at its
+/// price, the costs and other revenues by age, and the figures. The MAI at
+/// the final cut comes from the harvests; the largest MAI and the yield class,
+/// which need the stand of every year, are left 0.
+RotationValue valueHarvests(const RotationHarvests &harvests, const Economics &economics,
+                            Appraisal appraisal = Appraisal::kFull);
+
 /// Values the rotation that ends with the final cut at `rotation` (checked
-/// with rotationProblem beforehand).
+/// with rotationProblem beforehand): valueHarvests of its harvests, with the
+/// largest MAI and the yield class of the path.
 RotationValue valueRotation(const GrowthPath &path, int rotation, const Economics &economics,
                             Appraisal appraisal = Appraisal::kFull);
 

@@ -20,11 +20,12 @@ public:
         std::optional<double> lev;
     };
 
-    Flows(const GrowthPath &path, int rotation, const Economics &economics)
-        : m_presentAge(path.presentAge), m_economics(economics) {
-        const RotationValue v = valueRotation(path, rotation, economics);
+    Flows(const RotationHarvests &harvests, const Economics &economics)
+        : m_presentAge(harvests.presentAge), m_economics(economics) {
+        const RotationValue v = valueHarvests(harvests, economics, Appraisal::kWithoutRates);
         for (const CashFlowYear &c : v.cashflow) {
             m_revenue.push_back(c.revenue);
+            m_other.push_back(c.otherRevenue);
             m_cost.push_back(c.cost);
         }
         m_harvests = v.thinnings;
@@ -43,7 +44,8 @@ public:
         return revenue;
     }
 
-    /// NPV and LEV with the revenue times `revenueFactor`, the costs times
+    /// NPV and LEV with the timber revenue times `revenueFactor` (other
+    /// revenues do not follow timber prices), the costs times
     /// `costFactor`, at `ratePercent`.
     Value value(double revenueFactor, double costFactor, double ratePercent) {
         return value(m_revenue, revenueFactor, costFactor, ratePercent);
@@ -53,7 +55,7 @@ public:
     Value value(const std::vector<double> &revenue, double revenueFactor, double costFactor,
                 double ratePercent) {
         for (std::size_t a = 0; a < m_net.size(); ++a) {
-            m_net[a] = revenueFactor * revenue[a] - costFactor * m_cost[a];
+            m_net[a] = revenueFactor * revenue[a] + m_other[a] - costFactor * m_cost[a];
         }
         const std::vector<double> fromPresent(m_net.begin() + m_presentAge, m_net.end());
         return {valuation::netPresentValue(fromPresent, ratePercent),
@@ -65,6 +67,7 @@ private:
     Economics m_economics;
     std::vector<Harvest> m_harvests;
     std::vector<double> m_revenue;
+    std::vector<double> m_other;
     std::vector<double> m_cost;
     std::vector<double> m_net;
 };
@@ -100,8 +103,12 @@ Percentiles percentiles(std::vector<double> values) {
 } // namespace
 
 std::vector<TornadoBar> tornado(const GrowthPath &path, int rotation, const Economics &economics) {
+    return tornado(rotationHarvests(path, rotation), economics);
+}
+
+std::vector<TornadoBar> tornado(const RotationHarvests &harvests, const Economics &economics) {
     engine::clearUpperVectorState();
-    Flows flows(path, rotation, economics);
+    Flows flows(harvests, economics);
     const double r = economics.ratePercent;
     struct Move {
         const char *factor;
@@ -125,8 +132,13 @@ std::vector<TornadoBar> tornado(const GrowthPath &path, int rotation, const Econ
 
 MonteCarloResult monteCarlo(const GrowthPath &path, int rotation, const Economics &economics,
                             const MonteCarloSettings &settings) {
+    return monteCarlo(rotationHarvests(path, rotation), economics, settings);
+}
+
+MonteCarloResult monteCarlo(const RotationHarvests &harvests, const Economics &economics,
+                            const MonteCarloSettings &settings) {
     engine::clearUpperVectorState();
-    Flows flows(path, rotation, economics);
+    Flows flows(harvests, economics);
     std::mt19937_64 engine(settings.seed);
     std::vector<double> npv;
     std::vector<double> lev;

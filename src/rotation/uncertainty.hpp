@@ -28,6 +28,8 @@ struct TornadoBar {
 /// every harvest's volume and mean tree in proportion (the stems stay), so a
 /// mean tree may change its price class.
 std::vector<TornadoBar> tornado(const GrowthPath &path, int rotation, const Economics &economics);
+/// The same for `harvests` (the rotation of a projection table).
+std::vector<TornadoBar> tornado(const RotationHarvests &harvests, const Economics &economics);
 
 struct MonteCarloSettings {
     int draws = 10000;
@@ -65,6 +67,9 @@ struct MonteCarloResult {
 /// `settings.draws` times; the same seed gives the same result on every
 /// platform (the generator and the distributions are written out here).
 MonteCarloResult monteCarlo(const GrowthPath &path, int rotation, const Economics &economics,
+                            const MonteCarloSettings &settings);
+/// The same for `harvests` (the rotation of a projection table).
+MonteCarloResult monteCarlo(const RotationHarvests &harvests, const Economics &economics,
                             const MonteCarloSettings &settings);
 
 } // namespace arbolex::rotation

@@ -1,8 +1,7 @@
-// Accepting a thinning: the thinning record, the thinning row of the
-// projection table, its value, and the thinned stand as the new grow-from.
+// Accepting a thinning: the thinning record, the thinning row the work writes
+// from it, and the thinned stand as the new grow-from.
 #include "assortments/assortwindowlogic.hpp"
-#include "economics/pricelookup.hpp"
-#include "economics/prices.hpp"
+#include "rotation/standmath.hpp"
 #include "shell/apperror.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/interactive.hpp"
@@ -10,49 +9,38 @@
 #include "shell/vbtext.hpp"
 #include "thinning/thinmessages.hpp"
 #include "thinning/thinwindowlogic.hpp"
+#include "work/standwork.hpp"
+#include "work/worktexts.hpp"
 #include "workflow/mainmessages.hpp"
-#include "workflow/mainwindowlogic.hpp"
-#include "workflow/standmath.hpp"
-
-#include <QLocale>
 
 #include <cmath>
 
 namespace arbolex::thinning {
 
 using shell::formatNumber;
-using workflow::Column;
-using workflow::MainControl;
-
-namespace {
-
-QString wholeText(double value) {
-    return QString::number(static_cast<qint64>(std::nearbyint(value)));
-}
-
-} // namespace
+using work::WorkField;
 
 void ThinWindowLogic::cmdAccept_Click() {
     try {
-        workflow::ProjectionTable &table = m_main.tableForThinning();
+        const work::ProjectionTable &table = m_standWork.table();
         const int row = table.currentRow();
         if (row < 1) {
             return;
         }
-        const workflow::TableRow &current = table.row(row);
+        const work::TableRow &current = table.row(row);
         const ThinningWork &w = m_work;
         const bool nothingRemoved = !w.previewed || w.preBasalArea == w.postBasalArea;
         if (current.isGrowth() && !m_flags.editingExisting && nothingRemoved) {
             // Nothing removed: no thinning is stored.
-            m_main.SetGrowFrom(0.0f, w.preBasalArea, w.preStocking, w.topHeight, 0.0f, -1.0f);
+            m_standWork.SetGrowFrom(0.0f, w.preBasalArea, w.preStocking, w.topHeight, 0.0f, -1.0f);
             if (!m_flags.loopUnderWay) {
                 m_view.close();
             }
             return;
         }
-        m_main.SetGrowFrom(0.0f, w.postBasalArea, w.postStocking, w.topHeight, 0.0f, -1.0f);
+        m_standWork.SetGrowFrom(0.0f, w.postBasalArea, w.postStocking, w.topHeight, 0.0f, -1.0f);
 
-        workflow::RowRecord record;
+        work::RowRecord record;
         record.age = current.record.age;
         record.topHeight = w.topHeight;
         record.basalArea = w.postBasalArea;
@@ -64,28 +52,18 @@ void ThinWindowLogic::cmdAccept_Click() {
         float postN = w.postStocking;
         record.dbh = m_flags.loopUnderWay && shell::isNumeric(m_view.text(ThinControl::lblPostD))
                          ? static_cast<float>(shell::val(m_view.text(ThinControl::lblPostD)))
-                         : workflow::truncateToTenth(workflow::dbhFromBasalArea(postB, postN));
+                         : rotation::truncateToTenth(rotation::dbhFromBasalArea(postB, postN));
         record.removedBasalArea = w.preBasalArea - w.postBasalArea;
         record.removedStocking = w.preStocking - w.postStocking;
         record.removedVolume = std::fabs(w.preVolume - w.postVolume);
         record.postDbh = record.dbh;
 
-        int thinRow = row;
-        if (m_flags.editingExisting) {
-            // A second Accept at the same age replaces the old thinning.
-            table.row(row).record = record;
-        } else {
-            workflow::TableRow thinning;
-            thinning.kind = workflow::RowKind::Thinning;
-            thinning.label = workflow::text::rowLabelThinning();
-            thinning.record = record;
-            thinRow = table.append(std::move(thinning));
-        }
-        WriteThinLine(workflow::text::rowLabelThinning(), thinRow);
+        const int thinRow = m_standWork.WriteThinLine(record, work::text::rowLabelThinning(),
+                                                      m_flags.editingExisting, m_interactive);
         if (m_assort != nullptr) {
             m_assort->appendPendingRows(w, record.age);
         }
-        table.select(thinRow, thinRow);
+        m_standWork.select(thinRow, thinRow);
         SetGrowFromAfterThin();
         if (!m_flags.loopUnderWay) {
             m_view.close();
@@ -93,121 +71,26 @@ void ThinWindowLogic::cmdAccept_Click() {
     } catch (const shell::AppFault &fault) {
         m_interactive.message(workflow::text::titleArbolex(), text::acceptFailed(),
                               shell::kExclamation);
-        m_main.errorLog().append(
+        m_standWork.errorLog().append(
             shell::windowFaultLine(fault, QStringLiteral(" in frmThin.cmdAccept_Click()")));
     }
 }
 
-void ThinWindowLogic::WriteThinLine(const QString &label, int row) {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in Misc.WriteThinLine()"), [&] {
-        workflow::ProjectionTable &table = m_main.tableForThinning();
-        workflow::TableRow &r = table.row(row);
-        const workflow::RowRecord &rec = r.record;
-        r.kind = workflow::RowKind::Thinning;
-        r.label = label;
-        r.cells = QStringList();
-        for (int c = 0; c < workflow::kColumnCount; ++c) {
-            r.cells.append(QString());
-        }
-        QStringList &cells = r.cells;
-
-        // The summary carries every thinning: its marker cell is not empty.
-        cells[workflow::kColSeparator1] = workflow::text::summaryMarker();
-
-        // Main crop: the stand after the thinning.
-        cells[workflow::kColAge] = shell::singleText(rec.age);
-        cells[workflow::kColTopHeight] = formatNumber(rec.topHeight, u"#0.0");
-        cells[workflow::kColStocking] = wholeText(rec.stocking);
-        cells[workflow::kColDbh] = formatNumber(rec.dbh, u"##0.0");
-        cells[workflow::kColBasalArea] = formatNumber(rec.basalArea, u"##0.0");
-        const double postTrees = std::nearbyint(double{rec.stocking});
-        cells[workflow::kColVolumePerTree] =
-            postTrees > 0.0 ? formatNumber(rec.volume / postTrees, u"#0.000") : QString();
-        cells[workflow::kColVolumePerHa] = formatNumber(rec.volume, u"###0");
-
-        // The removal and its value at the price of its mean tree.
-        const float removedTrees = std::fabs(rec.removedStocking);
-        const float removedBasalArea = std::fabs(rec.removedBasalArea);
-        const double roundedTrees = std::nearbyint(double{removedTrees});
-        cells[workflow::kColThinStocking] = formatNumber(removedTrees, u"###0");
-        float b = removedBasalArea;
-        float n = removedTrees;
-        cells[workflow::kColThinDbh] =
-            formatNumber(workflow::truncateToTenth(workflow::dbhFromBasalArea(b, n)), u"##0.0");
-        cells[workflow::kColThinBasalArea] = formatNumber(removedBasalArea, u"##0.0");
-        double meanTree = 0.0;
-        if (rec.removedVolume <= 0.0f) {
-            cells[workflow::kColThinVolumePerTree] = workflow::text::outOfRange();
-            cells[workflow::kColThinVolumePerHa] = workflow::text::outOfRange();
-        } else {
-            meanTree = roundedTrees > 0.0 ? rec.removedVolume / roundedTrees : 0.0;
-            cells[workflow::kColThinVolumePerTree] = formatNumber(meanTree, u"#0.000");
-            cells[workflow::kColThinVolumePerHa] = formatNumber(rec.removedVolume, u"###0");
-        }
-        economics::Prices &prices = m_main.prices();
-        const double price =
-            economics::TrouveIndicePrix(meanTree, prices.data().current, m_interactive);
-        const double valuePerHa = rec.removedVolume * price;
-        cells[workflow::kColValuePerHa] = formatNumber(valuePerHa, u"####0");
-
-        // Cumulative thinning volume and value of the sub-compartment: this
-        // removal and every earlier one, over the net area.
-        double cumulativeVolume = 0.0;
-        double cumulativeValue = 0.0;
-        for (int i = 1; i <= row; ++i) {
-            const workflow::TableRow &earlier = table.row(i);
-            if (earlier.isThinning()) {
-                cumulativeVolume += earlier.record.removedVolume;
-                cumulativeValue += i == row ? valuePerHa : earlier.removedValue;
-            }
-        }
-        const double area = m_main.netArea();
-        cells[workflow::kColThinTotalVolume] = formatNumber(cumulativeVolume * area, u"####0");
-        cells[workflow::kColThinTotalValue] = formatNumber(cumulativeValue * area, u"####0");
-
-        // Numbers: the volume before the thinning, so the next growth row's
-        // increment counts the growth since the thinning; the removal.
-        r.numbers = {};
-        r.numbers[workflow::kNumAge] = rec.age;
-        r.numbers[workflow::kNumVolume] = rec.volume + rec.removedVolume;
-        r.numbers[workflow::kNumRemovedVolume] = rec.removedVolume;
-        r.removedValue = valuePerHa;
-        m_main.fillTotalProduction(r, row);
-        m_main.writeIncrements(row, false);
-
-        // The cash flow values thinnings at long-term average prices, in the
-        // class the lookup above found (a failed lookup has already said so).
-        const int priceClass = economics::walkPriceClasses(meanTree, QLocale::system()).priceClass;
-        r.timberRevenue = rec.removedVolume *
-                          prices.data().longTermAverage.at(static_cast<std::size_t>(priceClass));
-        m_main.timberRevenueChanged();
-
-        m_flags.noThinningYet = false;
-        m_main.thinningWritten(row, rec.volume);
-    });
-}
-
 void ThinWindowLogic::SetGrowFromAfterThin() {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in Misc.SetGrowFromAfterThin()"), [&] {
-        const workflow::ProjectionTable &table = m_main.table();
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in Misc.SetGrowFromAfterThin()"), [&] {
+        const work::ProjectionTable &table = m_standWork.table();
         const int row = table.currentRow();
         if (row < 1) {
             return;
         }
-        const QStringList &cells = table.row(row).cells;
-        workflow::IMainView &main = m_main.view();
-        main.setText(MainControl::txtFromA, cells.value(workflow::kColAge));
-        main.setText(MainControl::txtFromH, cells.value(workflow::kColTopHeight));
-        main.setText(MainControl::txtFromN, cells.value(workflow::kColStocking));
-        main.setText(MainControl::txtFromB, cells.value(workflow::kColBasalArea));
-        main.setText(MainControl::txtFromD, cells.value(workflow::kColDbh));
+        m_standWork.copyRowToFields(row);
         if (m_flags.loopUnderWay) {
             // The next grow of the loop reaches the next thinning age.
             const double frequency =
                 std::nearbyint(shell::val(m_view.text(ThinControl::txtThinFreq)));
-            const double age = shell::val(cells.value(workflow::kColAge));
-            main.setText(MainControl::txtToA, formatNumber(age + frequency, u"##0"));
-            main.setText(MainControl::txtByA, formatNumber(frequency, u"##0"));
+            const double age = shell::val(table.row(row).cells.value(work::kColAge));
+            m_standWork.setField(WorkField::ToAge, formatNumber(age + frequency, u"##0"));
+            m_standWork.setField(WorkField::ByStep, formatNumber(frequency, u"##0"));
         }
     });
 }

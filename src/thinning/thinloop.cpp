@@ -6,8 +6,9 @@
 #include "shell/vbtext.hpp"
 #include "thinning/thinmessages.hpp"
 #include "thinning/thinwindowlogic.hpp"
+#include "work/standwork.hpp"
+#include "workflow/iworkwindows.hpp"
 #include "workflow/mainmessages.hpp"
-#include "workflow/mainwindowlogic.hpp"
 
 #include <algorithm>
 #include <cmath>
@@ -64,7 +65,7 @@ void ThinWindowLogic::resetFields() {
 }
 
 void ThinWindowLogic::cmdLoop_Click() {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in frmThin.cmdLoop_Click()"), [&] {
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in frmThin.cmdLoop_Click()"), [&] {
         if (!loopFieldCheck()) {
             return;
         }
@@ -82,7 +83,7 @@ void ThinWindowLogic::cmdLoop_Click() {
             shell::raiseAppFault(shell::RuntimeError::typeMismatch());
         }
         const double intensity = shell::val(intensityText);
-        const double age = wholeYears(m_main.view().text(workflow::MainControl::txtFromA));
+        const double age = wholeYears(m_standWork.field(work::WorkField::FromAge));
         const double until = wholeYears(field(ThinControl::txtThinUntil));
         const double frequency = wholeYears(field(ThinControl::txtThinFreq));
         if (frequency == 0.0) {
@@ -97,9 +98,9 @@ void ThinWindowLogic::cmdLoop_Click() {
         const LoopUnderWay underWay(m_flags.loopUnderWay);
         for (long i = 0; i <= passes; ++i) {
             cmdAccept_Click();
-            const int rowsBefore = m_main.table().rowCount();
+            const int rowsBefore = m_standWork.table().rowCount();
             m_main.cmdGrow_Click();
-            if (m_main.table().rowCount() == rowsBefore) {
+            if (m_standWork.table().rowCount() == rowsBefore) {
                 break; // the grow was refused or failed: stop with the rows so far
             }
             m_main.cmdThin_Click();

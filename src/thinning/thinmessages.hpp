@@ -2,9 +2,18 @@
 
 // Every text of the thinning window and the thinning commands, in one place.
 
+#include "engine/grow.hpp"
+
 #include <QString>
 
+#include <string_view>
+
 namespace arbolex::thinning::text {
+
+/// A text the engine's volume thinning shares with this window.
+inline QString engineText(std::string_view text) {
+    return QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size()));
+}
 
 inline QString lf() {
     return QStringLiteral("\n");
@@ -79,7 +88,7 @@ inline QString removalLeavesNoStocking() {
     return QStringLiteral("FAULT - Proposed thinning leads to negative or zero Stocking.");
 }
 inline QString removalLeavesNoVolume() {
-    return QStringLiteral("FAULT - Proposed thinning leads to negative or zero Volume.");
+    return engineText(engine::thinningtext::kRemovalLeavesNoVolume);
 }
 inline QString howToPrescribe() {
     return QStringLiteral("FAULT - a thinning may be correctly prescribed by:") + lf() + cr() +
@@ -89,12 +98,11 @@ inline QString howToPrescribe() {
            QStringLiteral("4) Specifying Stand volume reduction");
 }
 inline QString nothingLeft() {
-    return QStringLiteral("FAULT - Negative or zero Basal Area or Stocking predicted");
+    return engineText(engine::thinningtext::kNothingLeft);
 }
 /// A model without a thinning response ties no basal area to stocking.
 inline QString noThinningResponse() {
-    return QStringLiteral("FAULT - The model in use has no thinning response: a thinning may "
-                          "only be prescribed by Basal area & Stocking reductions.");
+    return engineText(engine::thinningtext::kNoThinningResponse);
 }
 
 // Accept and loop

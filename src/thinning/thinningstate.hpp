@@ -20,12 +20,8 @@ struct ThinningWork {
 struct ThinningFlags {
     /// Set for the whole run of the thinning loop.
     bool loopUnderWay = false;
-    /// True until a thinning row is written; again after a clear.
-    bool noThinningYet = true;
     /// The window was loaded on a row that already carries a thinning.
     bool editingExisting = false;
-    /// Set by the main window's thin command, cleared by the grow command.
-    bool thinnedSinceLastGrow = false;
 };
 
 } // namespace arbolex::thinning

@@ -3,31 +3,37 @@
 #include "thinning/thinwindowlogic.hpp"
 
 #include "assortments/assortwindowlogic.hpp"
+#include "rotation/growcommand.hpp"
+#include "rotation/standmath.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "shell/vbformat.hpp"
 #include "shell/vbtext.hpp"
 #include "thinning/thinmessages.hpp"
+#include "work/standwork.hpp"
+#include "workflow/growfrompanel.hpp"
+#include "workflow/iworkwindows.hpp"
 #include "workflow/mainmessages.hpp"
-#include "workflow/mainwindowlogic.hpp"
-#include "workflow/standmath.hpp"
 
 #include <cmath>
 
 namespace arbolex::thinning {
 
+using rotation::dbhFromBasalArea;
+using rotation::truncateToTenth;
 using shell::formatNumber;
 using shell::isNumeric;
 using shell::val;
-using workflow::dbhFromBasalArea;
-using workflow::truncateToTenth;
 
 namespace {
 
 // Display formats of the thinning window.
 constexpr char16_t kStockingFormat[] = u"###0";
 constexpr char16_t kBasalAreaFormat[] = u"##0.00";
-constexpr char16_t kVolumeFormat[] = u"###0.00";
+/// Volumes as the window shows them: the pattern whose shown figure the
+/// volume method checks a removal against.
+const QString kVolumeFormat = QString::fromLatin1(rotation::kThinningVolumeShown.data(),
+                                                  rotation::kThinningVolumeShown.size());
 constexpr char16_t kDbhFormat[] = u"##0.0";
 constexpr char16_t kMeanVolumeFormat[] = u"0.000";
 
@@ -50,9 +56,9 @@ QString dbhText(float basalArea, float stocking) {
 
 } // namespace
 
-ThinWindowLogic::ThinWindowLogic(workflow::MainWindowLogic &main, IThinView &view,
-                                 shell::IInteractive &interactive)
-    : m_main(main), m_view(view), m_interactive(interactive) {}
+ThinWindowLogic::ThinWindowLogic(work::StandWork &work, workflow::IMainCommands &main,
+                                 IThinView &view, shell::IInteractive &interactive)
+    : m_standWork(work), m_main(main), m_view(view), m_interactive(interactive) {}
 
 QString ThinWindowLogic::field(ThinControl c) const {
     return m_view.text(c);
@@ -80,16 +86,16 @@ void ThinWindowLogic::emptyResultColumns() {
 }
 
 void ThinWindowLogic::frmThinLoad() {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in Misc.frmThinLoad()"), [&] {
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in Misc.frmThinLoad()"), [&] {
         m_flags.editingExisting = false;
         if (m_assort != nullptr) {
             m_assort->session().pending.clear();
         }
-        const int row = m_main.table().currentRow();
+        const int row = m_standWork.table().currentRow();
         if (row < 1) {
             return;
         }
-        const workflow::RowRecord &rec = m_main.table().row(row).record;
+        const work::RowRecord &rec = m_standWork.table().row(row).record;
         m_view.setCaption(workflow::text::titleArbolexYeld() + QStringLiteral("      ") +
                           text::thinningAtAge() + shell::singleText(rec.age));
         // The stand before the thinning is always standing + removed, so an
@@ -112,7 +118,7 @@ void ThinWindowLogic::frmThinLoad() {
     });
 }
 
-void ThinWindowLogic::fillFromRecord(const workflow::RowRecord &rec) {
+void ThinWindowLogic::fillFromRecord(const work::RowRecord &rec) {
     m_work.postBasalArea = rec.basalArea;
     m_work.postStocking = rec.stocking;
     m_work.postVolume = rec.volume;
@@ -128,6 +134,19 @@ void ThinWindowLogic::fillFromRecord(const workflow::RowRecord &rec) {
     m_view.setText(ThinControl::lblPostD, formatNumber(rec.dbh, kDbhFormat));
     m_view.setText(ThinControl::lblPostMV, meanVolumeText(rec.volume, rec.stocking));
     m_view.setEnabled(ThinControl::cmdAccept, true);
+}
+
+void ThinWindowLogic::openFromMain() {
+    frmThinLoad();
+    if (m_flags.loopUnderWay) {
+        return; // the loop drives the window itself
+    }
+    // The loop repeats an earlier thinning, so it is offered only once a
+    // thinning has been written.
+    const bool loopMode =
+        m_standWork.thinned() &&
+        m_interactive.askYesNo(workflow::text::titleArbolexYeld(), text::loopOffer());
+    show(loopMode);
 }
 
 void ThinWindowLogic::show(bool loopMode) {
@@ -212,7 +231,7 @@ float ThinWindowLogic::postValue(ThinControl removal, ThinControl post, float pr
 }
 
 void ThinWindowLogic::cmdThin_Click() {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in frmThin.cmdThin_Click()"), [&] {
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in frmThin.cmdThin_Click()"), [&] {
         if (!chkThinFlds()) {
             return;
         }
@@ -220,8 +239,8 @@ void ThinWindowLogic::cmdThin_Click() {
         if (method == kNoMethod) {
             return;
         }
-        engine::Grow &grow = m_main.grow();
-        if (method != kBasalAreaAndStocking && grow.T(1) == 0.0) {
+        engine::Grow &grow = m_standWork.grow();
+        if (method != kBasalAreaAndStocking && method != kVolume && grow.T(1) == 0.0) {
             // Without a thinning response basal area and stocking are not
             // tied: both must be given.
             message(workflow::text::titleOstran(), text::noThinningResponse());
@@ -255,12 +274,22 @@ void ThinWindowLogic::cmdThin_Click() {
             postB = static_cast<float>(grow.BRES(h, preN, preB, postN));
             postV = grow.GetV7(postB, postN, h);
             break;
-        default:
-            postV = postValue(ThinControl::txtRemV, ThinControl::txtPostV, preV);
-            if (!grow.NEWTON(preN, preB, h, postV, postN, postB)) {
+        default: {
+            // The volume method every rotation thins by.
+            const engine::VolumeThinning t = grow.thinToVolume(
+                preN, preB, h, postValue(ThinControl::txtRemV, ThinControl::txtPostV, preV));
+            if (t.outcome == engine::VolumeThinningOutcome::kNoThinningResponse) {
+                message(workflow::text::titleOstran(), text::noThinningResponse());
                 return;
             }
+            if (t.outcome == engine::VolumeThinningOutcome::kSolverFailed) {
+                return;
+            }
+            postB = t.basalArea;
+            postN = t.stocking;
+            postV = t.volume;
             break;
+        }
         }
         if (grow.faultCount() != faultsBefore) {
             return;
@@ -286,7 +315,7 @@ void ThinWindowLogic::cmdThin_Click() {
 void ThinWindowLogic::ShowThin(float preBasalArea, float preStocking, float /*topHeight*/,
                                float preVolume, float postBasalArea, float postStocking,
                                float postVolume) {
-    shell::guard(m_main.errorLog(), QStringLiteral(" in frmThin.ShowThin()"), [&] {
+    shell::guard(m_standWork.errorLog(), QStringLiteral(" in frmThin.ShowThin()"), [&] {
         const float remN = std::fabs(preStocking - postStocking);
         const float remB = std::fabs(preBasalArea - postBasalArea);
         const float remV = std::fabs(preVolume - postVolume);
@@ -307,7 +336,7 @@ void ThinWindowLogic::cmdClear_Click() {
     try {
         emptyResultColumns();
     } catch (const shell::AppFault &fault) {
-        m_main.errorLog().append(
+        m_standWork.errorLog().append(
             QStringLiteral("Error ") + fault.error.description +
             QStringLiteral("  in procedure cmdClear_Click of Feuille frmThin"));
     }
@@ -320,7 +349,7 @@ void ThinWindowLogic::cmdCancel_Click() {
 void ThinWindowLogic::typeText(ThinControl control, const QString &text) {
     QString typed;
     for (const QChar c : text) {
-        if (workflow::MainWindowLogic::KeyFilter(c)) {
+        if (workflow::GrowFromPanel::KeyFilter(c)) {
             typed.append(c);
         }
     }

@@ -19,9 +19,13 @@ class AssortWindowLogic;
 }
 
 namespace arbolex::workflow {
-class MainWindowLogic;
+class IMainCommands;
+}
+
+namespace arbolex::work {
+class StandWork;
 struct RowRecord;
-} // namespace arbolex::workflow
+} // namespace arbolex::work
 
 namespace arbolex::thinning {
 
@@ -36,7 +40,9 @@ enum ThinningMethod : int {
 
 class ThinWindowLogic {
 public:
-    ThinWindowLogic(workflow::MainWindowLogic &main, IThinView &view,
+    /// The thinning window on `work`; the loop presses the grow and thin
+    /// commands of `main`.
+    ThinWindowLogic(work::StandWork &work, workflow::IMainCommands &main, IThinView &view,
                     shell::IInteractive &interactive);
 
     // ---- Loading and showing ---------------------------------------------------
@@ -46,6 +52,10 @@ public:
     void frmThinLoad();
     /// Shows the window, with the loop frame on when `loopMode`.
     void show(bool loopMode);
+    /// The main window's Thin: loads the window on the last row and shows it,
+    /// offering the loop once a thinning has been written (the loop itself
+    /// drives the window without showing it).
+    void openFromMain();
 
     // ---- Preview ------------------------------------------------------------------
 
@@ -67,8 +77,6 @@ public:
     /// Writes the previewed thinning into the projection table and makes the
     /// thinned stand the new grow-from stand.
     void cmdAccept_Click();
-    /// Writes the thinning row `row` of `flxMain` from its record.
-    void WriteThinLine(const QString &label, int row);
     /// Writes the thinned row's stand into the grow-from fields.
     void SetGrowFromAfterThin();
 
@@ -107,9 +115,10 @@ private:
     /// removal wins), else the post field.
     float postValue(ThinControl removal, ThinControl post, float pre) const;
     void emptyResultColumns();
-    void fillFromRecord(const workflow::RowRecord &record);
+    void fillFromRecord(const work::RowRecord &record);
 
-    workflow::MainWindowLogic &m_main;
+    work::StandWork &m_standWork;
+    workflow::IMainCommands &m_main;
     IThinView &m_view;
     shell::IInteractive &m_interactive;
     ThinningWork m_work;

@@ -6,10 +6,8 @@
 #include "ui/controltext.hpp"
 #include "ui/fieldinput.hpp"
 
-#include <QCloseEvent>
 #include <QGridLayout>
 #include <QHBoxLayout>
-#include <QKeyEvent>
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
@@ -39,12 +37,10 @@ QFont bold(QFont font) {
 
 } // namespace
 
-AssortPricesWindow::AssortPricesWindow(QWidget *parent) : QDialog(parent) {
-    setObjectName(QStringLiteral("frmAssortPrices"));
-    setWindowTitle(economics::text::assortPricesCaption());
-    setModal(false);
-    setSizeGripEnabled(false);
-
+AssortPricesWindow::AssortPricesWindow(QWidget *parent)
+    : AssortPricesToolWindow(parent, QStringLiteral("frmAssortPrices"),
+                             economics::text::assortPricesCaption(),
+                             &AssortPricesWindowLogic::cmdCloseAsmtPrices_Click) {
     auto *layout = new QVBoxLayout(this);
     layout->setContentsMargins(16, 12, 16, 12);
     layout->setSpacing(14);
@@ -84,7 +80,7 @@ AssortPricesWindow::AssortPricesWindow(QWidget *parent) : QDialog(parent) {
         field->setReadOnly(true);
         field->setContextMenuPolicy(Qt::NoContextMenu);
         field->setAcceptDrops(false);
-        field->installEventFilter(this);
+        watchKeys(field); // in the order of their index
         m_fields.at(at(k)) = field;
         grid->addWidget(field, k + 1, 1);
 
@@ -111,20 +107,10 @@ AssortPricesWindow::AssortPricesWindow(QWidget *parent) : QDialog(parent) {
     layout->addLayout(commands);
     layout->setSizeConstraint(QLayout::SetFixedSize);
 
-    connect(m_change, &QPushButton::clicked, this, [this] {
-        if (m_logic != nullptr) {
-            m_logic->cmdChangeAsmtPrices_Click();
-        }
-    });
-    connect(m_close, &QPushButton::clicked, this, [this] {
-        if (m_logic != nullptr) {
-            m_logic->cmdCloseAsmtPrices_Click();
-        }
-    });
-}
-
-void AssortPricesWindow::attach(AssortPricesWindowLogic &logic) {
-    m_logic = &logic;
+    connect(m_change, &QPushButton::clicked, this,
+            [this] { run(&AssortPricesWindowLogic::cmdChangeAsmtPrices_Click); });
+    connect(m_close, &QPushButton::clicked, this,
+            [this] { run(&AssortPricesWindowLogic::cmdCloseAsmtPrices_Click); });
 }
 
 QWidget *AssortPricesWindow::control(AssortPricesItem item) const {
@@ -160,60 +146,10 @@ void AssortPricesWindow::setPricesEditable(bool editable) {
     }
 }
 
-void AssortPricesWindow::setCaption(const QString &caption) {
-    setWindowTitle(caption);
-}
-
-void AssortPricesWindow::showCentred() {
-    showCentredOverParent(this);
-}
-
-void AssortPricesWindow::close() {
-    hide();
-}
-
-bool AssortPricesWindow::isShown() const {
-    return isVisible();
-}
-
-void AssortPricesWindow::reject() {
-    if (m_logic != nullptr) {
-        m_logic->cmdCloseAsmtPrices_Click();
-    } else {
-        QDialog::reject();
-    }
-}
-
-void AssortPricesWindow::closeEvent(QCloseEvent *event) {
-    if (m_logic != nullptr && isVisible()) {
-        m_logic->cmdCloseAsmtPrices_Click();
-    }
-    event->accept();
-}
-
-int AssortPricesWindow::fieldIndex(const QObject *object) const {
-    for (std::size_t i = 0; i < m_fields.size(); ++i) {
-        if (m_fields[i] == object) {
-            return static_cast<int>(i);
-        }
-    }
-    return -1;
-}
-
-bool AssortPricesWindow::eventFilter(QObject *watched, QEvent *event) {
-    const int field = fieldIndex(watched);
-    if (event->type() != QEvent::KeyPress || m_logic == nullptr || field < 0) {
-        return QDialog::eventFilter(watched, event);
-    }
-    const auto &key = *static_cast<QKeyEvent *>(event);
-    if (isPriceFieldShortcut(key)) {
-        return true;
-    }
-    const QChar typed = priceFieldKey(key);
-    if (!typed.isNull() && !m_logic->txtAsmtVal_KeyPress(field, typed)) {
-        return true;
-    }
-    return QDialog::eventFilter(watched, event);
+bool AssortPricesWindow::refusesKey(int field, const QKeyEvent &key) {
+    return logic() != nullptr && refusedPriceKey(key, [&](QChar typed) {
+               return logic()->txtAsmtVal_KeyPress(field, typed);
+           });
 }
 
 } // namespace arbolex::ui

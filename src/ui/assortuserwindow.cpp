@@ -50,7 +50,7 @@ AssortUserWindow::AssortUserWindow(QWidget *parent) : QDialog(parent) {
         grid->addWidget(heading, 0, c, c == 1 ? Qt::AlignLeft : Qt::AlignHCenter);
     }
     const int digitWidth = fontMetrics().horizontalAdvance(QStringLiteral("0000.0")) + 16;
-    for (int i = 1; i <= economics::kUserCategoryCount; ++i) {
+    for (int i = 1; i <= prices::kUserCategoryCount; ++i) {
         auto &fields = m_fields.at(static_cast<std::size_t>(i - 1));
         grid->addWidget(new QLabel(QString::number(i), this), i, 0, Qt::AlignHCenter);
         for (const AssortUserControl c :
@@ -115,7 +115,7 @@ AssortUserWindow::AssortUserWindow(QWidget *parent) : QDialog(parent) {
 
 QLineEdit *AssortUserWindow::field(AssortUserControl c, int index) const {
     if (!assortments::isPerCategory(c) || c == AssortUserControl::chkUse || index < 1 ||
-        index > economics::kUserCategoryCount) {
+        index > prices::kUserCategoryCount) {
         return nullptr;
     }
     return m_fields.at(static_cast<std::size_t>(index - 1)).at(fieldSlot(c));

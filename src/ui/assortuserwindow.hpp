@@ -1,7 +1,7 @@
 #pragma once
 
 #include "assortments/iassortview.hpp"
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 
 #include <QDialog>
 
@@ -45,8 +45,8 @@ private:
 
     assortments::AssortUserLogic *m_logic = nullptr;
     /// Name, small end and big end of each category.
-    std::array<std::array<QLineEdit *, 3>, economics::kUserCategoryCount> m_fields{};
-    std::array<QCheckBox *, economics::kUserCategoryCount> m_use{};
+    std::array<std::array<QLineEdit *, 3>, prices::kUserCategoryCount> m_fields{};
+    std::array<QCheckBox *, prices::kUserCategoryCount> m_use{};
     QCheckBox *m_flag = nullptr;
 };
 

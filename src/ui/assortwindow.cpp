@@ -168,12 +168,14 @@ void AssortWindow::setCaption(const QString &caption) {
 }
 
 void AssortWindow::showFixedClasses() {
+    m_userReport.reset();
     m_userTable->hide();
     m_fixed->show();
     m_notes->show();
 }
 
 void AssortWindow::showUserReport(const assortments::UserReport &report) {
+    m_userReport = report;
     m_userTable->clear();
     m_userTable->setColumnCount(static_cast<int>(report.header.size()));
     m_userTable->setRowCount(static_cast<int>(report.rows.size()));

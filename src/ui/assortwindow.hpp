@@ -32,8 +32,10 @@ public:
     QString text(assortments::AssortControl control) const override;
     void setText(assortments::AssortControl control, const QString &text) override;
     void setCaption(const QString &caption) override;
+    QString caption() const override { return windowTitle(); }
     void showFixedClasses() override;
     void showUserReport(const assortments::UserReport &report) override;
+    std::optional<assortments::UserReport> userReport() const override { return m_userReport; }
     /// Opens the window modal, without waiting: its buttons reach the logic.
     void showReport() override;
     void close() override;
@@ -52,6 +54,7 @@ private:
     QWidget *m_fixed = nullptr;
     QTableWidget *m_userTable = nullptr;
     QLabel *m_notes = nullptr;
+    std::optional<assortments::UserReport> m_userReport;
 };
 
 } // namespace arbolex::ui

@@ -56,7 +56,7 @@ void ChartPane::refresh() {
         return;
     }
     m_stale = false;
-    const charts::RotationCharts drawn = charts::rotationCharts(*m_logic);
+    const charts::RotationCharts drawn = charts::rotationCharts(m_logic->work());
     m_panel->showCharts(drawn.stand, drawn.increments, drawn.cashFlow);
 }
 

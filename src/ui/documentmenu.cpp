@@ -9,16 +9,8 @@
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QMenu>
-#include <QTimer>
 
 namespace arbolex::ui {
-
-namespace {
-
-/// How often the caption's unsaved mark follows the work, milliseconds.
-constexpr int kCaptionInterval = 300;
-
-} // namespace
 
 DocumentMenu::DocumentMenu(QMenu *menu, QWidget *window)
     : QObject(window), m_menu(menu), m_window(window) {
@@ -60,21 +52,10 @@ DocumentMenu::DocumentMenu(QMenu *menu, QWidget *window)
     exit->setObjectName(QStringLiteral("mnuExit"));
     connect(exit, &QAction::triggered, m_window, &QWidget::close);
     recentFilesChanged({});
-
-    // Handlers call one another without telling anyone: the caption's
-    // unsaved mark follows the work by comparing it with the saved document.
-    m_caption = new QTimer(this);
-    m_caption->setInterval(kCaptionInterval);
-    connect(m_caption, &QTimer::timeout, this, [this] {
-        if (m_controller != nullptr) {
-            m_controller->refreshCaption();
-        }
-    });
 }
 
 void DocumentMenu::attach(document::DocumentController &controller) {
     m_controller = &controller;
-    m_caption->start();
 }
 
 QString DocumentMenu::chooseFileToOpen(const QString &folder) {
@@ -87,7 +68,7 @@ QString DocumentMenu::chooseFileToSave(const QString &suggestedPath) {
                                         document::text::fileFilter());
 }
 
-bool DocumentMenu::editIdentification(document::SubCompartment &id) {
+bool DocumentMenu::editIdentification(work::SubCompartment &id) {
     IdentificationDialog dialog(id, m_window);
     if (dialog.exec() != QDialog::Accepted) {
         return false;

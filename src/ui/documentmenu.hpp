@@ -5,7 +5,6 @@
 #include <QObject>
 
 class QMenu;
-class QTimer;
 class QWidget;
 
 namespace arbolex::document {
@@ -28,7 +27,7 @@ public:
     // IDocumentDialogs
     QString chooseFileToOpen(const QString &folder) override;
     QString chooseFileToSave(const QString &suggestedPath) override;
-    bool editIdentification(document::SubCompartment &id) override;
+    bool editIdentification(work::SubCompartment &id) override;
     void recentFilesChanged(const QStringList &files) override;
 
     QMenu *recentMenu() const { return m_recent; }
@@ -37,7 +36,6 @@ private:
     QMenu *m_menu;
     QMenu *m_recent = nullptr;
     QWidget *m_window;
-    QTimer *m_caption = nullptr;
     document::DocumentController *m_controller = nullptr;
 };
 

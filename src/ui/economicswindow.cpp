@@ -1,10 +1,11 @@
 #include "ui/economicswindow.hpp"
 
+#include "charts/economicscharts.hpp"
 #include "economics/economicsformat.hpp"
 #include "economics/economicsmessages.hpp"
 #include "economics/economicswindowlogic.hpp"
 #include "engine/vectorstate.hpp"
-#include "ui/economicscharts.hpp"
+#include "report/chartbuilder.hpp"
 #include "ui/fieldinput.hpp"
 #include "ui/stringgridmodel.hpp"
 
@@ -81,12 +82,15 @@ EconomicsWindow::EconomicsWindow(QWidget *main) : QDialog(main) {
     layout->addWidget(regime);
     QLabel *rate = label(C::lblRate);
     rate->setStyleSheet(QStringLiteral("color: #4a4a4a;"));
+    rate->setWordWrap(true);
     layout->addWidget(rate);
 
     QHBoxLayout *inputs =
         fieldRow({{et::labelInterestRate(), field(C::txtInterestRate, 7)},
                   {et::labelEstablishmentCost(), field(C::txtEstablishmentCost, 8)},
                   {et::labelAnnualCost(), field(C::txtAnnualCost, 6)}});
+    control(C::txtEstablishmentCost)->setToolTip(et::hintEstablishmentCost());
+    control(C::txtAnnualCost)->setToolTip(et::hintAnnualCost());
     inputs->addSpacing(8);
     inputs->addWidget(new QLabel(et::labelValuation(), this));
     inputs->addWidget(valuationChoice());
@@ -150,20 +154,7 @@ QWidget *EconomicsWindow::buildRotationTab() {
     form->setLabelAlignment(Qt::AlignLeft);
     form->setRowWrapPolicy(QFormLayout::DontWrapRows);
     form->setVerticalSpacing(9);
-    const std::pair<QString, C> rows[] = {
-        {et::figureNpv(), C::lblNPV},
-        {et::figureLev(), C::lblLEV},
-        {et::figureEaa(), C::lblEAA},
-        {et::figureForestValue(), C::lblForestValue},
-        {et::figureIrr(), C::lblIRR},
-        {et::figureBreakEven(), C::lblBreakEven},
-        {et::figureRotation(), C::lblRotation},
-        {et::figureBiological(), C::lblBiological},
-        {et::figureEconomic(), C::lblEconomic},
-        {et::figureMai(), C::lblMAI},
-        {et::figureYieldClass(), C::lblYieldClass},
-    };
-    for (const auto &[caption, c] : rows) {
+    for (const auto &[caption, c] : economics::valueFigures()) {
         QLabel *value = label(c);
         value->setWordWrap(true);
         value->setMinimumWidth(230);
@@ -372,17 +363,21 @@ void EconomicsWindow::focus(EconomicsControl c) {
     focusControl(control(c));
 }
 
-void EconomicsWindow::showChart(QChartView *view, std::function<QChart *()> build) {
-    // A chart on a tab out of view is built when its tab is shown: laying out
+void EconomicsWindow::showChart(QChartView *view, charts::ChartData chart) {
+    // A chart on a tab out of view is drawn when its tab is shown: laying out
     // the sensitivity and Monte Carlo charts at every computation cost more
     // than all the figures.
     if (!m_tabs->currentWidget()->isAncestorOf(view)) {
-        m_pendingCharts[view] = std::move(build);
+        m_pendingCharts[view] = std::move(chart);
         return;
     }
     m_pendingCharts.erase(view);
+    draw(view, chart);
+}
+
+void EconomicsWindow::draw(QChartView *view, const charts::ChartData &chart) {
     QChart *old = view->chart();
-    view->setChart(build());
+    view->setChart(report::buildChart(chart, report::ChartLook::Window));
     delete old;
 }
 
@@ -393,11 +388,9 @@ void EconomicsWindow::showPendingCharts() {
             ++pending;
             continue;
         }
-        const std::function<QChart *()> build = std::move(pending->second);
+        const charts::ChartData chart = std::move(pending->second);
         pending = m_pendingCharts.erase(pending);
-        QChart *old = view->chart();
-        view->setChart(build());
-        delete old;
+        draw(view, chart);
     }
 }
 
@@ -405,25 +398,11 @@ void EconomicsWindow::figuresChanged() {
     if (m_logic == nullptr) {
         return;
     }
-    const QString rate = et::atRate(m_logic->rateText());
-    m_valueBox->setTitle(et::panelValue() + QLatin1Char(' ') + rate);
-    showChart(m_rotationChart, [this, rate] {
-        return rotationChart(m_logic->explorer(), et::panelRotations() + QLatin1Char(' ') + rate);
-    });
-    const auto &value = m_logic->value();
-    if (value && value->npv && value->lev) {
-        showChart(m_tornadoNpv, [this, rate, npv = *value->npv] {
-            return tornadoChart(m_logic->tornado(), npv, false,
-                                et::panelTornadoNpv() + QLatin1Char(' ') + rate);
-        });
-        showChart(m_tornadoLev, [this, rate, lev = *value->lev] {
-            return tornadoChart(m_logic->tornado(), lev, true,
-                                et::panelTornadoLev() + QLatin1Char(' ') + rate);
-        });
-    } else {
-        showChart(m_tornadoNpv, [] { return new QChart; });
-        showChart(m_tornadoLev, [] { return new QChart; });
-    }
+    m_valueBox->setTitle(et::panelValue() + QLatin1Char(' ') + et::atRate(m_logic->rateText()));
+    charts::EconomicsCharts drawn = charts::economicsCharts(*m_logic);
+    showChart(m_rotationChart, std::move(drawn.rotations));
+    showChart(m_tornadoNpv, std::move(drawn.tornadoNpv));
+    showChart(m_tornadoLev, std::move(drawn.tornadoLev));
     regimesChanged();
 }
 
@@ -441,19 +420,8 @@ void EconomicsWindow::regimesChanged() {
 }
 
 void EconomicsWindow::monteCarloChanged() {
-    if (m_logic == nullptr) {
-        return;
-    }
-    if (m_logic->monteCarlo()) {
-        const QString title = et::panelMonteCarlo() + QStringLiteral(" (rate drawn from ") +
-                              m_logic->view().text(C::txtRateLow) + QStringLiteral(" to ") +
-                              m_logic->view().text(C::txtRateHigh) + QStringLiteral(" % a year)");
-        showChart(m_histogram, [this, title] {
-            const auto &drawn = m_logic->monteCarlo();
-            return drawn ? histogramChart(*drawn, title) : new QChart;
-        });
-    } else {
-        showChart(m_histogram, [] { return new QChart; });
+    if (m_logic != nullptr) {
+        showChart(m_histogram, charts::economicsCharts(*m_logic).draws);
     }
 }
 

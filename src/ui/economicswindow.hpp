@@ -1,5 +1,6 @@
 #pragma once
 
+#include "charts/chartdata.hpp"
 #include "economics/ieconomicsview.hpp"
 
 #include <QDialog>
@@ -8,7 +9,6 @@
 #include <functional>
 #include <map>
 
-class QChart;
 class QChartView;
 class QGroupBox;
 class QLabel;
@@ -69,10 +69,11 @@ private:
     /// The choice cboValuation: standing price of the mean tree or assortments.
     QWidget *valuationChoice();
     QWidget *button(economics::EconomicsControl control, const QString &caption);
-    /// Shows `chart` in `view`, deleting the chart it showed before.
-    /// Sets the chart `build` makes on `view` now when its tab is in view, or
-    /// when its tab is next shown.
-    void showChart(QChartView *view, std::function<QChart *()> build);
+    /// Draws `chart` in `view` now when its tab is in view, or when its tab is
+    /// next shown, deleting the chart it showed before.
+    void showChart(QChartView *view, charts::ChartData chart);
+    /// Draws `chart` in `view`, deleting the chart it showed before.
+    static void draw(QChartView *view, const charts::ChartData &chart);
     void showPendingCharts();
 
     economics::EconomicsWindowLogic *m_logic = nullptr;
@@ -85,7 +86,7 @@ private:
     QChartView *m_tornadoLev = nullptr;
     QChartView *m_histogram = nullptr;
     /// Charts waiting for their tab to be shown.
-    std::map<QChartView *, std::function<QChart *()>> m_pendingCharts;
+    std::map<QChartView *, charts::ChartData> m_pendingCharts;
     QProgressBar *m_progress = nullptr;
     QTableView *m_regimes = nullptr;
     StringGridModel *m_regimeModel = nullptr;

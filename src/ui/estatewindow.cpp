@@ -1,10 +1,12 @@
 #include "ui/estatewindow.hpp"
 
+#include "charts/estatecharts.hpp"
 #include "engine/vectorstate.hpp"
 #include "estatewindow/estatemessages.hpp"
 #include "estatewindow/estatewindowlogic.hpp"
+#include "report/chartbuilder.hpp"
 
-#include <QBarCategoryAxis>
+#include <QAbstractBarSeries>
 #include <QBarSet>
 #include <QChart>
 #include <QChartView>
@@ -17,15 +19,11 @@
 #include <QProgressDialog>
 #include <QScreen>
 #include <QSortFilterProxyModel>
-#include <QStackedBarSeries>
 #include <QTabWidget>
 #include <QTableView>
 #include <QThread>
 #include <QToolTip>
 #include <QVBoxLayout>
-#include <QValueAxis>
-
-#include <array>
 
 namespace arbolex::ui {
 
@@ -34,9 +32,6 @@ using estatewindow::EstateResultsModel;
 
 namespace {
 
-/// Colours of the species, in the order of their names.
-constexpr std::array<QRgb, 8> kSpeciesColours = {0x2e7d32, 0x1b6ca8, 0xb8860b, 0x8b3a3a,
-                                                 0x6a4c93, 0x00838f, 0xd2691e, 0x555555};
 /// A row that was not grown: pale red behind dark red.
 constexpr QRgb kNotGrownBackground = 0xfbe3e4;
 constexpr QRgb kNotGrownText = 0x9b1c1c;
@@ -205,65 +200,28 @@ void EstateWindow::resultsChanged() {
 }
 
 void EstateWindow::drawForecast() {
-    const estatewindow::ForecastChart &forecast = m_logic->forecast();
-    auto *chart = new QChart;
-    chart->setTitle(text::chartTitle());
-    QFont font = chart->titleFont();
-    font.setBold(true);
-    font.setPointSizeF(font.pointSizeF() * 1.1);
-    chart->setTitleFont(font);
-    chart->setAnimationOptions(QChart::NoAnimation);
-    chart->legend()->setAlignment(Qt::AlignBottom);
-    chart->setMargins(QMargins(6, 6, 6, 6));
-
-    auto *series = new QStackedBarSeries;
-    series->setBarWidth(0.8);
-    for (qsizetype s = 0; s < forecast.species.size(); ++s) {
-        auto *set = new QBarSet(forecast.species[s]);
-        const QColor colour(
-            kSpeciesColours.at(static_cast<std::size_t>(s) % kSpeciesColours.size()));
-        set->setColor(colour);
-        set->setBorderColor(colour.darker(130));
-        for (const double v : forecast.volumes[static_cast<std::size_t>(s)]) {
-            set->append(v);
+    m_drawn = charts::harvestChart(m_logic->forecast());
+    QChart *chart = report::buildChart(m_drawn, report::ChartLook::Window);
+    for (QAbstractSeries *series : chart->series()) {
+        auto *bars = qobject_cast<QAbstractBarSeries *>(series);
+        for (QBarSet *set : bars != nullptr ? bars->barSets() : QList<QBarSet *>()) {
+            const int s = set->property(report::kSeriesIndexProperty).toInt();
+            connect(set, &QBarSet::hovered, this, [this, s](bool status, int index) {
+                if (!status) {
+                    QToolTip::hideText();
+                    return;
+                }
+                const charts::ChartSeries &species = m_drawn.series.at(static_cast<std::size_t>(s));
+                QToolTip::showText(
+                    QCursor::pos(),
+                    species.name + QLatin1Char(' ') + m_drawn.categories.value(index) +
+                        QStringLiteral(": ") +
+                        QLocale().toString(species.points.at(static_cast<std::size_t>(index)).y,
+                                           'f', 0) +
+                        QLatin1Char(' ') + species.unit);
+            });
         }
-        const QString species = forecast.species[s];
-        connect(set, &QBarSet::hovered, this, [this, set, species](bool status, int index) {
-            if (!status) {
-                QToolTip::hideText();
-                return;
-            }
-            const int year = m_logic->forecast().years.at(static_cast<std::size_t>(index));
-            QToolTip::showText(QCursor::pos(), species + QStringLiteral(" ") +
-                                                   QString::number(year) + QStringLiteral(": ") +
-                                                   QLocale().toString(set->at(index), 'f', 0) +
-                                                   QStringLiteral(" m³"));
-        });
-        series->append(set);
     }
-    chart->addSeries(series);
-
-    auto *years = new QBarCategoryAxis;
-    for (const int year : forecast.years) {
-        years->append(QString::number(year));
-    }
-    years->setTitleText(text::chartYearAxis());
-    years->setLabelsAngle(-90);
-    QFont small = years->labelsFont();
-    small.setPointSizeF(small.pointSizeF() * 0.85);
-    years->setLabelsFont(small);
-    years->setGridLineVisible(false);
-    chart->addAxis(years, Qt::AlignBottom);
-    series->attachAxis(years);
-
-    auto *volume = new QValueAxis;
-    volume->setTitleText(text::chartValueAxis());
-    volume->setLabelFormat(QStringLiteral("%.0f"));
-    chart->addAxis(volume, Qt::AlignLeft);
-    series->attachAxis(volume);
-    volume->setMin(0.0);
-    volume->applyNiceNumbers();
-
     QChart *old = m_chart->chart();
     m_chart->setChart(chart);
     delete old;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "charts/chartdata.hpp"
 #include "estatewindow/iestateview.hpp"
 
 #include <QWidget>
@@ -56,6 +57,8 @@ private:
     QTableView *m_table = nullptr;
     EstateSortModel *m_sorted = nullptr;
     QChartView *m_chart = nullptr;
+    /// The forecast as drawn, for the hover text of its bars.
+    charts::ChartData m_drawn;
     QProgressDialog *m_progress = nullptr;
     QThread *m_worker = nullptr;
 };

@@ -1,6 +1,6 @@
 #include "ui/fieldinput.hpp"
 
-#include "workflow/mainwindowlogic.hpp"
+#include "workflow/growfrompanel.hpp"
 
 #include <QKeyEvent>
 #include <QLineEdit>
@@ -12,7 +12,7 @@ bool refusedByKeyFilter(const QKeyEvent &key) {
         return false;
     }
     for (const QChar c : key.text()) {
-        if (c.isPrint() && !workflow::MainWindowLogic::KeyFilter(c)) {
+        if (c.isPrint() && !workflow::GrowFromPanel::KeyFilter(c)) {
             return true;
         }
     }

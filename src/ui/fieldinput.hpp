@@ -23,6 +23,17 @@ QChar priceFieldKey(const QKeyEvent &key);
 /// than what was typed: paste, cut, undo and redo.
 bool isPriceFieldShortcut(const QKeyEvent &key);
 
+/// True when a key press into a price field must not reach it: a shortcut
+/// that would put anything else into it, or a character `keyPress` (the
+/// field's KeyPress handler of its logic) refuses.
+template <class KeyPress> bool refusedPriceKey(const QKeyEvent &key, KeyPress keyPress) {
+    if (isPriceFieldShortcut(key)) {
+        return true;
+    }
+    const QChar typed = priceFieldKey(key);
+    return !typed.isNull() && !keyPress(typed);
+}
+
 /// Puts the focus on `control`, selecting a field's text so typing replaces it.
 void focusControl(QWidget *control);
 

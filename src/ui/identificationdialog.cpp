@@ -17,7 +17,7 @@ constexpr int kMaxNameLength = 200;
 
 } // namespace
 
-IdentificationDialog::IdentificationDialog(const document::SubCompartment &id, QWidget *parent)
+IdentificationDialog::IdentificationDialog(const work::SubCompartment &id, QWidget *parent)
     : QDialog(parent) {
     setObjectName(QStringLiteral("frmSubCompartment"));
     setWindowTitle(document::text::titleIdentification());
@@ -55,7 +55,7 @@ IdentificationDialog::IdentificationDialog(const document::SubCompartment &id, Q
     layout->addWidget(buttons);
 }
 
-document::SubCompartment IdentificationDialog::identification() const {
+work::SubCompartment IdentificationDialog::identification() const {
     return {m_forest->text().trimmed(), m_compartment->text().trimmed(),
             m_subCompartment->text().trimmed(), m_notes->toPlainText().trimmed()};
 }

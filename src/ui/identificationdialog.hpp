@@ -1,6 +1,6 @@
 #pragma once
 
-#include "document/subcompartment.hpp"
+#include "work/subcompartment.hpp"
 
 #include <QDialog>
 
@@ -14,9 +14,9 @@ namespace arbolex::ui {
 class IdentificationDialog : public QDialog {
     Q_OBJECT
 public:
-    explicit IdentificationDialog(const document::SubCompartment &id, QWidget *parent = nullptr);
+    explicit IdentificationDialog(const work::SubCompartment &id, QWidget *parent = nullptr);
 
-    document::SubCompartment identification() const;
+    work::SubCompartment identification() const;
 
 private:
     QLineEdit *m_forest = nullptr;

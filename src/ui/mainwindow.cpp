@@ -51,6 +51,40 @@ constexpr int kFieldDigits = 8;
 /// Width of the narrow separator columns of the grid, pixels.
 constexpr int kSeparatorWidth = 10;
 
+using Logic = workflow::MainWindowLogic;
+
+/// A command button of the panel: its caption and hint (none when null) and
+/// the handler of the logic a click runs.
+struct Command {
+    MainControl control;
+    QString (*caption)();
+    QString (*hint)();
+    void (Logic::*handler)();
+};
+
+/// The command buttons down the first column, then the second, in keyboard
+/// order. The summary button's caption is the logic's ("GoTo Summary" or
+/// "GoTo Stand Projections").
+const Command kCommands[] = {
+    {MainControl::cmdGrow, text::buttonGrow, nullptr, &Logic::cmdGrow_Click},
+    // Only thinned models offer the thin command: the logic enables it.
+    {MainControl::cmdThin, text::buttonThin, text::hintThin, &Logic::cmdThin_Click},
+    {MainControl::cmdAssort, assortments::text::mainAssortButton, assortments::text::mainAssortHint,
+     &Logic::cmdAssort_Click},
+    {MainControl::cmdUseRow, text::buttonUseRow, text::hintUseRow, &Logic::UseFlxRow},
+    {MainControl::cmdClear, text::buttonClear, nullptr, &Logic::cmdClear_Click},
+    {MainControl::cmdClearAll, text::buttonClearAll, nullptr, &Logic::ClearAll},
+    {MainControl::cmdFinalCut, text::buttonFinalCut, text::hintFinalCut, &Logic::cmdFinalCut_Click},
+    {MainControl::cmdSummary, nullptr, text::hintSummary, &Logic::cmdSummary_Click},
+    {MainControl::cmdNPV, text::buttonNpv, text::hintNpv, &Logic::cmdNPV_Click},
+    {MainControl::cmdDeleteRows, text::buttonDeleteRows, text::hintDeleteRows,
+     &Logic::cmdDeleteRows_Click},
+    {MainControl::cmdShowTimberPrice, workflow::text::showTimberPrices, nullptr,
+     &Logic::cmdShowTimberPrice_Click},
+};
+/// Buttons in the first column of the panel.
+constexpr int kFirstColumnCommands = 6;
+
 } // namespace
 
 MainWindow::MainWindow(QWidget *parent) : QMainWindow(parent) {
@@ -198,6 +232,12 @@ QLineEdit *MainWindow::addField(MainControl control) {
     field->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
     field->setFixedWidth(field->fontMetrics().horizontalAdvance(QString(kFieldDigits, u'0')) + 16);
     field->installEventFilter(this);
+    // The work keeps what the field holds, typed or set.
+    connect(field, &QLineEdit::textChanged, this, [this, control](const QString &text) {
+        if (m_logic != nullptr) {
+            m_logic->fields().fieldEdited(control, text);
+        }
+    });
     m_controls.at(slot(control)) = field;
     return field;
 }
@@ -274,113 +314,46 @@ QWidget *MainWindow::buildPanel() {
 
     auto *commands = new QGridLayout;
     commands->setSpacing(6);
-    QPushButton *grow = addButton(MainControl::cmdGrow, text::buttonGrow());
+    for (int i = 0; i < static_cast<int>(std::size(kCommands)); ++i) {
+        const Command &c = kCommands[i];
+        QPushButton *button = addButton(c.control, c.caption != nullptr ? c.caption() : QString());
+        if (c.hint != nullptr) {
+            button->setToolTip(c.hint());
+        }
+        connect(button, &QPushButton::clicked, this, [this, handler = c.handler] {
+            if (m_logic != nullptr) {
+                (m_logic->*handler)();
+            }
+        });
+        const bool first = i < kFirstColumnCommands;
+        commands->addWidget(button, first ? i : i - kFirstColumnCommands, first ? 0 : 1);
+    }
+    QWidget *grow = control(MainControl::cmdGrow);
     QFont bold = grow->font();
     bold.setBold(true);
     grow->setFont(bold);
-    // Only thinned models offer the thin command: the logic enables it.
-    QPushButton *thin = addButton(MainControl::cmdThin, text::buttonThin());
-    thin->setToolTip(text::hintThin());
-    QPushButton *assort = addButton(MainControl::cmdAssort, assortments::text::mainAssortButton());
-    assort->setToolTip(assortments::text::mainAssortHint());
-    QPushButton *useRow = addButton(MainControl::cmdUseRow, text::buttonUseRow());
-    useRow->setToolTip(text::hintUseRow());
-    QPushButton *clear = addButton(MainControl::cmdClear, text::buttonClear());
-    QPushButton *clearAll = addButton(MainControl::cmdClearAll, text::buttonClearAll());
-    QPushButton *finalCut = addButton(MainControl::cmdFinalCut, text::buttonFinalCut());
-    finalCut->setToolTip(text::hintFinalCut());
-    QPushButton *summary = addButton(MainControl::cmdSummary, QString());
-    summary->setToolTip(text::hintSummary());
+    QWidget *summary = control(MainControl::cmdSummary);
     summary->setMinimumWidth(
         summary->fontMetrics().horizontalAdvance(QStringLiteral("GoTo Stand Projections")) + 24);
-    QPushButton *npv = addButton(MainControl::cmdNPV, text::buttonNpv());
-    npv->setToolTip(text::hintNpv());
-    npv->setEnabled(false);
-    QPushButton *deleteRows = addButton(MainControl::cmdDeleteRows, text::buttonDeleteRows());
-    deleteRows->setToolTip(text::hintDeleteRows());
-    commands->addWidget(grow, 0, 0);
-    commands->addWidget(thin, 1, 0);
-    commands->addWidget(assort, 2, 0);
-    commands->addWidget(useRow, 3, 0);
-    commands->addWidget(clear, 4, 0);
-    commands->addWidget(clearAll, 5, 0);
-    commands->addWidget(finalCut, 0, 1);
-    commands->addWidget(summary, 1, 1);
-    commands->addWidget(npv, 2, 1);
-    commands->addWidget(deleteRows, 3, 1);
-    commands->setRowStretch(6, 1);
-    QPushButton *prices =
-        addButton(MainControl::cmdShowTimberPrice, workflow::text::showTimberPrices());
-    commands->addWidget(prices, 4, 1);
+    control(MainControl::cmdNPV)->setEnabled(false);
     // Beside NPV: the value of the rotation, its best age, the optimiser and
     // the uncertainty, in a window of its own.
     m_economicsButton = new QPushButton(economics::economicstext::buttonEconomics(), this);
     m_economicsButton->setObjectName(QStringLiteral("cmdEconomics"));
     m_economicsButton->setToolTip(economics::economicstext::hintEconomics());
     commands->addWidget(m_economicsButton, 5, 1);
-    connect(prices, &QPushButton::clicked, this, [this] {
-        if (m_logic != nullptr) {
-            m_logic->cmdShowTimberPrice_Click();
-        }
-    });
+    commands->setRowStretch(6, 1);
     row->addLayout(commands);
-    onClick(MainControl::cmdFinalCut, &workflow::MainWindowLogic::cmdFinalCut_Click);
-    onClick(MainControl::cmdSummary, &workflow::MainWindowLogic::cmdSummary_Click);
-    onClick(MainControl::cmdNPV, &workflow::MainWindowLogic::cmdNPV_Click);
-    onClick(MainControl::cmdDeleteRows, &workflow::MainWindowLogic::cmdDeleteRows_Click);
-
-    connect(grow, &QPushButton::clicked, this, [this] {
-        if (m_logic != nullptr) {
-            m_logic->cmdGrow_Click();
-        }
-    });
-    connect(thin, &QPushButton::clicked, this, [this] {
-        if (m_logic != nullptr) {
-            m_logic->cmdThin_Click();
-        }
-    });
-    connect(assort, &QPushButton::clicked, this, [this] {
-        if (m_logic != nullptr) {
-            m_logic->cmdAssort_Click();
-        }
-    });
-    connect(useRow, &QPushButton::clicked, this, [this] {
-        if (m_logic != nullptr) {
-            m_logic->UseFlxRow();
-        }
-    });
-    connect(clear, &QPushButton::clicked, this, [this] {
-        if (m_logic != nullptr) {
-            m_logic->cmdClear_Click();
-        }
-    });
-    connect(clearAll, &QPushButton::clicked, this, [this] {
-        if (m_logic != nullptr) {
-            m_logic->ClearAll();
-        }
-    });
 
     // Keyboard order follows the stand description, then the projection.
-    const MainControl order[] = {MainControl::txtFromA,
-                                 MainControl::txtFromN,
-                                 MainControl::txtFromH,
-                                 MainControl::txtFromB,
-                                 MainControl::txtFromD,
-                                 MainControl::txtToA,
-                                 MainControl::txtByA,
-                                 MainControl::txtNetArea,
-                                 MainControl::cmdGrow,
-                                 MainControl::cmdThin,
-                                 MainControl::cmdAssort,
-                                 MainControl::cmdUseRow,
-                                 MainControl::cmdClear,
-                                 MainControl::cmdClearAll,
-                                 MainControl::cmdFinalCut,
-                                 MainControl::cmdSummary,
-                                 MainControl::cmdNPV,
-                                 MainControl::cmdDeleteRows,
-                                 MainControl::cmdShowTimberPrice};
-    for (std::size_t i = 1; i < std::size(order); ++i) {
+    std::vector<MainControl> order = {MainControl::txtFromA, MainControl::txtFromN,
+                                      MainControl::txtFromH, MainControl::txtFromB,
+                                      MainControl::txtFromD, MainControl::txtToA,
+                                      MainControl::txtByA,   MainControl::txtNetArea};
+    for (const Command &c : kCommands) {
+        order.push_back(c.control);
+    }
+    for (std::size_t i = 1; i < order.size(); ++i) {
         setTabOrder(control(order[i - 1]), control(order[i]));
     }
     return panel;
@@ -404,14 +377,6 @@ void MainWindow::buildGrid() {
     m_grid->verticalHeader()->setFixedWidth(
         m_grid->fontMetrics().horizontalAdvance(QStringLiteral("AC yr")) + 16);
     m_grid->horizontalHeader()->setMinimumSectionSize(kSeparatorWidth);
-}
-
-void MainWindow::onClick(MainControl c, void (workflow::MainWindowLogic::*handler)()) {
-    connect(static_cast<QPushButton *>(control(c)), &QPushButton::clicked, this, [this, handler] {
-        if (m_logic != nullptr) {
-            (m_logic->*handler)();
-        }
-    });
 }
 
 void MainWindow::buildSummaryGrid() {
@@ -481,6 +446,11 @@ void MainWindow::setEnabled(MainControl c, bool enabled) {
     if (QWidget *w = control(c)) {
         w->setEnabled(enabled);
     }
+}
+
+bool MainWindow::isEnabled(MainControl c) const {
+    const QWidget *w = control(c);
+    return w == nullptr || w->isEnabled();
 }
 
 void MainWindow::setHint(MainControl c, const QString &hint) {
@@ -656,7 +626,7 @@ void MainWindow::selectionFromLogic() {
     if (m_logic == nullptr || m_model == nullptr) {
         return;
     }
-    const workflow::ProjectionTable &table = m_logic->table();
+    const work::ProjectionTable &table = m_logic->table();
     m_followingLogic = true;
     QItemSelectionModel *selection = m_grid->selectionModel();
     const int current = table.currentRow();

@@ -81,9 +81,11 @@ public:
     void setText(workflow::MainControl control, const QString &text) override;
     using QMainWindow::setEnabled;
     void setEnabled(workflow::MainControl control, bool enabled) override;
+    bool isEnabled(workflow::MainControl control) const override;
     void setHint(workflow::MainControl control, const QString &hint) override;
     void focus(workflow::MainControl control) override;
     void setCaption(const QString &caption) override;
+    QString caption() const override { return windowTitle(); }
     void setBusy(bool busy) override;
     void tableChanged(int firstRow) override;
     void scrollToRow(int row) override;
@@ -103,8 +105,6 @@ private:
     void buildSummaryGrid();
     /// Reads the summary again and sizes its columns to captions and values.
     void fitSummary();
-    /// Connects a command button to its handler of the logic.
-    void onClick(workflow::MainControl control, void (workflow::MainWindowLogic::*handler)());
     QLineEdit *addField(workflow::MainControl control);
     QLabel *addResult(workflow::MainControl control);
     QPushButton *addButton(workflow::MainControl control, const QString &caption);

@@ -121,7 +121,7 @@ NpvWindow::NpvWindow(QWidget *main) : QDialog(main) {
 void NpvWindow::attach(economics::NpvWindowLogic &logic) {
     m_logic = &logic;
     m_model = new StringGridModel([&logic] { return logic.grid(); }, this);
-    m_model->setTextColumns({economics::kCfYear, economics::kCfOperation});
+    m_model->setTextColumns({work::kCfYear, work::kCfOperation});
     m_grid->setModel(m_model);
     connect(m_grid->selectionModel(), &QItemSelectionModel::currentChanged, this,
             [this](const QModelIndex &current) {
@@ -186,7 +186,7 @@ void NpvWindow::fitColumns() {
                                          : caption;
         m_grid->resizeColumnToContents(c);
         const int width = std::max(m_grid->columnWidth(c), metrics.horizontalAdvance(widest) + 24);
-        m_grid->setColumnWidth(c, c == economics::kCfOperation ? std::max(width, 160) : width);
+        m_grid->setColumnWidth(c, c == work::kCfOperation ? std::max(width, 160) : width);
         total += m_grid->columnWidth(c);
     }
     header->setFixedHeight(metrics.height() * 2 + 14);

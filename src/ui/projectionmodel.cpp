@@ -7,13 +7,13 @@
 
 namespace arbolex::ui {
 
-using workflow::RowKind;
+using work::RowKind;
 
 namespace {
 
 bool isSeparatorColumn(int tableColumn) {
-    return tableColumn == workflow::kColSeparator1 || tableColumn == workflow::kColSeparator2 ||
-           tableColumn == workflow::kColSeparator3;
+    return tableColumn == work::kColSeparator1 || tableColumn == work::kColSeparator2 ||
+           tableColumn == work::kColSeparator3;
 }
 
 /// Thinning rows stand out from the growth rows around them.
@@ -38,7 +38,7 @@ QColor separatorTint() {
 
 } // namespace
 
-ProjectionModel::ProjectionModel(const workflow::ProjectionTable &table, QObject *parent)
+ProjectionModel::ProjectionModel(const work::ProjectionTable &table, QObject *parent)
     : QAbstractTableModel(parent), m_table(table), m_rows(table.rowCount() - 1),
       m_columns(table.visibleColumns()) {}
 
@@ -54,7 +54,7 @@ QVariant ProjectionModel::data(const QModelIndex &index, int role) const {
     if (!index.isValid() || index.row() >= m_rows || index.column() >= columnCount()) {
         return {};
     }
-    const workflow::TableRow &row = m_table.row(index.row() + 1);
+    const work::TableRow &row = m_table.row(index.row() + 1);
     const int column = tableColumn(index.column());
     const bool separator = isSeparator(index.column());
     if (row.isText() && index.column() > 0) {
@@ -99,7 +99,7 @@ QVariant ProjectionModel::data(const QModelIndex &index, int role) const {
     }
 }
 
-QVariant ProjectionModel::textRowData(const workflow::TableRow &row, int column, int role) const {
+QVariant ProjectionModel::textRowData(const work::TableRow &row, int column, int role) const {
     switch (role) {
     case Qt::DisplayRole: {
         // The report reads as one line across the row (item column 1 spans it).
@@ -169,7 +169,7 @@ QVariant ProjectionModel::headerData(int section, Qt::Orientation orientation, i
     case Qt::DisplayRole:
         return m_table.caption(column);
     case GroupRole:
-        return workflow::ProjectionTable::groupCaption(column);
+        return work::ProjectionTable::groupCaption(column);
     case SeparatorRole:
         return isSeparator(section);
     default:

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "workflow/projectiontable.hpp"
+#include "work/projectiontable.hpp"
 
 #include <QAbstractTableModel>
 #include <QTableView>
@@ -21,7 +21,7 @@ public:
     /// Item and header role: true for the narrow separator columns.
     static constexpr int SeparatorRole = Qt::UserRole + 2;
 
-    explicit ProjectionModel(const workflow::ProjectionTable &table, QObject *parent = nullptr);
+    explicit ProjectionModel(const work::ProjectionTable &table, QObject *parent = nullptr);
 
     int rowCount(const QModelIndex &parent = {}) const override;
     int columnCount(const QModelIndex &parent = {}) const override;
@@ -45,9 +45,9 @@ public:
     void spanTextRows(QTableView &view) const;
 
 private:
-    QVariant textRowData(const workflow::TableRow &row, int column, int role) const;
+    QVariant textRowData(const work::TableRow &row, int column, int role) const;
 
-    const workflow::ProjectionTable &m_table;
+    const work::ProjectionTable &m_table;
     /// What the views were last told: the data rows and the visible columns.
     int m_rows = 0;
     std::vector<int> m_columns;

@@ -1,6 +1,5 @@
 #include "ui/reportmenu.hpp"
 
-#include "charts/reportcontent.hpp"
 #include "charts/reportfailure.hpp"
 #include "charts/reportmessages.hpp"
 #include "report/reportwriter.hpp"
@@ -47,8 +46,7 @@ bool ReportMenu::exportReport(const QString &path) {
         return false;
     }
     QApplication::setOverrideCursor(Qt::WaitCursor);
-    const int pages =
-        report::writeReportPdf(charts::reportContent(*m_logic), path, report::printedNow());
+    const int pages = report::writeReportPdf(content(), path, report::printedNow());
     QApplication::restoreOverrideCursor();
     if (pages == 0) {
         charts::reportOutputFailure(
@@ -56,6 +54,11 @@ bool ReportMenu::exportReport(const QString &path) {
             charts::text::writeFailed(path), QStringLiteral(" in frmMain.mnuExportReport_Click()"));
     }
     return pages > 0;
+}
+
+charts::ReportContent ReportMenu::content() const {
+    return m_economics != nullptr ? charts::reportContent(m_logic->work(), *m_economics)
+                                  : charts::reportContent(m_logic->work());
 }
 
 void ReportMenu::chooseAndExport() {
@@ -82,8 +85,7 @@ void ReportMenu::print() {
         return;
     }
     QApplication::setOverrideCursor(Qt::WaitCursor);
-    const int pages =
-        report::paintReport(printer, charts::reportContent(*m_logic), report::printedNow());
+    const int pages = report::paintReport(printer, content(), report::printedNow());
     QApplication::restoreOverrideCursor();
     if (pages == 0) {
         charts::reportOutputFailure(m_logic->interactive(), m_logic->errorLog(),

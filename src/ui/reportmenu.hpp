@@ -1,11 +1,16 @@
 #pragma once
 
+#include "charts/reportcontent.hpp"
+
 #include <QObject>
 
 class QAction;
 class QMainWindow;
 class QMenu;
 
+namespace arbolex::economics {
+class EconomicsWindowLogic;
+}
 namespace arbolex::workflow {
 class MainWindowLogic;
 }
@@ -25,6 +30,9 @@ public:
     void addTo(QMenu &file);
 
     void attach(workflow::MainWindowLogic &logic) { m_logic = &logic; }
+    /// The economics window's logic that values the rotation for the report's
+    /// economics page; without it the report has none.
+    void attachEconomics(economics::EconomicsWindowLogic &economics) { m_economics = &economics; }
 
     /// Writes the report to `path`; false (after telling the user and the
     /// error log) when it cannot be written.
@@ -36,9 +44,12 @@ public:
 private:
     void chooseAndExport();
     void print();
+    /// What the report shows of the work as it stands.
+    charts::ReportContent content() const;
 
     QMainWindow &m_window;
     workflow::MainWindowLogic *m_logic = nullptr;
+    economics::EconomicsWindowLogic *m_economics = nullptr;
     QAction *m_export = nullptr;
     QAction *m_print = nullptr;
 };

@@ -8,11 +8,9 @@
 #include "workflow/mainwindowlogic.hpp"
 
 #include <QCheckBox>
-#include <QCloseEvent>
 #include <QGridLayout>
 #include <QGroupBox>
 #include <QHBoxLayout>
-#include <QKeyEvent>
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
@@ -44,12 +42,9 @@ struct DetailRow {
 
 } // namespace
 
-ThinWindow::ThinWindow(QWidget *main) : QDialog(main) {
-    setObjectName(QStringLiteral("frmThin"));
-    setWindowTitle(text::thinTitle());
-    setModal(false);
-    setSizeGripEnabled(false);
-
+ThinWindow::ThinWindow(QWidget *main)
+    : ThinToolWindow(main, QStringLiteral("frmThin"), text::thinTitle(),
+                     &ThinWindowLogic::cmdCancel_Click) {
     auto *left = new QVBoxLayout;
     left->setSpacing(10);
     left->addWidget(buildDetails());
@@ -76,10 +71,6 @@ ThinWindow::ThinWindow(QWidget *main) : QDialog(main) {
     }
 }
 
-void ThinWindow::attach(ThinWindowLogic &logic) {
-    m_logic = &logic;
-}
-
 // ---- Building the window ------------------------------------------------------------
 
 QLineEdit *ThinWindow::addField(ThinControl control, int digits) {
@@ -87,7 +78,7 @@ QLineEdit *ThinWindow::addField(ThinControl control, int digits) {
     field->setObjectName(thinning::controlName(control));
     field->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
     field->setFixedWidth(field->fontMetrics().horizontalAdvance(QString(digits, u'0')) + 16);
-    field->installEventFilter(this);
+    watchKeys(field);
     m_controls.at(slot(control)) = field;
     return field;
 }
@@ -117,12 +108,6 @@ QPushButton *ThinWindow::addButton(ThinControl control, const QString &caption,
     button->setMinimumWidth(button->fontMetrics().horizontalAdvance(text::buttonThinAccept()) + 40);
     m_controls.at(slot(control)) = button;
     return button;
-}
-
-void ThinWindow::run(void (ThinWindowLogic::*handler)()) {
-    if (m_logic != nullptr) {
-        (m_logic->*handler)();
-    }
 }
 
 QWidget *ThinWindow::buildDetails() {
@@ -179,8 +164,8 @@ QWidget *ThinWindow::buildDetails() {
         button->setAutoDefault(false);
         button->setFixedWidth(m_controls.at(slot(ThinControl::lblPreN))->width());
         connect(button, &QPushButton::clicked, this, [this, c] {
-            if (m_logic != nullptr) {
-                m_logic->cmdAssort_Click(c);
+            if (logic() != nullptr) {
+                logic()->cmdAssort_Click(c);
             }
         });
         m_assortButtons.at(static_cast<std::size_t>(c)) = button;
@@ -301,50 +286,8 @@ void ThinWindow::focus(ThinControl c) {
     focusControl(control(c));
 }
 
-void ThinWindow::setCaption(const QString &caption) {
-    setWindowTitle(caption);
-}
-
-void ThinWindow::showCentred() {
-    showCentredOverParent(this);
-}
-
-void ThinWindow::close() {
-    hide();
-}
-
-bool ThinWindow::isShown() const {
-    return isVisible();
-}
-
-// ---- Closing ---------------------------------------------------------------------------------
-
-void ThinWindow::reject() {
-    if (m_logic != nullptr) {
-        m_logic->cmdCancel_Click();
-    } else {
-        QDialog::reject();
-    }
-}
-
-void ThinWindow::closeEvent(QCloseEvent *event) {
-    if (m_logic != nullptr && isVisible()) {
-        m_logic->cmdCancel_Click();
-    }
-    event->accept();
-}
-
-bool ThinWindow::eventFilter(QObject *watched, QEvent *event) {
-    if (event->type() == QEvent::KeyPress) {
-        const auto name = thinning::thinControlFromName(watched->objectName());
-        if (name && thinning::isThinField(*name) && control(*name) == watched) {
-            // Typed characters go through the key filter.
-            if (refusedByKeyFilter(*static_cast<QKeyEvent *>(event))) {
-                return true;
-            }
-        }
-    }
-    return QDialog::eventFilter(watched, event);
+bool ThinWindow::refusesKey(int /*field*/, const QKeyEvent &key) {
+    return refusedByKeyFilter(key);
 }
 
 } // namespace arbolex::ui

@@ -1,8 +1,7 @@
 #pragma once
 
 #include "thinning/ithinview.hpp"
-
-#include <QDialog>
+#include "ui/toolwindow.hpp"
 
 #include <array>
 
@@ -17,19 +16,20 @@ class ThinWindowLogic;
 
 namespace arbolex::ui {
 
+using ThinToolWindow = ToolWindow<thinning::IThinView, thinning::ThinWindowLogic>;
+
 /// The thinning window `frmThin`: the stand before the thinning, the removal
 /// and the stand after it side by side, the commands and the loop frame
 /// `fraLoop`. It is not modal, so the projection table stays in view while a
 /// thinning is prescribed. Everything it shows is set by its logic through
 /// IThinView; everything the user does goes straight to the logic's handlers.
-class ThinWindow : public QDialog, public thinning::IThinView {
+/// Escape and the title bar's close button are Cancel; typed characters of
+/// the fields go through the numeric key filter.
+class ThinWindow : public ThinToolWindow {
     Q_OBJECT
 public:
     /// `main` is the window it opens over.
     explicit ThinWindow(QWidget *main = nullptr);
-
-    /// Binds the window to its logic, which must outlive the window.
-    void attach(thinning::ThinWindowLogic &logic);
 
     /// Assort button `index` (0 pre-thin, 1 thinning, 2 post-thin).
     QPushButton *assortButton(int index) const {
@@ -47,21 +47,9 @@ public:
     bool isChecked(thinning::ThinControl control) const override;
     void setChecked(thinning::ThinControl control, bool checked) override;
     void focus(thinning::ThinControl control) override;
-    void setCaption(const QString &caption) override;
-    /// Shows the window centred over the main window and brings it to the front.
-    void showCentred() override;
-    /// Hides the window; the logic has already done what closing means.
-    void close() override;
-    bool isShown() const override;
-
-    /// Escape: the same as Cancel.
-    void reject() override;
 
 protected:
-    /// The title bar's close button: the same as Cancel.
-    void closeEvent(QCloseEvent *event) override;
-    /// Typed characters of the fields go through the numeric key filter.
-    bool eventFilter(QObject *watched, QEvent *event) override;
+    bool refusesKey(int field, const QKeyEvent &key) override;
 
 private:
     QWidget *buildDetails();
@@ -71,10 +59,7 @@ private:
     QLabel *addResult(thinning::ThinControl control);
     QPushButton *addButton(thinning::ThinControl control, const QString &caption,
                            const QString &hint);
-    /// Runs `handler` of the logic, once it is attached.
-    void run(void (thinning::ThinWindowLogic::*handler)());
 
-    thinning::ThinWindowLogic *m_logic = nullptr;
     std::array<QWidget *, thinning::kThinControlCount> m_controls{};
     /// Captions inside the loop frame, greyed with the frame (the switch
     /// itself stays live, or the loop could never be switched on again).

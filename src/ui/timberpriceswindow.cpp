@@ -5,11 +5,9 @@
 #include "ui/controltext.hpp"
 #include "ui/fieldinput.hpp"
 
-#include <QCloseEvent>
 #include <QGridLayout>
 #include <QGroupBox>
 #include <QHBoxLayout>
-#include <QKeyEvent>
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
@@ -19,10 +17,10 @@
 namespace arbolex::ui {
 
 using economics::kPriceBlockCount;
-using economics::kPriceClassCount;
 using economics::TimberPricesControl;
 using economics::TimberPricesItem;
 using economics::TimberPricesWindowLogic;
+using prices::kPriceClassCount;
 
 namespace {
 
@@ -67,12 +65,10 @@ QFont bold(QFont font) {
 
 } // namespace
 
-TimberPricesWindow::TimberPricesWindow(QWidget *main) : QDialog(main) {
-    setObjectName(QStringLiteral("frmTimberPrices"));
-    setWindowTitle(economics::text::timberPricesCaption());
-    setModal(false);
-    setSizeGripEnabled(false);
-
+TimberPricesWindow::TimberPricesWindow(QWidget *main)
+    : TimberPricesToolWindow(main, QStringLiteral("frmTimberPrices"),
+                             economics::text::timberPricesCaption(),
+                             &TimberPricesWindowLogic::cmdClosePricesList_Click) {
     // Wide enough for the longest option caption beside its indicator.
     m_blockWidth = fontMetrics().horizontalAdvance(economics::text::optNPVprices()) + 36;
 
@@ -101,16 +97,6 @@ TimberPricesWindow::TimberPricesWindow(QWidget *main) : QDialog(main) {
     setTabOrder(previous, control({TimberPricesControl::cmdChangePrices, 0}));
     setTabOrder(control({TimberPricesControl::cmdChangePrices, 0}),
                 control({TimberPricesControl::cmdClosePricesList, 0}));
-}
-
-void TimberPricesWindow::attach(TimberPricesWindowLogic &logic) {
-    m_logic = &logic;
-}
-
-void TimberPricesWindow::run(void (TimberPricesWindowLogic::*handler)()) {
-    if (m_logic != nullptr) {
-        (m_logic->*handler)();
-    }
 }
 
 // ---- Building the window ------------------------------------------------------------
@@ -172,8 +158,8 @@ QLayout *TimberPricesWindow::buildLists() {
         // button does not.
         const TimberPricesControl which = kOptions[b];
         connect(option, &QRadioButton::clicked, this, [this, which] {
-            if (m_logic != nullptr) {
-                m_logic->press(which);
+            if (logic() != nullptr) {
+                logic()->press(which);
             }
         });
         grid->addWidget(option, kOptionRow, column, Qt::AlignLeft | Qt::AlignTop);
@@ -194,7 +180,7 @@ QLayout *TimberPricesWindow::buildLists() {
             field->setReadOnly(true);
             field->setContextMenuPolicy(Qt::NoContextMenu);
             field->setAcceptDrops(false);
-            field->installEventFilter(this);
+            watchKeys(field); // in the order of their index
             m_fields.at(at(index)) = field;
             grid->addWidget(field, kFirstPriceRow + k, column, Qt::AlignHCenter);
         }
@@ -290,71 +276,18 @@ void TimberPricesWindow::setChecked(TimberPricesControl option, bool checked) {
 }
 
 void TimberPricesWindow::setUserPricesEditable(bool editable) {
-    const int first = economics::kUserPrices * kPriceClassCount;
+    const int first = prices::kUserPrices * kPriceClassCount;
     for (int k = 0; k < kPriceClassCount; ++k) {
         m_fields.at(at(first + k))->setReadOnly(!editable);
     }
 }
 
-void TimberPricesWindow::setCaption(const QString &caption) {
-    setWindowTitle(caption);
-}
+// ---- Keys ---------------------------------------------------------------------------------
 
-void TimberPricesWindow::showCentred() {
-    showCentredOverParent(this);
-}
-
-void TimberPricesWindow::close() {
-    hide();
-}
-
-bool TimberPricesWindow::isShown() const {
-    return isVisible();
-}
-
-// ---- Closing and keys -------------------------------------------------------------------------
-
-void TimberPricesWindow::reject() {
-    if (m_logic != nullptr) {
-        m_logic->cmdClosePricesList_Click();
-    } else {
-        QDialog::reject();
-    }
-}
-
-void TimberPricesWindow::closeEvent(QCloseEvent *event) {
-    if (m_logic != nullptr && isVisible()) {
-        m_logic->cmdClosePricesList_Click();
-    }
-    event->accept();
-}
-
-int TimberPricesWindow::fieldIndex(const QObject *object) const {
-    for (std::size_t i = 0; i < m_fields.size(); ++i) {
-        if (m_fields[i] == object) {
-            return static_cast<int>(i);
-        }
-    }
-    return -1;
-}
-
-bool TimberPricesWindow::eventFilter(QObject *watched, QEvent *event) {
-    if (event->type() != QEvent::KeyPress || m_logic == nullptr) {
-        return QDialog::eventFilter(watched, event);
-    }
-    const int field = fieldIndex(watched);
-    if (field < 0) {
-        return QDialog::eventFilter(watched, event);
-    }
-    const auto &key = *static_cast<QKeyEvent *>(event);
-    if (isPriceFieldShortcut(key)) {
-        return true;
-    }
-    const QChar typed = priceFieldKey(key);
-    if (!typed.isNull() && !m_logic->txtTimbVal_KeyPress(field, typed)) {
-        return true;
-    }
-    return QDialog::eventFilter(watched, event);
+bool TimberPricesWindow::refusesKey(int field, const QKeyEvent &key) {
+    return logic() != nullptr && refusedPriceKey(key, [&](QChar typed) {
+               return logic()->txtTimbVal_KeyPress(field, typed);
+           });
 }
 
 } // namespace arbolex::ui

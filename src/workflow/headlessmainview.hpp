@@ -26,10 +26,10 @@ public:
     QRect placement() const override { return m_placement; }
     void setPlacement(const QRect &p) override { m_placement = p; }
 
-    bool isEnabled(MainControl c) const { return m_enabled.at(index(c)); }
+    bool isEnabled(MainControl c) const override { return m_enabled.at(index(c)); }
     QString hint(MainControl c) const { return m_hint.at(index(c)); }
     MainControl focused() const { return m_focus; }
-    QString caption() const { return m_caption; }
+    QString caption() const override { return m_caption; }
     bool busy() const { return m_busy; }
     int topRow() const { return m_topRow; }
     int activeModel() const { return m_activeModel; }

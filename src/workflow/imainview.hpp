@@ -14,10 +14,12 @@ public:
     virtual QString text(MainControl control) const = 0;
     virtual void setText(MainControl control, const QString &text) = 0;
     virtual void setEnabled(MainControl control, bool enabled) = 0;
+    virtual bool isEnabled(MainControl control) const = 0;
     /// The hint (tool tip) of a control.
     virtual void setHint(MainControl control, const QString &hint) = 0;
     virtual void focus(MainControl control) = 0;
     virtual void setCaption(const QString &caption) = 0;
+    virtual QString caption() const = 0;
     /// The hourglass pointer while a command runs.
     virtual void setBusy(bool busy) = 0;
     /// The projection table changed from data row `firstRow` on (1 = all).

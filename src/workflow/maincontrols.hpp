@@ -1,5 +1,7 @@
 #pragma once
 
+#include "work/worksnapshot.hpp"
+
 #include <QString>
 
 #include <optional>
@@ -45,5 +47,14 @@ QString controlName(MainControl control);
 std::optional<MainControl> mainControlFromName(const QString &name);
 /// True for the text fields whose keys go through the numeric key filter.
 bool isNumericField(MainControl control);
+
+/// The work field a numeric field shows (they are the same eight, in order).
+inline work::WorkField workFieldOf(MainControl control) {
+    return static_cast<work::WorkField>(control);
+}
+/// The field that shows a work field.
+inline MainControl controlOf(work::WorkField field) {
+    return static_cast<MainControl>(field);
+}
 
 } // namespace arbolex::workflow

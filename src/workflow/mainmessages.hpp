@@ -65,7 +65,7 @@ inline QString rangeBasalArea() {
     return stand(rotation::standtext::kRangeBasalArea);
 }
 inline QString rangeToAgeLead() {
-    return QStringLiteral("FAULT - Grow To AGE not in acceptable range [10,");
+    return stand(rotation::standtext::kRangeToAgeLead);
 }
 inline QString maximumHeight() {
     return stand(rotation::standtext::kMaximumHeight);
@@ -80,7 +80,7 @@ inline QString changesNotAllowed() {
            QStringLiteral("use the Clear All button and enter the new informations.");
 }
 inline QString projectionFailed() {
-    return QStringLiteral("Error - unable to complete Projection (state inversion problem).");
+    return stand(rotation::standtext::kProjectionFailed);
 }
 inline QString transferFailed() {
     return QStringLiteral("ERROR - difficulty in transferring data.");
@@ -95,12 +95,6 @@ inline QString yieldClassAtClearfell() {
 }
 
 // Row labels
-inline QString rowLabelGrowth() {
-    return QStringLiteral("G yr");
-}
-inline QString rowLabelThinning() {
-    return QStringLiteral("T yr");
-}
 
 // Information
 inline QString speciesNotFound() {
@@ -128,14 +122,6 @@ inline QString showTimberPrices() {
 }
 
 // Final cut, summary and row deletion
-inline QString rowLabelFinalCut() {
-    return QStringLiteral("FC yr");
-}
-/// Text of the marker cell of the rows the summary carries (start, thinnings,
-/// final cut): a tab, blank on the screen and dropped by every copy.
-inline QString summaryMarker() {
-    return QStringLiteral("\t");
-}
 inline QString titleNpv() {
     return QStringLiteral("NPV");
 }
@@ -165,30 +151,6 @@ inline QString gotoStandProjections() {
 inline QString yieldClassHint() {
     return QStringLiteral("Yield Class: the culminated mean annual increment");
 }
-inline QString summaryLabelCaption() {
-    return QStringLiteral("Event");
-}
-inline QString summaryStart() {
-    return QStringLiteral("Start");
-}
-inline QString summaryThinning() {
-    return QStringLiteral("Thinning");
-}
-inline QString summaryFinalCut() {
-    return QStringLiteral("Final cut");
-}
-inline QString summaryTotalProduction() {
-    return QStringLiteral("Total production");
-}
-inline QString summaryTotalThinned() {
-    return QStringLiteral("Total thinned");
-}
-inline QString summaryMaximumMai() {
-    return QStringLiteral("Maximum MAI");
-}
-inline QString summaryYieldClass() {
-    return QStringLiteral("Yield class");
-}
 inline QString selectRowToDelete() {
     return QStringLiteral("FAULT - Select the first row to delete in the projection table.");
 }
@@ -197,11 +159,6 @@ inline QString confirmDelete(int first, int last) {
            QStringLiteral(" to ") + QString::number(last) +
            QStringLiteral(" of the projection table?") + QStringLiteral("\r\n") +
            QStringLiteral("The projection will go on from the row before them.");
-}
-
-/// "O.R." stands in both volume cells when the volume is 0 or less.
-inline QString outOfRange() {
-    return QStringLiteral("O.R.");
 }
 
 } // namespace arbolex::workflow::text

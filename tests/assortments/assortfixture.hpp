@@ -15,11 +15,6 @@ using assortments::AssortUserControl;
 /// categories windows attached, the shipped categories loaded.
 class AssortTest : public ThinningTest {
 protected:
-    AssortTest() {
-        logic.attachAssortments(&assort);
-        thin.attachAssortments(&assort);
-    }
-
     /// Opens the thinning window at 30 and previews a removal of `volume` m³/ha.
     void previewThinning(const QString &volume = QStringLiteral("60")) {
         openThinning();
@@ -32,7 +27,7 @@ protected:
         QStringList labels;
         bool after = false;
         for (int r = 1; r <= logic.table().lastRow(); ++r) {
-            const workflow::TableRow &row = logic.table().row(r);
+            const work::TableRow &row = logic.table().row(r);
             if (after) {
                 labels << row.label;
             }
@@ -41,10 +36,8 @@ protected:
         return labels;
     }
 
-    assortments::HeadlessAssortView assortView;
-    assortments::AssortWindowLogic assort{logic, assortView, interactive};
-    assortments::HeadlessAssortUserView userView;
-    assortments::AssortUserLogic user{prices.data(), assort.session(), userView, interactive};
+    assortments::AssortWindowLogic &assort = session.assort();
+    assortments::AssortUserLogic &user = session.assortUser();
 };
 
 } // namespace arbolex::testing

@@ -11,6 +11,7 @@ namespace arbolex::testing {
 namespace {
 
 using namespace workflow;
+using namespace work;
 namespace at = assortments::text;
 
 double shown(const assortments::HeadlessAssortView &v, AssortControl c) {
@@ -214,7 +215,7 @@ TEST_F(AssortTest, UserCategoriesReportAndDevelopment) {
     previewThinning();
     thin.cmdAssort_Click(1);
     ASSERT_TRUE(assortView.userReport().has_value());
-    const assortments::UserReport &r = *assortView.userReport();
+    const assortments::UserReport r = *assortView.userReport();
     ASSERT_EQ(r.rows.size(), 2u);
     EXPECT_EQ(r.rows[0][0], QStringLiteral("Pulpwood"));
     EXPECT_EQ(r.rows[1][0], QStringLiteral("Stakes"));

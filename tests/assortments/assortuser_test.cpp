@@ -20,7 +20,7 @@ TEST_F(AssortTest, CategoriesWindowEditsTheCategories) {
     user.press(AssortUserControl::cmdOK, 0);
     ASSERT_TRUE(interactive.messages.isEmpty());
     EXPECT_FALSE(userView.isShown());
-    const economics::UserCategory &c = prices.data().categories[3];
+    const prices::UserCategory &c = prices.data().categories[3];
     EXPECT_EQ(c.name, QStringLiteral("Fencing, round"));
     EXPECT_EQ(c.bigEnd, 13.0f);
     EXPECT_TRUE(c.inUse);

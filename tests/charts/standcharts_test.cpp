@@ -2,8 +2,8 @@
 // of the MAI with its yield class, and the year a cash flow pays back.
 #include "charts/chartmessages.hpp"
 #include "charts/standcharts.hpp"
-#include "economics/mdlnpv.hpp"
-#include "workflow/projectiontable.hpp"
+#include "work/mdlnpv.hpp"
+#include "work/projectiontable.hpp"
 
 #include <gtest/gtest.h>
 
@@ -13,8 +13,8 @@ namespace {
 using charts::ChartData;
 using charts::ChartPoint;
 using charts::ChartSeries;
-using workflow::RowKind;
-using workflow::TableRow;
+using work::RowKind;
+using work::TableRow;
 
 /// A stand row: age, standing stocking, basal area, volume, and what a
 /// thinning on the row removed; increments as given (CAI < 0: none).
@@ -23,7 +23,7 @@ TableRow standRow(float age, float stocking, float basalArea, float volume,
                   double mai = 0.0) {
     TableRow row;
     row.kind = kind;
-    for (int c = 0; c < workflow::kColumnCount; ++c) {
+    for (int c = 0; c < work::kColumnCount; ++c) {
         row.cells.append(QString());
     }
     row.record.age = age;
@@ -36,11 +36,11 @@ TableRow standRow(float age, float stocking, float basalArea, float volume,
         row.record.removedStocking = 400.0f;
         row.record.removedBasalArea = 8.0f;
     }
-    row.numbers[workflow::kNumAge] = age;
-    row.numbers[workflow::kNumMai] = mai;
+    row.numbers[work::kNumAge] = age;
+    row.numbers[work::kNumMai] = mai;
     if (cai >= 0.0) {
-        row.numbers[workflow::kNumCai] = cai;
-        row.cells[workflow::kColCai] = QString::number(cai);
+        row.numbers[work::kNumCai] = cai;
+        row.cells[work::kColCai] = QString::number(cai);
     }
     return row;
 }
@@ -65,7 +65,7 @@ std::vector<std::pair<double, double>> pairs(const ChartSeries &s) {
 using Pairs = std::vector<std::pair<double, double>>;
 
 TEST(StandChartTest, ThinningAndFinalCutDropTheStandingCropButNotTotalProduction) {
-    workflow::ProjectionTable table;
+    work::ProjectionTable table;
     table.append(standRow(20, 2000, 30, 200));
     table.append(standRow(25, 1900, 36, 280));
     // Thinned at 25: 1500 stems, 28 m²/ha and 230 m³/ha left, 50 m³/ha removed.
@@ -95,12 +95,12 @@ TEST(StandChartTest, ThinningAndFinalCutDropTheStandingCropButNotTotalProduction
 }
 
 TEST(StandChartTest, AnEmptyTableDrawsNothing) {
-    EXPECT_TRUE(charts::standDevelopment(workflow::ProjectionTable()).empty());
-    EXPECT_TRUE(charts::increments(workflow::ProjectionTable()).empty());
+    EXPECT_TRUE(charts::standDevelopment(work::ProjectionTable()).empty());
+    EXPECT_TRUE(charts::increments(work::ProjectionTable()).empty());
 }
 
 TEST(IncrementChartTest, MarksTheFirstHighestMaiWithTheYieldClass) {
-    workflow::ProjectionTable table;
+    work::ProjectionTable table;
     table.append(standRow(20, 2000, 30, 200, RowKind::Growth, 0, -1, 10.0));
     table.append(standRow(25, 1900, 36, 300, RowKind::Growth, 0, 20, 12.6));
     // A thinning row repeats the MAI of its age and takes no part.
@@ -122,7 +122,7 @@ TEST(IncrementChartTest, MarksTheFirstHighestMaiWithTheYieldClass) {
 }
 
 TEST(IncrementChartTest, NoMarkWhileTheMaiStillRises) {
-    workflow::ProjectionTable table;
+    work::ProjectionTable table;
     table.append(standRow(20, 2000, 30, 200, RowKind::Growth, 0, -1, 10.0));
     table.append(standRow(25, 1900, 36, 300, RowKind::Growth, 0, 20, 12.0));
     const ChartData chart = charts::increments(table);
@@ -139,13 +139,13 @@ protected:
         flow.DimNPVArrays();
         for (std::size_t i = 0; i < discounted.size(); ++i) {
             const int year = static_cast<int>(i);
-            flow.setMatrix(economics::kCfCashFlow, year, 2.0 * discounted[i]);
-            flow.setMatrix(economics::kCfDiscountedCashFlow, year, discounted[i]);
+            flow.setMatrix(work::kCfCashFlow, year, 2.0 * discounted[i]);
+            flow.setMatrix(work::kCfDiscountedCashFlow, year, discounted[i]);
         }
         return charts::cashFlowChart(flow, flow.years());
     }
 
-    economics::CashFlow flow;
+    work::CashFlow flow;
 };
 
 TEST_F(CashFlowChartTest, BarsForYearsWithMoneyAndTheCumulativeDiscountedLine) {

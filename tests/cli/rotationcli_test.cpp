@@ -3,6 +3,7 @@
 // ones used, and a command line that names no rotation exits with 2.
 #include "cli/clirun.hpp"
 #include "mocks/programservices.hpp"
+#include "shell/testfiles.hpp"
 
 #include <QJsonArray>
 #include <QJsonDocument>
@@ -13,6 +14,7 @@
 
 #include <cmath>
 #include <ostream>
+#include <tuple>
 
 namespace {
 
@@ -78,7 +80,9 @@ TEST_F(RotationCliTest, JsonCarriesEveryFigureAndTheyHoldTogether) {
 }
 
 TEST_F(RotationCliTest, ChosenRotationAndPriceListAreTheOnesUsed) {
-    const QString unthinned = kStand + QStringLiteral(" --rotation 50");
+    // No cost at all, so that the revenue alone is valued.
+    const QString unthinned =
+        kStand + QStringLiteral(" --rotation 50 --establishment-cost 0 --annual-cost 0");
     const QJsonObject longTerm = json(unthinned);
     EXPECT_EQ(longTerm[QStringLiteral("rotation")].toInt(), 50);
     EXPECT_TRUE(longTerm[QStringLiteral("thinnings")].toArray().isEmpty());
@@ -95,6 +99,49 @@ TEST_F(RotationCliTest, ChosenRotationAndPriceListAreTheOnesUsed) {
     // Revenue only: no rate makes it worth nothing.
     EXPECT_TRUE(longTerm[QStringLiteral("irr")].isNull());
     EXPECT_EQ(longTerm[QStringLiteral("irr_note")].toString(), QStringLiteral("no sign change"));
+}
+
+TEST_F(RotationCliTest, CostsAreTheDataFoldersUnlessGiven) {
+    const auto record = [](const QJsonObject &o) {
+        const QJsonObject run = o[QStringLiteral("run")].toObject();
+        QStringList files;
+        for (const QJsonValue &f : run[QStringLiteral("files")].toArray()) {
+            files << f.toObject()[QStringLiteral("name")].toString();
+        }
+        return std::pair{run[QStringLiteral("inputs")].toObject(), files};
+    };
+    // The shipped costs: the establishment grant of a conifer plantation, no yearly cost.
+    const QJsonObject shipped = json(kThinned);
+    auto [inputs, files] = record(shipped);
+    EXPECT_EQ(inputs[QStringLiteral("establishment_cost")].toDouble(), 3045.0);
+    EXPECT_EQ(inputs[QStringLiteral("annual_cost")].toDouble(), 0.0);
+    EXPECT_TRUE(files.contains(QStringLiteral("Costs.qdm")));
+    const QJsonArray cashflow = shipped[QStringLiteral("cashflow")].toArray();
+    EXPECT_EQ(cashflow[0].toObject()[QStringLiteral("cost")].toDouble(), 3045.0);
+    EXPECT_EQ(cashflow[1].toObject()[QStringLiteral("cost")].toDouble(), 0.0);
+    EXPECT_TRUE(shipped[QStringLiteral("irr")].isDouble());
+
+    // An option wins over the file.
+    std::tie(inputs, files) = record(json(kThinned + QStringLiteral(" --annual-cost 20")));
+    EXPECT_EQ(inputs[QStringLiteral("establishment_cost")].toDouble(), 3045.0);
+    EXPECT_EQ(inputs[QStringLiteral("annual_cost")].toDouble(), 20.0);
+
+    // A damaged file stops a command that takes a cost from it; without a
+    // file the costs are 0.
+    const QString costs = QDir(m_data.path()).filePath(QStringLiteral("Costs.qdm"));
+    arbolex::testing::writeBytes(costs, "3045\r\ncheap\r\n");
+    const Outcome damaged = run(kThinned + QStringLiteral(" --establishment-cost 1000"));
+    EXPECT_EQ(damaged.exitCode, 2);
+    EXPECT_TRUE(damaged.err.contains(
+        QLatin1String("costs \"Costs.qdm\": the annual cost (value 2) is not a number")))
+        << damaged.err.toStdString();
+    std::tie(inputs, files) =
+        record(json(kThinned + QStringLiteral(" --establishment-cost 1000 --annual-cost 0")));
+    EXPECT_EQ(inputs[QStringLiteral("establishment_cost")].toDouble(), 1000.0);
+    ASSERT_TRUE(QFile::remove(costs));
+    std::tie(inputs, files) = record(json(kThinned));
+    EXPECT_EQ(inputs[QStringLiteral("establishment_cost")].toDouble(), 0.0);
+    EXPECT_FALSE(files.contains(QStringLiteral("Costs.qdm")));
 }
 
 TEST_F(RotationCliTest, TableCarriesTheSameFiguresAsJson) {
@@ -147,7 +194,7 @@ INSTANTIATE_TEST_SUITE_P(
         BadRotation{"--format xml", "--format takes tsv, csv or json"},
         BadRotation{"--thin-from 20 --thin-volume 40", "--thin-every is required"},
         BadRotation{"--thin-from 20 --thin-every 5 --thin-volume 900",
-                    "the thinning at age 20 removes 900.00 m3/ha"},
+                    "FAULT - Proposed thinning leads to negative or zero Volume."},
         BadRotation{"--thin-from 10 --thin-every 5 --thin-volume 40", "before the present age 15"},
         BadRotation{"--valuation price", "--valuation takes stand or assortment"},
         BadRotation{"--assortment-prices p.qdm",

@@ -2,7 +2,7 @@
 // apply the best regime and print the figures.
 #include "cli/runnerfixture.hpp"
 
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 
 namespace arbolex::testing {
 namespace {
@@ -11,8 +11,8 @@ class RunnerEconomicsTest : public RunnerTest {
 protected:
     RunnerEconomicsTest() {
         workflow::MainWindowLogic &main = session.main();
-        economics::GetPricesFromFiles(QStringLiteral(ARBOLEX_DATA_SOURCE), main.prices().data(),
-                                      main.errorLog());
+        prices::GetPricesFromFiles(QStringLiteral(ARBOLEX_DATA_SOURCE), main.prices().data(),
+                                   main.errorLog());
     }
 };
 
@@ -42,9 +42,9 @@ TEST_F(RunnerEconomicsTest, OptimiseApplyTheBestAndPrintTheFigures) {
     ASSERT_NE(best, lines.end()) << output.toStdString();
     const QString rotation = best->split(QLatin1Char('\t')).value(5);
     // The table now ends with the best regime's final cut.
-    const workflow::ProjectionTable &table = session.main().table();
-    EXPECT_TRUE(session.main().felled());
-    EXPECT_EQ(table.row(table.lastRow()).cells.value(workflow::kColAge), rotation);
+    const work::ProjectionTable &table = session.main().table();
+    EXPECT_TRUE(session.work().felled());
+    EXPECT_EQ(table.row(table.lastRow()).cells.value(work::kColAge), rotation);
     EXPECT_TRUE(lines.contains(QStringLiteral("lblRotation\t") + rotation +
                                QStringLiteral(" years (the final cut of the table)")))
         << output.toStdString();

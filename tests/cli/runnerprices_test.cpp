@@ -59,7 +59,7 @@ TEST_F(RunnerPricesTest, EditsChoosesAndPrintsThePrices) {
                                   QStringLiteral("Average private sector standing roundwood "
                                                  "prices (\u20ac / m3) for the period"),
                                   QStringLiteral("January 2025 to December 2025")}));
-    EXPECT_EQ(session.main().prices().priceSetInUse(), economics::kUserPrices);
+    EXPECT_EQ(session.main().prices().priceSetInUse(), prices::kUserPrices);
     EXPECT_EQ(session.main().prices().pricesInUse()[0], 12.5);
     EXPECT_FALSE(session.timberPricesView().isShown());
 }

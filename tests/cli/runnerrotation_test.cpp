@@ -1,10 +1,11 @@
 // A whole rotation scripted as a new user would write it: grow, thin, grow
 // on, fell, read the summary and value the cash flow.
 #include "cli/runnerfixture.hpp"
+#include "work/worktexts.hpp"
 
 #include "economics/npvmessages.hpp"
-#include "economics/pricedata.hpp"
-#include "economics/prices.hpp"
+#include "prices/pricedata.hpp"
+#include "prices/prices.hpp"
 #include "shell/vbformat.hpp"
 #include "shell/vbtext.hpp"
 
@@ -36,9 +37,9 @@ class RunnerRotationTest : public RunnerTest {
 protected:
     RunnerRotationTest() {
         workflow::MainWindowLogic &main = session.main();
-        economics::GetPricesFromFiles(QStringLiteral(ARBOLEX_DATA_SOURCE), main.prices().data(),
-                                      main.errorLog());
-        main.prices().selectPriceSet(economics::kCurrentPrices);
+        prices::GetPricesFromFiles(QStringLiteral(ARBOLEX_DATA_SOURCE), main.prices().data(),
+                                   main.errorLog());
+        main.prices().selectPriceSet(prices::kCurrentPrices);
     }
 
     /// What the script printed after the rotation, without its question line.
@@ -58,11 +59,11 @@ TEST_F(RunnerRotationTest, NetPresentValueAtTwoRatesAndWithAFirstYearCost) {
          QStringLiteral("print frmNPV.txtNPV"), QStringLiteral("set frmNPV.NPV_Grid(1,2) 1000"),
          QStringLiteral("press frmNPV.cmdNPV"), QStringLiteral("print frmNPV.txtNPV")});
     ASSERT_EQ(shown.size(), 3) << output.toStdString();
-    const economics::CashFlow &flow = session.main().cashFlow();
+    const work::CashFlow &flow = session.work().cashFlow();
     // At 0 % the net present value is the sum of the timber revenues.
     double revenue = 0.0;
     for (int i = 0; i < flow.years(); ++i) {
-        revenue += flow.matrix(economics::kCfTimberRevenue, i);
+        revenue += flow.matrix(work::kCfTimberRevenue, i);
     }
     EXPECT_EQ(shown[1], shell::formatNumber(revenue, u"#0"));
     EXPECT_EQ(shell::val(shown[1]) - shell::val(shown[2]), 1000.0);
@@ -78,7 +79,7 @@ TEST_F(RunnerRotationTest, SummaryGridAndClipboardPrintAsTabSeparatedText) {
     EXPECT_TRUE(shown[3].startsWith(QStringLiteral("Final cut\t60\t")));
     EXPECT_TRUE(shown.contains(QStringLiteral("MSG\tNet Present Value\t") +
                                economics::text::copiedToClipboard() + QStringLiteral("\t64")));
-    EXPECT_TRUE(shown.contains(economics::text::npvHeaders().join(u'\t')));
+    EXPECT_TRUE(shown.contains(work::text::cashFlowHeaders().join(u'\t')));
 }
 
 TEST_F(RunnerRotationTest, ASwitchedOffButtonCannotBePressed) {

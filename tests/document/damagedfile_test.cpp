@@ -77,7 +77,7 @@ const Damage kDamages[] = {
     {"SyntaxErrorHasItsPlace",
      [](const QByteArray &good) {
          QByteArray bad = good;
-         return bad.replace("\"version\": 1,", "\"version\": 1;");
+         return bad.replace("\"version\": 2,", "\"version\": 2;");
      },
      "line 3, column 18"},
     {"Empty", [](const QByteArray &) { return QByteArray(); }, "the file is empty"},
@@ -85,8 +85,14 @@ const Damage kDamages[] = {
      "damaged"},
     {"Foreign", [](const QByteArray &) { return QByteArray(R"({"type": "FeatureCollection"})"); },
      "not an ARBOLEX sub-compartment"},
-    {"NewerVersion", edit([](QJsonObject &top) { top[QStringLiteral("version")] = 2; }),
-     "newer version of ARBOLEX (format version 2"},
+    {"NewerVersion", edit([](QJsonObject &top) { top[QStringLiteral("version")] = 3; }),
+     "newer version of ARBOLEX (format version 3"},
+    {"NegativeEstablishmentCost", edit([](QJsonObject &top) {
+         QJsonObject cashFlow = top[QStringLiteral("cashFlow")].toObject();
+         cashFlow[QStringLiteral("establishmentCost")] = -3045;
+         top[QStringLiteral("cashFlow")] = cashFlow;
+     }),
+     "the cash flow: \"establishmentCost\" is -3045"},
     {"Model23", edit([](QJsonObject &top) { top[QStringLiteral("model")] = 23; }),
      "\"model\" is 23"},
     {"NegativeStocking",

@@ -50,7 +50,7 @@ TEST_F(DocumentTest, OpeningContinuesExactlyAsWithoutTheSave) {
     first->run(QLatin1String(kGrownAndThinned));
     const document::Document saved = first->work();
     bool kinds[3] = {false, false, false};
-    for (const workflow::TableRow &row : saved.rows) {
+    for (const work::TableRow &row : saved.rows) {
         kinds[static_cast<int>(row.kind)] = true;
     }
     ASSERT_TRUE(kinds[0] && kinds[1] && kinds[2]) << "growth, thinning and assortment rows";
@@ -86,27 +86,62 @@ TEST_F(DocumentTest, FileOpensWithItsFormatAndVersion) {
     session->run(QLatin1String(kGrownAndThinned));
     const QByteArray json = document::documentToJson(session->work());
     EXPECT_TRUE(json.startsWith("{\n    \"format\": \"ARBOLEX sub-compartment\",\n"
-                                "    \"version\": 1,\n"));
+                                "    \"version\": 2,\n"));
     QString reason;
     const auto read = document::documentFromJson(json, reason);
     ASSERT_TRUE(read) << reason.toStdString();
     expectSameDocument(*read, session->work());
 }
 
+TEST_F(DocumentTest, CostsAreSavedAndAnOlderFileOpensWithTheDefaults) {
+    auto first = newSession();
+    first->run(QLatin1String(kGrownAndThinned));
+    first->session.work().setCosts(2750.0, 12.5);
+    first->run(QStringLiteral("save ") + file(QStringLiteral("costs.arbolex")));
+    auto second = newSession();
+    second->run(QStringLiteral("open ") + file(QStringLiteral("costs.arbolex")));
+    EXPECT_EQ(second->session.work().establishmentCost(), 2750.0);
+    EXPECT_EQ(second->session.work().annualCost(), 12.5);
+
+    // A file written before the work had its costs: felled at 45, a cost of
+    // 2500 typed into the first year of its cash flow.
+    const QString old = file(QStringLiteral("version1.arbolex"));
+    ASSERT_TRUE(
+        QFile::copy(QStringLiteral(ARBOLEX_TEST_SOURCE "/document/version1-felled.arbolex"), old));
+    QString reason;
+    const auto read = document::readDocumentFile(old, reason);
+    ASSERT_TRUE(read) << reason.toStdString();
+    EXPECT_FALSE(read->establishmentCost.has_value());
+    auto third = newSession();
+    third->run(QStringLiteral("open ") + old);
+    const document::Document opened = third->work();
+    EXPECT_EQ(opened.rows, read->rows);
+    EXPECT_EQ(opened.cashFlow, read->cashFlow);
+    EXPECT_EQ(opened.interestRate, read->interestRate);
+    // The shipped costs, and nothing to save for it.
+    EXPECT_EQ(opened.establishmentCost, 3045.0);
+    EXPECT_EQ(opened.annualCost, 0.0);
+    EXPECT_FALSE(third->session.session().documents().isModified());
+    // Its figures: the stand today is worth what its cash flow says.
+    third->run(QStringLiteral("press cmdNPV\npress frmNPV.cmdNPV\npress cmdEconomics"));
+    ASSERT_TRUE(third->session.economics().valued());
+    EXPECT_EQ(*third->session.economics().value()->npv, third->session.work().cashFlow().SumNPV());
+}
+
 TEST_F(DocumentTest, ANumberJsonCannotHoldComesBack) {
     // A failed projection's row may hold what no JSON number can.
     document::Document d;
-    workflow::TableRow row;
-    row.kind = workflow::RowKind::Failed;
-    row.cells = QStringList(workflow::kColumnCount, QString());
+    work::TableRow row;
+    row.kind = work::RowKind::Failed;
+    row.cells = QStringList(work::kColumnCount, QString());
     row.record.volume = std::numeric_limits<float>::infinity();
-    row.numbers[workflow::kNumCai] = std::numeric_limits<double>::quiet_NaN();
+    row.numbers[work::kNumCai] = std::numeric_limits<double>::quiet_NaN();
     d.rows.push_back(row);
     QString reason;
     const auto read = document::documentFromJson(document::documentToJson(d), reason);
     ASSERT_TRUE(read) << reason.toStdString();
     EXPECT_TRUE(std::isinf(read->rows.at(0).record.volume));
-    EXPECT_TRUE(std::isnan(read->rows.at(0).numbers[workflow::kNumCai]));
+    EXPECT_TRUE(std::isnan(read->rows.at(0).numbers[work::kNumCai]));
 }
 
 TEST_F(DocumentTest, DocumentForAStandGrowsLikeTypedFields) {
@@ -117,7 +152,7 @@ TEST_F(DocumentTest, DocumentForAStandGrowsLikeTypedFields) {
     auto built = newSession();
     const rotation::Stand stand{0, 15.0f, 2500.0f, 7.0f, 20.0f};
     built->session.main().restore(document::documentForStand(
-        built->session.main(), stand, {QStringLiteral("Kilbrack"), {}, {}, {}}, 40, 5, 10.0));
+        built->session.work(), stand, {QStringLiteral("Kilbrack"), {}, {}, {}}, 40, 5, 10.0));
     built->run(QStringLiteral("press cmdGrow"));
     const auto builtRows = built->work().rows;
     const auto typedRows = typed->work().rows;
@@ -126,7 +161,7 @@ TEST_F(DocumentTest, DocumentForAStandGrowsLikeTypedFields) {
         EXPECT_EQ(builtRows[r].cells, typedRows[r].cells) << "row " << r + 1;
         EXPECT_EQ(builtRows[r].record, typedRows[r].record) << "row " << r + 1;
     }
-    EXPECT_EQ(built->session.main().identification().forest, QStringLiteral("Kilbrack"));
+    EXPECT_EQ(built->session.work().identification().forest, QStringLiteral("Kilbrack"));
 }
 
 } // namespace

@@ -24,7 +24,7 @@ protected:
 
     QSettings settings{QDir(dir.path()).filePath(QStringLiteral("settings.ini")),
                        QSettings::IniFormat};
-    document::DocumentController documents{logic, interactive, &settings};
+    document::DocumentController documents{work, logic, interactive, &settings};
 };
 
 TEST_F(DocumentControllerTest, CaptionCarriesTheNameAndTheUnsavedMark) {
@@ -116,8 +116,6 @@ TEST_F(DocumentControllerTest, RecentFilesKeepTheLastEightNewestFirst) {
 }
 
 TEST_F(DocumentControllerTest, TheIdentificationHeadsTheCopiedTable) {
-    shell::HeadlessClipboard clipboard;
-    logic.attachClipboard(&clipboard);
     grow();
     documents.setIdentification({QStringLiteral("Kilbrack"), QStringLiteral("12"),
                                  QStringLiteral("b"), QStringLiteral("Sitka spruce\nPeaty gley")});

@@ -33,7 +33,7 @@ struct ScriptedSession {
         EXPECT_TRUE(outcome.ok()) << outcome.line << ": " << outcome.error.toStdString();
         out.flush();
     }
-    document::Document work() { return session.main().snapshot(); }
+    document::Document work() { return session.work().snapshot(); }
 
     QString folder;
     QString output;

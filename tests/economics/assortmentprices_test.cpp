@@ -4,10 +4,10 @@
 #include "mocks/programservices.hpp"
 #include "shell/testfiles.hpp"
 
-#include "economics/assortmentpricefile.hpp"
 #include "economics/assortpricesmessages.hpp"
 #include "economics/assortpriceswindowlogic.hpp"
 #include "economics/headlessassortpricesview.hpp"
+#include "prices/assortmentpricefile.hpp"
 
 #include <gtest/gtest.h>
 
@@ -20,7 +20,7 @@ using economics::AssortPricesControl;
 using economics::AssortPricesItem;
 
 QString pricesFile(const QTemporaryDir &dir) {
-    return dir.filePath(QLatin1String(economics::kAssortmentPricesFile));
+    return dir.filePath(QLatin1String(prices::kAssortmentPricesFile));
 }
 
 // ---- Reader ---------------------------------------------------------------------------------
@@ -40,13 +40,12 @@ class AssortmentPriceFileTest : public ::testing::TestWithParam<BadFile>,
 TEST_P(AssortmentPriceFileTest, BadFileIsRefusedWholeAndSaysWhy) {
     prices.data().assortmentPrices = {1.0, 2.0, 3.0};
     writeBytes(pricesFile(dir), GetParam().bytes);
-    const economics::AssortmentPricesReading read =
-        economics::readAssortmentPrices(pricesFile(dir));
+    const prices::AssortmentPricesReading read = prices::readAssortmentPrices(pricesFile(dir));
     EXPECT_FALSE(read.prices.has_value());
     EXPECT_TRUE(read.fault.contains(QLatin1String(GetParam().fault))) << read.fault.toStdString();
     EXPECT_TRUE(read.fault.startsWith(QStringLiteral("\"AssortPrices.qdm\"")));
 
-    economics::GetAssortmentPricesFromFile(dir.path(), prices.data(), log);
+    prices::GetAssortmentPricesFromFile(dir.path(), prices.data(), log);
     EXPECT_EQ(prices.data().assortmentPrices, (rotation::AssortmentPriceList{1.0, 2.0, 3.0}));
     const QStringList lines = logMessages(dir.path());
     ASSERT_EQ(lines.size(), 1);
@@ -64,13 +63,11 @@ INSTANTIATE_TEST_SUITE_P(
 
 TEST(AssortmentPriceFile, MissingFileAndTheShippedFormats) {
     QTemporaryDir dir;
-    const economics::AssortmentPricesReading missing =
-        economics::readAssortmentPrices(pricesFile(dir));
+    const prices::AssortmentPricesReading missing = prices::readAssortmentPrices(pricesFile(dir));
     EXPECT_EQ(missing.fault, QStringLiteral("\"AssortPrices.qdm\": File not found"));
     // Comma-separated values, a missing leading zero and blank lines at the end.
     writeBytes(pricesFile(dir), "10.5, .75,48\r\n\r\n");
-    const economics::AssortmentPricesReading read =
-        economics::readAssortmentPrices(pricesFile(dir));
+    const prices::AssortmentPricesReading read = prices::readAssortmentPrices(pricesFile(dir));
     ASSERT_TRUE(read.prices.has_value()) << read.fault.toStdString();
     EXPECT_EQ(*read.prices, (rotation::AssortmentPriceList{10.5, 0.75, 48.0}));
 }
@@ -136,10 +133,10 @@ TEST_F(AssortPricesWindowTest, AcceptedPricesAreWrittenAndReadBack) {
     window.cmdChangeAsmtPrices_Click();
     window.typeText(1, QStringLiteral("31.25"));
     window.cmdChangeAsmtPrices_Click();
-    economics::WriteAssortmentPricesInFile(dir.path(), prices.data(), log);
+    prices::WriteAssortmentPricesInFile(dir.path(), prices.data(), log);
     EXPECT_EQ(readBytes(pricesFile(dir)), QByteArray("12\r\n31.25\r\n50\r\n"));
-    economics::PriceData next;
-    economics::GetAssortmentPricesFromFile(dir.path(), next, log);
+    prices::PriceData next;
+    prices::GetAssortmentPricesFromFile(dir.path(), next, log);
     EXPECT_EQ(next.assortmentPrices, prices.data().assortmentPrices);
     EXPECT_TRUE(logMessages(dir.path()).isEmpty());
 }

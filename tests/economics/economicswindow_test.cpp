@@ -6,7 +6,8 @@
 #include "economics/economicsformat.hpp"
 #include "economics/economicsmessages.hpp"
 #include "economics/economicswindowlogic.hpp"
-#include "economics/prices.hpp"
+#include "economics/npvwindowlogic.hpp"
+#include "prices/prices.hpp"
 
 namespace arbolex::testing {
 namespace {
@@ -20,10 +21,10 @@ protected:
     /// then grows to `finalCut` and fells there (0: no final cut).
     void typeRotation(const std::vector<int> &ages, const std::vector<QString> &volumes,
                       int finalCut) {
-        // A step of 5 years, or the whole span when it is shorter.
-        const auto growTo = [&](int from, int to) {
+        // By one-year steps, as a regime is written into the table.
+        const auto growTo = [&](int /*from*/, int to) {
             type(MainControl::txtToA, QString::number(to));
-            type(MainControl::txtByA, QString::number(std::min(5, to - from)));
+            type(MainControl::txtByA, QStringLiteral("1"));
             logic.cmdGrow_Click();
         };
         logic.cmdClear_Click();
@@ -53,17 +54,18 @@ protected:
         return all;
     }
 
-    economics::HeadlessEconomicsView view;
-    economics::EconomicsWindowLogic economics{logic, thin, view, interactive};
+    economics::HeadlessEconomicsView &view = economicsView;
+    economics::EconomicsWindowLogic &economics = session.economics();
 };
 
 TEST_F(EconomicsWindowTest, FiguresAreTheRotationLibrarysForTheTablesRotation) {
     typeRotation({20, 25, 30}, {QStringLiteral("40"), QStringLiteral("40"), QStringLiteral("40")},
                  45);
-    logic.cashFlow().setInterestRate(3.0);
+    work.cashFlow().setInterestRate(3.0);
+    economics.cmdEconomics_Click();
     economics.typeText(EconomicsControl::txtEstablishmentCost, QStringLiteral("1800"));
     economics.typeText(EconomicsControl::txtAnnualCost, QStringLiteral("15"));
-    economics.cmdEconomics_Click();
+    economics.cmdCompute_Click();
     ASSERT_TRUE(economics.valued()) << view.text(EconomicsControl::lblRegime).toStdString();
 
     // The same rotation asked of the library directly.
@@ -71,9 +73,9 @@ TEST_F(EconomicsWindowTest, FiguresAreTheRotationLibrarysForTheTablesRotation) {
     money.ratePercent = 3.0;
     money.establishmentCost = 1800.0;
     money.annualCost = 15.0;
-    economics::Prices longTerm;
+    prices::Prices longTerm;
     longTerm.data() = prices.data();
-    longTerm.selectPriceSet(economics::kLongTermPrices);
+    longTerm.selectPriceSet(prices::kLongTermPrices);
     money.prices = longTerm.pricesInUse();
     const rotation::Regime regime{20, 5, 40.0f, 30};
     engine::Grow own;
@@ -113,6 +115,111 @@ TEST_F(EconomicsWindowTest, FiguresAreTheRotationLibrarysForTheTablesRotation) {
     EXPECT_EQ(economics.value()->lev, byClass.lev);
     EXPECT_NE(byClass.npv, expected.npv);
     EXPECT_TRUE(view.text(EconomicsControl::lblRate).contains(QStringLiteral("assortment prices")));
+}
+
+TEST_F(EconomicsWindowTest, StandTodayIsWorthWhatTheNetPresentValueWindowSays) {
+    // The costs a new work starts with, as shipped.
+    work.resetCosts();
+    const double planting = work.establishmentCost();
+    ASSERT_GT(planting, 0.0);
+    economics::NpvWindowLogic &npv = session.npv();
+    struct Table {
+        std::vector<int> ages;
+        std::vector<QString> volumes;
+        int finalCut;
+    };
+    // A regular regime, and one the explorer can only take as its means.
+    const Table tables[] = {
+        {{20, 25, 30}, {QStringLiteral("40"), QStringLiteral("40"), QStringLiteral("40")}, 45},
+        {{20, 25, 32}, {QStringLiteral("30"), QStringLiteral("50"), QStringLiteral("40")}, 48}};
+    for (const Table &t : tables) {
+        typeRotation(t.ages, t.volumes, t.finalCut);
+        ASSERT_EQ(work.cashFlow().firstYear(), 15);
+        npv.Form_Load();
+        npv.typeInCell(2, work::kCfCost, QStringLiteral("1200"));              // age 16
+        npv.typeInCell(14, work::kCfOtherRevenues, QStringLiteral("300.5"));   // age 28
+        npv.typeInCell(t.finalCut - 14, work::kCfCost, QStringLiteral("450")); // the final cut
+        npv.cmdNPV_Click();
+        const double npvWindow = work.cashFlow().SumNPV();
+
+        economics.cmdEconomics_Click();
+        ASSERT_TRUE(economics.valued()) << view.text(EconomicsControl::lblRegime).toStdString();
+        const rotation::RotationValue shown = *economics.value();
+        EXPECT_EQ(shown.npv, npvWindow) << t.finalCut;
+        EXPECT_EQ(view.text(EconomicsControl::lblNPV), economics::euroPerHaText(npvWindow));
+        // The table's own thinnings, not a regular regime.
+        ASSERT_EQ(shown.thinnings.size(), t.ages.size());
+        for (std::size_t i = 0; i < t.ages.size(); ++i) {
+            EXPECT_EQ(shown.thinnings[i].age, t.ages[i]);
+        }
+        EXPECT_EQ(economics.rotationAge(), t.finalCut);
+        // Planting is paid for: the return and the break-even are figures.
+        EXPECT_EQ(shown.irr.outcome, valuation::IrrOutcome::kRoot);
+        ASSERT_TRUE(shown.breakEvenPriceFactor.has_value());
+        EXPECT_GT(*shown.breakEvenPriceFactor, 0.0);
+
+        // The establishment cost counts in the bare land's figures only.
+        economics.typeText(EconomicsControl::txtEstablishmentCost, QStringLiteral("0"));
+        economics.cmdCompute_Click();
+        EXPECT_EQ(work.establishmentCost(), 0.0) << "the typed cost is the work's";
+        EXPECT_EQ(economics.value()->npv, shown.npv);
+        const double qR = std::pow(1.05, t.finalCut);
+        EXPECT_NEAR(*economics.value()->lev - *shown.lev, planting * qR / (qR - 1.0), 1e-6);
+        EXPECT_EQ(economics.value()->irr.outcome, valuation::IrrOutcome::kRoot)
+            << "the typed cost of age 16 still comes before the revenues";
+        work.resetCosts();
+    }
+}
+
+TEST_F(EconomicsWindowTest, CostsAreInputsOfTheWork) {
+    typeRotation({20}, {QStringLiteral("40")}, 40);
+    work.setCosts(2000.0, 12.5);
+    economics.cmdEconomics_Click();
+    EXPECT_EQ(view.text(EconomicsControl::txtEstablishmentCost), QStringLiteral("2000"));
+    EXPECT_EQ(view.text(EconomicsControl::txtAnnualCost), QStringLiteral("12.5"));
+    EXPECT_EQ(economics.economics().annualCost, 12.5);
+
+    // Typed and computed, a cost becomes the work's, announced as a change.
+    int announced = 0;
+    QObject::connect(&work, &work::StandWork::costsChanged, [&] { ++announced; });
+    economics.typeText(EconomicsControl::txtEstablishmentCost, QStringLiteral("2600"));
+    economics.cmdCompute_Click();
+    EXPECT_EQ(work.establishmentCost(), 2600.0);
+    EXPECT_EQ(announced, 1);
+    economics.cmdCompute_Click();
+    EXPECT_EQ(announced, 1) << "the same costs again change nothing";
+
+    // A document written before the work had costs takes the defaults, and
+    // the window shows them.
+    prices.data().costs = {3045.0, 0.0};
+    work::WorkSnapshot older = work.snapshot();
+    older.establishmentCost.reset();
+    older.annualCost.reset();
+    logic.restore(older);
+    EXPECT_EQ(work.establishmentCost(), 3045.0);
+    EXPECT_EQ(work.annualCost(), 0.0);
+    EXPECT_EQ(view.text(EconomicsControl::txtEstablishmentCost), QStringLiteral("3045"));
+    EXPECT_EQ(view.text(EconomicsControl::txtAnnualCost), QStringLiteral("0"));
+}
+
+TEST_F(EconomicsWindowTest, TypedCashFlowCountsForTheOptimiserAndStaysOnApply) {
+    typeRotation({20}, {QStringLiteral("40")}, 40);
+    session.npv().Form_Load();
+    session.npv().typeInCell(2, work::kCfCost, QStringLiteral("1200")); // age 16
+    economics.cmdEconomics_Click();
+    ASSERT_EQ(economics.economics().entries.size(), 1u);
+    EXPECT_EQ(economics.economics().entries.front().age, 16);
+    EXPECT_TRUE(view.text(EconomicsControl::lblRate).contains(QStringLiteral("costs 1,200 €/ha")))
+        << view.text(EconomicsControl::lblRate).toStdString();
+    economics.cmdOptimise_Click();
+    ASSERT_FALSE(economics.regimes().empty());
+    const rotation::Candidate best = economics.regimes().front();
+    economics.cmdApply_Click(1);
+    ASSERT_TRUE(work.felled());
+    EXPECT_EQ(work.cashFlow().matrix(work::kCfCost, 1), 1200.0);
+    ASSERT_TRUE(economics.yourRegime());
+    EXPECT_DOUBLE_EQ(economics.yourRegime()->lev, best.lev);
+    EXPECT_EQ(economics.regimes().size(), 5u) << "the same stand and money keep the regimes";
 }
 
 TEST_F(EconomicsWindowTest, IrregularThinningsAreValuedAsTheirMeansAndSaidSo) {
@@ -165,7 +272,7 @@ TEST_F(EconomicsWindowTest, BadInputIsRefusedAndKeepsWhatIsShown) {
         EXPECT_EQ(economics.monteCarlo()->histogram.empty() ? 0 : 1, draws);
         economics.typeText(c.field, before);
     }
-    EXPECT_EQ(logic.cashFlow().interestRate(), 5.0) << "a refused rate is not kept";
+    EXPECT_EQ(work.cashFlow().interestRate(), 5.0) << "a refused rate is not kept";
 }
 
 TEST_F(EconomicsWindowTest, CancelStopsTheOptimiser) {
@@ -213,7 +320,7 @@ TEST_F(EconomicsWindowTest, ApplyWritesTheTableAUserWouldType) {
     }
     typeRotation(ages, volumes, chosen.rotation);
     EXPECT_EQ(tableCells(), applied);
-    EXPECT_TRUE(logic.felled());
+    EXPECT_TRUE(work.felled());
 
     // The window now values the applied regime: it scores as the optimiser said.
     economics.cmdCompute_Click();

@@ -3,13 +3,14 @@
 // and copying.
 #include "mocks/programservices.hpp"
 #include "mocks/qtprinters.hpp"
+#include "work/worktexts.hpp"
 
 #include "shell/vbformat.hpp"
 
-#include "economics/mdlnpv.hpp"
 #include "economics/npvmessages.hpp"
 #include "economics/npvwindowlogic.hpp"
 #include "shell/iclipboard.hpp"
+#include "work/mdlnpv.hpp"
 
 #include <QFile>
 
@@ -20,6 +21,7 @@ namespace {
 
 using economics::NpvControl;
 using namespace economics;
+using namespace work;
 
 /// A clipboard that refuses everything.
 class RefusingClipboard : public shell::IClipboard {
@@ -31,8 +33,16 @@ public:
 class NpvWindowTest : public ::testing::Test, protected ProgramServices {
 protected:
     NpvWindowTest() {
-        revenue.add(30, 588.4);
-        revenue.add(60, 55046.0);
+        // A table whose thinning at 30 and final cut at 60 earn these revenues.
+        WorkSnapshot rotation;
+        for (const auto &[age, revenue] : {std::pair{30.0f, 588.4}, std::pair{60.0f, 55046.0}}) {
+            TableRow row;
+            row.record.age = age;
+            row.timberRevenue = revenue;
+            rotation.rows.push_back(row);
+        }
+        rotation.interestRate = work.cashFlow().interestRate();
+        work.restore(rotation);
         cashFlow.SetRotationLength(20, 60);
         cashFlow.DimNPVArrays();
         npv.Form_Load();
@@ -41,16 +51,16 @@ protected:
     QString cell(int row, int column) const { return npv.grid().at(row).value(column); }
     void key(QChar c) { npv.NPV_Grid_KeyPress(c); }
 
-    TimberRevenue revenue;
-    CashFlow cashFlow;
+    StandWork work{grow, prices, log};
+    CashFlow &cashFlow = work.cashFlow();
     HeadlessNpvView view;
     shell::HeadlessClipboard clipboard;
-    NpvWindowLogic npv{cashFlow, revenue, log, view, interactive, clipboard};
+    NpvWindowLogic npv{work, view, interactive, clipboard};
 };
 
 TEST_F(NpvWindowTest, OpensOnEveryYearOfTheRotation) {
     ASSERT_EQ(npv.grid().size(), 42u); // header and 41 years
-    EXPECT_EQ(npv.grid().front(), text::npvHeaders());
+    EXPECT_EQ(npv.grid().front(), work::text::cashFlowHeaders());
     EXPECT_EQ(cell(1, kCfYear), QStringLiteral("20"));
     EXPECT_EQ(cell(41, kCfYear), QStringLiteral("60"));
     EXPECT_EQ(cell(11, kCfTimberRevenue), QStringLiteral("588"));
@@ -167,19 +177,19 @@ TEST_F(NpvWindowTest, CopiesTheGridAsTextAndHtml) {
     npv.typeInCell(1, kCfOperation, QStringLiteral("Planting <bare> & fenced"));
     npv.CmdCopyToClipboard_Click();
     ASSERT_EQ(interactive.messages.size(), 1);
-    EXPECT_EQ(interactive.messages[0].text, text::copiedToClipboard());
+    EXPECT_EQ(interactive.messages[0].text, economics::text::copiedToClipboard());
     const QStringList lines = clipboard.text().split(u'\n', Qt::SkipEmptyParts);
     ASSERT_EQ(lines.size(), 42);
-    EXPECT_EQ(lines[0], text::npvHeaders().join(u'\t'));
+    EXPECT_EQ(lines[0], work::text::cashFlowHeaders().join(u'\t'));
     EXPECT_EQ(lines[1].split(u'\t').value(1), QStringLiteral("Planting <bare> & fenced"));
     EXPECT_TRUE(clipboard.html().contains(QStringLiteral("<th>Cost (€/ha)</th>")));
     EXPECT_TRUE(
         clipboard.html().contains(QStringLiteral("<td>Planting &lt;bare&gt; &amp; fenced</td>")));
 
     RefusingClipboard refusing;
-    NpvWindowLogic other(cashFlow, revenue, log, view, interactive, refusing);
+    NpvWindowLogic other(work, view, interactive, refusing);
     other.CmdCopyToClipboard_Click();
-    EXPECT_EQ(interactive.messages.back().text, text::copyFailed());
+    EXPECT_EQ(interactive.messages.back().text, economics::text::copyFailed());
     EXPECT_EQ(interactive.messages.back().style, shell::kExclamation);
 }
 

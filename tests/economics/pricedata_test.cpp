@@ -2,7 +2,7 @@
 // which lists each writer selector writes, and the file text.
 #include "shell/testfiles.hpp"
 
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 #include "shell/errorlog.hpp"
 
 #include <QLocale>
@@ -20,7 +20,7 @@ using testing::writeBytes;
 /// Thirteen prices first, first + 1, ... one per line.
 QByteArray priceLines(int first) {
     QByteArray text;
-    for (int i = 0; i < kPriceClassCount; ++i) {
+    for (int i = 0; i < prices::kPriceClassCount; ++i) {
         text += QByteArray::number(first + i) + "\r\n";
     }
     return text;
@@ -32,22 +32,23 @@ protected:
 
     /// Writes current prices 100.., private 200.., user 300.., long-term 400.. and
     /// the categories, gives `file` the text `replacement` (none: no file) and reads.
-    PriceData readWith(const char *file, const char *replacement) {
+    prices::PriceData readWith(const char *file, const char *replacement) {
         QFile::remove(m_log.path());
-        writeBytes(path(kCurrentPricesFile), priceLines(100));
-        writeBytes(path(kPrivatePricesFile), priceLines(200) + "\"Jan 2025\"\r\n\"Dec 2025\"\r\n");
-        writeBytes(path(kUserPricesFile), priceLines(300));
-        writeBytes(path(kAveragePricesFile), priceLines(400));
-        writeBytes(path(kUserAssortmentsFile),
+        writeBytes(path(prices::kCurrentPricesFile), priceLines(100));
+        writeBytes(path(prices::kPrivatePricesFile),
+                   priceLines(200) + "\"Jan 2025\"\r\n\"Dec 2025\"\r\n");
+        writeBytes(path(prices::kUserPricesFile), priceLines(300));
+        writeBytes(path(prices::kAveragePricesFile), priceLines(400));
+        writeBytes(path(prices::kUserAssortmentsFile),
                    QByteArray("\"Pulpwood\"\r\n7\r\n14\r\n").repeated(4) +
                        "\"Stakes\",.5,12.5\r\n");
         QFile::remove(path(file));
         if (replacement != nullptr) {
             writeBytes(path(file), replacement);
         }
-        PriceData data;
+        prices::PriceData data;
         data.current[3] = -1;
-        GetPricesFromFiles(m_dir.path(), data, m_log);
+        prices::GetPricesFromFiles(m_dir.path(), data, m_log);
         return data;
     }
     /// The one log line expected, from its "number description in line N".
@@ -61,7 +62,7 @@ protected:
 };
 
 TEST_F(PriceFilesTest, ReadingStopsOnlyAtAMissingOrShortFile) {
-    PriceData data = readWith("none", nullptr);
+    prices::PriceData data = readWith("none", nullptr);
     EXPECT_EQ(data.current[3], 103.0);
     EXPECT_EQ(data.privatePeriod[1], QStringLiteral("Dec 2025"));
     EXPECT_EQ(data.longTermAverage[12], 412.0);
@@ -69,26 +70,26 @@ TEST_F(PriceFilesTest, ReadingStopsOnlyAtAMissingOrShortFile) {
     EXPECT_EQ(data.categories[4].smallEnd, 0.5f);
     EXPECT_TRUE(logMessages(m_dir.path()).isEmpty());
 
-    data = readWith(kCurrentPricesFile, nullptr); // nothing read at all
+    data = readWith(prices::kCurrentPricesFile, nullptr); // nothing read at all
     EXPECT_EQ(data.current[3], -1.0);
-    EXPECT_EQ(data.privateSector, PriceList{});
+    EXPECT_EQ(data.privateSector, prices::PriceList{});
     EXPECT_EQ(logMessages(m_dir.path()), logged("53 File not found in line 10"));
 
-    data = readWith(kUserPricesFile, nullptr);
+    data = readWith(prices::kUserPricesFile, nullptr);
     EXPECT_EQ(data.current[3], 103.0);
     EXPECT_EQ(data.privatePeriod[1], QStringLiteral("Dec 2025"));
-    EXPECT_EQ(data.userDefined, PriceList{});
+    EXPECT_EQ(data.userDefined, prices::PriceList{});
     EXPECT_TRUE(data.categories[0].name.isEmpty());
     EXPECT_EQ(logMessages(m_dir.path()), logged("53 File not found in line 70"));
 
-    data = readWith(kCurrentPricesFile, "1\r\n2\r\n3\r\n4\r\n5\r\n");
+    data = readWith(prices::kCurrentPricesFile, "1\r\n2\r\n3\r\n4\r\n5\r\n");
     EXPECT_EQ(data.current[4], 5.0);
     EXPECT_EQ(data.current[5], 0.0);
-    EXPECT_EQ(data.privateSector, PriceList{});
+    EXPECT_EQ(data.privateSector, prices::PriceList{});
     EXPECT_EQ(logMessages(m_dir.path()), logged("62 Input past end of file in line 20"));
 
     // a value that is no number keeps its entry; the reading goes on
-    data = readWith(kCurrentPricesFile, priceLines(100).replace("103", "1O3").constData());
+    data = readWith(prices::kCurrentPricesFile, priceLines(100).replace("103", "1O3").constData());
     EXPECT_EQ(data.current[3], -1.0);
     EXPECT_EQ(data.current[4], 104.0);
     EXPECT_EQ(data.categories[4].name, QStringLiteral("Stakes"));
@@ -108,43 +109,44 @@ TEST_F(PriceFilesTest, SelectorChoosesTheListsAndPrivatePricesAreNeverWritten) {
         auto exists = [&dir](const char *name) {
             return QFile::exists(dir.filePath(QLatin1String(name)));
         };
-        writeBytes(dir.filePath(QLatin1String(kPrivatePricesFile)), privateText);
-        WritePricesInFiles(c.selector, dir.path(), PriceData{}, m_log);
-        EXPECT_EQ(exists(kCurrentPricesFile), c.current);
-        EXPECT_EQ(exists(kUserPricesFile), c.user);
-        EXPECT_EQ(exists(kAveragePricesFile), c.average);
-        EXPECT_EQ(readBytes(dir.filePath(QLatin1String(kPrivatePricesFile))), privateText);
+        writeBytes(dir.filePath(QLatin1String(prices::kPrivatePricesFile)), privateText);
+        prices::WritePricesInFiles(c.selector, dir.path(), prices::PriceData{}, m_log);
+        EXPECT_EQ(exists(prices::kCurrentPricesFile), c.current);
+        EXPECT_EQ(exists(prices::kUserPricesFile), c.user);
+        EXPECT_EQ(exists(prices::kAveragePricesFile), c.average);
+        EXPECT_EQ(readBytes(dir.filePath(QLatin1String(prices::kPrivatePricesFile))), privateText);
     }
-    WritePricesInFiles(kWriteCurrent, m_dir.filePath(QStringLiteral("gone")), {}, m_log);
+    prices::WritePricesInFiles(prices::kWriteCurrent, m_dir.filePath(QStringLiteral("gone")), {},
+                               m_log);
     EXPECT_EQ(logMessages(m_dir.path()).value(0),
               QStringLiteral("Error 76 Path not found in line 10  in procedure "
                              "WritePricesInFiles of Module Misc"));
 }
 
 TEST_F(PriceFilesTest, WrittenFilesReadBackUnderDecimalCommaLocale) {
-    PriceData written;
+    prices::PriceData written;
     written.current.fill(12.75);
     written.current[0] = -3.5;
     written.categories[0] = {QStringLiteral("Pallet, small"), 14, 20.5f, true};
-    writeBytes(path(kPrivatePricesFile), priceLines(200) + "\"a\"\r\n\"b\"\r\n");
+    writeBytes(path(prices::kPrivatePricesFile), priceLines(200) + "\"a\"\r\n\"b\"\r\n");
 
     const QLocale previous;
     QLocale::setDefault(QLocale(QLocale::German, QLocale::Germany));
-    WritePricesInFiles(kWriteAllPrices, m_dir.path(), written, m_log);
-    WriteUserDefinedAssortmentsInFile(m_dir.path(), written, m_log);
+    prices::WritePricesInFiles(prices::kWriteAllPrices, m_dir.path(), written, m_log);
+    prices::WriteUserDefinedAssortmentsInFile(m_dir.path(), written, m_log);
     QLocale::setDefault(previous);
 
-    EXPECT_TRUE(readBytes(path(kCurrentPricesFile)).startsWith("-3.5\r\n12.75\r\n"));
-    const QByteArray categories = readBytes(path(kUserAssortmentsFile));
+    EXPECT_TRUE(readBytes(path(prices::kCurrentPricesFile)).startsWith("-3.5\r\n12.75\r\n"));
+    const QByteArray categories = readBytes(path(prices::kUserAssortmentsFile));
     EXPECT_TRUE(categories.startsWith("\"Pallet, small\"\r\n14\r\n20.5\r\n\"\"\r\n0\r\n0\r\n"));
     EXPECT_EQ(categories.count("\r\n"), 15);
-    PriceData data;
-    GetPricesFromFiles(m_dir.path(), data, m_log);
+    prices::PriceData data;
+    prices::GetPricesFromFiles(m_dir.path(), data, m_log);
     EXPECT_EQ(data.current, written.current);
     EXPECT_EQ(data.categories[0].name, QStringLiteral("Pallet, small"));
     EXPECT_TRUE(logMessages(m_dir.path()).isEmpty());
 
-    GetPricesFromFiles(QStringLiteral(ARBOLEX_DATA_SOURCE), data, m_log); // as shipped
+    prices::GetPricesFromFiles(QStringLiteral(ARBOLEX_DATA_SOURCE), data, m_log); // as shipped
     EXPECT_TRUE(logMessages(m_dir.path()).isEmpty());
 }
 

@@ -2,18 +2,19 @@
 // gaps between them, a caption that does not convert, and the prices in use.
 #include "mocks/fakeinteractive.hpp"
 
-#include "economics/pricelookup.hpp"
-#include "economics/prices.hpp"
+#include "prices/pricelookup.hpp"
+#include "prices/prices.hpp"
 #include "rotation/priceclasses.hpp"
 
 #include <gtest/gtest.h>
 
 namespace arbolex::economics {
+using prices::priceClassOf;
 namespace {
 
 /// Current price of class i is 100 + i, so a price names its class.
-PriceList classPrices() {
-    PriceList prices{};
+prices::PriceList classPrices() {
+    prices::PriceList prices{};
     for (std::size_t i = 0; i < prices.size(); ++i) {
         prices[i] = 100.0 + double(i);
     }
@@ -43,7 +44,8 @@ TEST(PriceLookupTest, ClassOfMeanTreeVolume) {
     testing::FakeInteractive ui;
     const QLocale english(QLocale::English, QLocale::UnitedStates);
     for (const auto &c : cases) {
-        EXPECT_EQ(TrouveIndicePrix(c.volume, classPrices(), ui, english), 100.0 + c.priceClass)
+        EXPECT_EQ(prices::TrouveIndicePrix(c.volume, classPrices(), ui, english),
+                  100.0 + c.priceClass)
             << c.volume;
         EXPECT_EQ(priceClassOf(c.volume, ui, english), c.priceClass) << c.volume;
         EXPECT_EQ(rotation::priceClassOf(c.volume), c.priceClass) << c.volume;
@@ -52,7 +54,7 @@ TEST(PriceLookupTest, ClassOfMeanTreeVolume) {
 
     // captions do not convert under a decimal comma: message, nothing found
     const QLocale german(QLocale::German, QLocale::Germany);
-    EXPECT_EQ(TrouveIndicePrix(0.5, classPrices(), ui, german), 0.0);
+    EXPECT_EQ(prices::TrouveIndicePrix(0.5, classPrices(), ui, german), 0.0);
     EXPECT_EQ(priceClassOf(0.5, ui, german), 0);
     ASSERT_EQ(ui.messages.size(), 2);
     EXPECT_EQ(ui.messages[0].text, QStringLiteral("Error 13  Type mismatch in line 10 in "
@@ -75,19 +77,19 @@ TEST(PriceLookupTest, RotationsClassEveryVolumeAsTheWindowsDo) {
 }
 
 TEST(PriceLookupTest, PricesInUseAreAbsoluteButTheLookupKeepsTheSign) {
-    Prices prices;
+    prices::Prices prices;
     prices.data().current = classPrices();
     prices.data().current[3] = -7.5;
     prices.data().privateSector.fill(-20.0);
-    prices.selectPriceSet(kCurrentPrices);
+    prices.selectPriceSet(prices::kCurrentPrices);
     EXPECT_EQ(prices.pricesInUse()[3], 7.5);
 
-    prices.selectPriceSet(kPrivatePrices);
+    prices.selectPriceSet(prices::kPrivatePrices);
     prices.selectPriceSet(4); // not a set: nothing changes
-    EXPECT_EQ(prices.priceSetInUse(), kPrivatePrices);
+    EXPECT_EQ(prices.priceSetInUse(), prices::kPrivatePrices);
     EXPECT_EQ(prices.pricesInUse()[3], 20.0);
     testing::FakeInteractive ui;
-    EXPECT_EQ(TrouveIndicePrix(0.2, prices.data().current, ui, QLocale::c()), -7.5);
+    EXPECT_EQ(prices::TrouveIndicePrix(0.2, prices.data().current, ui, QLocale::c()), -7.5);
 }
 
 } // namespace

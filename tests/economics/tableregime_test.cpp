@@ -1,6 +1,6 @@
 // The regime read back from the thinning rows of the projection table.
 #include "economics/tableregime.hpp"
-#include "workflow/projectiontable.hpp"
+#include "work/projectiontable.hpp"
 
 #include <gtest/gtest.h>
 
@@ -28,23 +28,23 @@ struct Case {
 
 /// A table grown from 15: a growth row before each thinning row, then the
 /// final cut.
-workflow::ProjectionTable tableOf(const Case &c) {
-    workflow::ProjectionTable table;
-    const auto append = [&](int age, workflow::RowKind kind, float removed, bool felled) {
-        workflow::TableRow row;
+work::ProjectionTable tableOf(const Case &c) {
+    work::ProjectionTable table;
+    const auto append = [&](int age, work::RowKind kind, float removed, bool felled) {
+        work::TableRow row;
         row.kind = kind;
         row.record.age = static_cast<float>(age);
         row.record.removedVolume = removed;
         row.finalCut = felled;
         table.append(row);
     };
-    append(15, workflow::RowKind::Growth, 0.0f, false);
+    append(15, work::RowKind::Growth, 0.0f, false);
     for (const Thinning &t : c.thinnings) {
-        append(t.age, workflow::RowKind::Growth, 0.0f, false);
-        append(t.age, workflow::RowKind::Thinning, t.volume, false);
+        append(t.age, work::RowKind::Growth, 0.0f, false);
+        append(t.age, work::RowKind::Thinning, t.volume, false);
     }
     if (c.finalCut) {
-        append(*c.finalCut, workflow::RowKind::Growth, 0.0f, true);
+        append(*c.finalCut, work::RowKind::Growth, 0.0f, true);
     }
     return table;
 }
@@ -102,9 +102,9 @@ INSTANTIATE_TEST_SUITE_P(
     [](const ::testing::TestParamInfo<Case> &param) { return std::string(param.param.name); });
 
 TEST(TableStandTest, FirstGrowthRowIsTheStand) {
-    workflow::ProjectionTable table;
+    work::ProjectionTable table;
     EXPECT_FALSE(economics::standFromTable(table, 0));
-    workflow::TableRow first;
+    work::TableRow first;
     first.record = {15.0f, 7.0f, 20.0f, 2500.0f, 44.0f, 10.1f, 0.0f, 0.0f, 0.0f, 0.0f};
     table.append(first);
     const auto stand = economics::standFromTable(table, 3);

@@ -28,9 +28,9 @@ TimberPricesItem priceField(int index) {
 }
 
 /// The four lists with distinct prices; a few negative, as a file may hold them.
-economics::PriceData samplePrices() {
-    economics::PriceData data;
-    for (int k = 0; k < economics::kPriceClassCount; ++k) {
+prices::PriceData samplePrices() {
+    prices::PriceData data;
+    for (int k = 0; k < prices::kPriceClassCount; ++k) {
         const auto i = static_cast<std::size_t>(k);
         data.current[i] = 10.0 + k;
         data.userDefined[i] = 20.0 + k;
@@ -135,7 +135,7 @@ TEST_F(TimberPricesLogicTest, AcceptStoresTheUserFieldsAndAnEmptiedFieldAsZero) 
     EXPECT_EQ(field(kFirstUserField + 1), QStringLiteral("0"));
     EXPECT_EQ(field(kFirstUserField), QStringLiteral("12.5")) << "shown as typed";
 
-    economics::PriceList expected = samplePrices().userDefined;
+    prices::PriceList expected = samplePrices().userDefined;
     expected[0] = 12.5;
     expected[1] = 0.0;
     expected[12] = 0.75;
@@ -156,7 +156,7 @@ TEST_F(TimberPricesLogicTest, AcceptedUserPricesInUseAreUsedAtOnce) {
 
 struct OptionCase {
     TimberPricesControl option;
-    economics::PriceSet set;
+    prices::PriceSet set;
 };
 
 class TimberPricesOptionTest : public TimberPricesLogicTest,
@@ -165,12 +165,12 @@ class TimberPricesOptionTest : public TimberPricesLogicTest,
 TEST_P(TimberPricesOptionTest, ChoosesThePricesInUseAsAbsoluteValues) {
     const OptionCase &c = GetParam();
     // Start from another set, so the option's own choice is what is seen.
-    window.press(c.set == economics::kUserPrices ? TimberPricesControl::OptNPVprices
-                                                 : TimberPricesControl::OptUserPrices);
+    window.press(c.set == prices::kUserPrices ? TimberPricesControl::OptNPVprices
+                                              : TimberPricesControl::OptUserPrices);
     ASSERT_TRUE(window.press(c.option));
 
     EXPECT_EQ(prices.priceSetInUse(), c.set);
-    const economics::PriceList &chosen = *prices.priceSet(c.set);
+    const prices::PriceList &chosen = *prices.priceSet(c.set);
     for (std::size_t i = 0; i < chosen.size(); ++i) {
         EXPECT_EQ(prices.pricesInUse()[i], std::fabs(chosen[i])) << "class " << i;
     }
@@ -186,10 +186,10 @@ TEST_P(TimberPricesOptionTest, ChoosesThePricesInUseAsAbsoluteValues) {
 
 INSTANTIATE_TEST_SUITE_P(
     Options, TimberPricesOptionTest,
-    ::testing::Values(OptionCase{TimberPricesControl::OptCurentPrices, economics::kCurrentPrices},
-                      OptionCase{TimberPricesControl::OptUserPrices, economics::kUserPrices},
-                      OptionCase{TimberPricesControl::OptNPVprices, economics::kLongTermPrices},
-                      OptionCase{TimberPricesControl::OptOvraPrices, economics::kPrivatePrices}),
+    ::testing::Values(OptionCase{TimberPricesControl::OptCurentPrices, prices::kCurrentPrices},
+                      OptionCase{TimberPricesControl::OptUserPrices, prices::kUserPrices},
+                      OptionCase{TimberPricesControl::OptNPVprices, prices::kLongTermPrices},
+                      OptionCase{TimberPricesControl::OptOvraPrices, prices::kPrivatePrices}),
     [](const ::testing::TestParamInfo<OptionCase> &param) {
         return economics::controlName({param.param.option, 0}).toStdString();
     });
@@ -255,15 +255,13 @@ class TimberPricesMainTest : public MainWindowTest {
 protected:
     TimberPricesMainTest() {
         copyShippedData(dir.path());
-        logic.attachTimberPrices(&window);
         logic.Form_Load(settings, QRect(0, 0, 1280, 800));
     }
 
     QString file(const char *name) const { return QDir(dir.path()).filePath(QLatin1String(name)); }
 
     QSettings settings{dir.filePath(QStringLiteral("settings.ini")), QSettings::IniFormat};
-    economics::HeadlessTimberPricesView pricesView;
-    economics::TimberPricesWindowLogic window{prices, log, pricesView};
+    economics::TimberPricesWindowLogic &window = session.timberPrices();
 };
 
 TEST_F(TimberPricesMainTest, ShowTimberPricesOpensTheWindowOnTheListsRead) {

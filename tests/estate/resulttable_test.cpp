@@ -29,6 +29,7 @@ TEST_P(ResultFigureTest, FiguresAreWrittenAsPrintfWritesThem) {
     row.thinningVolume = x;
     row.finalCutVolume = static_cast<float>(x);
     row.maxMai = x;
+    row.finalCutMai = x;
     row.npv = x;
     std::vector<std::string> values;
     figureValues(row, values);
@@ -36,7 +37,8 @@ TEST_P(ResultFigureTest, FiguresAreWrittenAsPrintfWritesThem) {
     EXPECT_EQ(values[4], printed("%.3f", x));                     // thinning_volume_ha
     EXPECT_EQ(values[8], printed("%.9g", static_cast<float>(x))); // final_cut_volume_ha
     EXPECT_EQ(values[10], printed("%.9g", x));                    // max_mai
-    EXPECT_EQ(values[11], printed("%.2f", std::nearbyint(x * 100.0) / 100.0)); // npv_ha
+    EXPECT_EQ(values[11], printed("%.9g", x));                    // mai_final_cut
+    EXPECT_EQ(values[12], printed("%.2f", std::nearbyint(x * 100.0) / 100.0)); // npv_ha
 }
 
 INSTANTIATE_TEST_SUITE_P(HardDigits, ResultFigureTest,

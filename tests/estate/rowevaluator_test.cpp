@@ -85,7 +85,7 @@ INSTANTIATE_TEST_SUITE_P(
         BadRow{"un-thinned model with a regime", with(sitkaRow(), "model", "1"), kRefused,
                "model 1 (SS - (Un-thinned)) has no thinning response"},
         BadRow{"thinning more than stands", with(sitkaRow(), "thin_volume", "900"), kRefused,
-               "the thinning at age 20 removes 900.00 m3/ha"},
+               "FAULT - Proposed thinning leads to negative or zero Volume."},
         BadRow{"first thinning before the present", with(sitkaRow(), "thin_from", "12"), kRefused,
                "the first thinning (age 12) is before the present age 15"},
         BadRow{"rotation past the age limit", with(sitkaRow(), "rotation", "61"), kRefused,
@@ -126,13 +126,30 @@ TEST_F(EstateRowTest, GrowsAndValuesTheStandAsTheRotationLibraryDoes) {
     EXPECT_EQ(r.finalCutVolume, v.finalCut.volume);
     EXPECT_EQ(r.thinningCount, 6); // ages 20, 25, ..., 45
     EXPECT_EQ(r.thinningCount, static_cast<int>(v.thinnings.size()));
-    EXPECT_EQ(r.yieldClass, v.yieldClass);
+    EXPECT_EQ(r.yieldClass, rotation::pathYieldClass(*path));
+    EXPECT_EQ(r.finalCutMai, v.mai);
     EXPECT_EQ(r.npv, v.npv);
     EXPECT_EQ(r.lev, v.lev);
     EXPECT_EQ(r.forestValue, v.forestValue);
     // One harvest per thinning and the final cut, for the 2.5 ha.
     ASSERT_EQ(r.harvests.size(), 7U);
     EXPECT_EQ(r.harvests.back().finalCutLitres, std::llround(double{v.finalCut.volume} * 2500.0));
+}
+
+TEST_F(EstateRowTest, TheYieldClassIsTheStandsProductivityWhateverTheFinalCut) {
+    RowEvaluator evaluator(m_layout, m_defaults);
+    // A fertile site (11 m at 15 years): felled at 25 its increment has not
+    // culminated; the yield class is read over the whole path all the same,
+    // as it is for a final cut at 60.
+    const RowValues fertile = with(sitkaRow(), "top_height", "11");
+    const RowResult early = evaluator.evaluate(with(fertile, "rotation", "25"));
+    const RowResult late = evaluator.evaluate(with(fertile, "rotation", "60"));
+    ASSERT_EQ(early.status, RowStatus::kOk) << early.message;
+    EXPECT_GT(early.yieldClass, 0);
+    EXPECT_EQ(early.yieldClass, late.yieldClass);
+    EXPECT_LT(early.finalCutMai, early.maxMai + 1e-12);
+    EXPECT_NEAR(early.finalCutMai,
+                (double{early.finalCutVolume} + early.thinningVolume) / early.finalCutAge, 1e-4);
 }
 
 TEST_F(EstateRowTest, DiameterStandsInForAMissingBasalAreaAndEmptyValuesTakeTheDefaults) {
@@ -164,17 +181,19 @@ TEST_F(EstateRowTest, DiameterStandsInForAMissingBasalAreaAndEmptyValuesTakeTheD
 
 TEST_F(EstateRowTest, AThinningTheRegimeWouldMakeAfterTheFinalCutDoesNotStopTheRow) {
     RowEvaluator evaluator(m_layout, m_defaults);
-    // A Scots pine stand too poor for a 40 m3 thinning at 40: felled at 38,
-    // it never meets that thinning.
-    const RowValues poor =
-        with(with(with(with(sitkaRow(), "model", "8"), "age", "18"), "top_height", "7"), "rotation",
-             "38");
-    const RowResult felled = evaluator.evaluate(poor);
+    // Douglas fir thinned by 40 m3/ha every 5 years: the grow from the stand
+    // a thinning after 50 leaves is refused (too few stems), but felled at 50
+    // the row never meets it.
+    const RowValues fir =
+        with(with(with(with(with(sitkaRow(), "model", "4"), "thin_from", "20"), "thin_every", "5"),
+                  "thin_volume", "40"),
+             "rotation", "50");
+    const RowResult felled = evaluator.evaluate(fir);
     EXPECT_EQ(felled.status, RowStatus::kOk) << felled.message;
-    EXPECT_EQ(felled.thinningCount, 4);
-    const RowResult later = evaluator.evaluate(with(poor, "rotation", "45"));
+    EXPECT_EQ(felled.thinningCount, 6);
+    const RowResult later = evaluator.evaluate(with(fir, "rotation", "56"));
     EXPECT_EQ(later.status, RowStatus::kRefused);
-    EXPECT_EQ(later.message.substr(0, 34), "the thinning at age 40 removes 40.");
+    EXPECT_EQ(later.message, "FAULT - Grow From STOCKING not in acceptable range [100, 5000]");
 }
 
 TEST_F(EstateRowTest, WithoutARotationAnywhereFellsAtTheEconomicRotation) {

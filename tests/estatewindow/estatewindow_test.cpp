@@ -67,15 +67,14 @@ protected:
         return path;
     }
 
-    document::DocumentController documents{logic, interactive, nullptr};
-    estatewindow::HeadlessEstateView estateView;
-    estatewindow::EstateWindowLogic estateLogic{logic, thin, documents, estateView, interactive};
+    document::DocumentController &documents = session.documents();
+    estatewindow::EstateWindowLogic &estateLogic = session.estate();
 };
 
 #ifdef ARBOLEX_CLI_PATH
 TEST_F(EstateWindowTest, RowsAndForecastAreTheCommandLinesAndTheInputIsOnlyRead) {
     const QByteArray before = digestOf(exampleEstate());
-    logic.cashFlow().setInterestRate(3.5);
+    work.cashFlow().setInterestRate(3.5);
     estateView.fileToChoose = exampleEstate();
     estateLogic.mnuOpenEstate_Click();
     ASSERT_TRUE(interactive.messages.isEmpty()) << interactive.messages.first().text.toStdString();
@@ -113,7 +112,7 @@ TEST_F(EstateWindowTest, RowsAndForecastAreTheCommandLinesAndTheInputIsOnlyRead)
     // The chart's bars are the forecast's lines by species.
     const auto forecast =
         estateio::readTable(QDir(out).filePath(QStringLiteral("forecast.csv")).toStdString());
-    const estatewindow::ForecastChart &chart = estateLogic.forecast();
+    const charts::HarvestForecast &chart = estateLogic.forecast();
     ASSERT_FALSE(chart.empty());
     std::map<std::pair<int, QString>, double> cliBars;
     for (const auto &line : forecast) {
@@ -210,12 +209,10 @@ TEST_F(EstateWindowTest, AnOpenedRowIsItsRegimeTypedByHandAsANewUnsavedDocument)
     logic.cmdClear_Click();
     typeStand();
     type(MainControl::txtNetArea, QStringLiteral("12.4"));
-    int grown = 15;
     const auto growTo = [&](int age) {
         type(MainControl::txtToA, QString::number(age));
-        type(MainControl::txtByA, QString::number(std::min(5, age - grown)));
+        type(MainControl::txtByA, QStringLiteral("1"));
         logic.cmdGrow_Click();
-        grown = age;
     };
     for (int age = 20; age < rotation; age += 5) {
         growTo(age);
@@ -230,21 +227,24 @@ TEST_F(EstateWindowTest, AnOpenedRowIsItsRegimeTypedByHandAsANewUnsavedDocument)
     growTo(rotation);
     interactive.answers.clear(); // the final cut's offers taken, as in the replay
     logic.cmdFinalCut_Click();
-    ASSERT_TRUE(logic.felled());
+    ASSERT_TRUE(work.felled());
     const auto byHand = tableCells();
+    const QString siteIndexByHand = work.siteIndexText();
+    ASSERT_FALSE(siteIndexByHand.isEmpty());
 
     // Unsaved work: the question, and Cancel keeps it.
     const auto asked = interactive.questions.size();
     estateLogic.openSubCompartment(row);
     EXPECT_EQ(interactive.questions.size(), asked + 1);
-    EXPECT_TRUE(logic.identification().subCompartment.isEmpty());
+    EXPECT_TRUE(work.identification().subCompartment.isEmpty());
 
     interactive.unsavedAnswers.append(shell::UnsavedChoice::Discard);
     estateLogic.openSubCompartment(row);
     EXPECT_TRUE(interactive.messages.isEmpty());
     EXPECT_EQ(tableCells(), byHand);
-    EXPECT_TRUE(logic.felled());
-    EXPECT_EQ(logic.identification().subCompartment, QStringLiteral("GL-01"));
+    EXPECT_EQ(work.siteIndexText(), siteIndexByHand);
+    EXPECT_TRUE(work.felled());
+    EXPECT_EQ(work.identification().subCompartment, QStringLiteral("GL-01"));
     EXPECT_TRUE(documents.path().isEmpty());
     EXPECT_EQ(documents.displayName(), QStringLiteral("GL-01"));
     EXPECT_TRUE(documents.isModified());
@@ -257,8 +257,8 @@ TEST_F(EstateWindowTest, EveryRowOfTheExampleOpensGrownAndFelled) {
         interactive.unsavedAnswers.append(shell::UnsavedChoice::Discard);
         estateLogic.openSubCompartment(row);
         const auto &r = estateLogic.model().rows()[static_cast<std::size_t>(row)];
-        EXPECT_TRUE(logic.felled()) << r.id.toStdString();
-        EXPECT_EQ(logic.identification().subCompartment, r.id);
+        EXPECT_TRUE(work.felled()) << r.id.toStdString();
+        EXPECT_EQ(work.identification().subCompartment, r.id);
     }
     EXPECT_TRUE(interactive.messages.isEmpty()) << interactive.messages.value(0).text.toStdString();
 }

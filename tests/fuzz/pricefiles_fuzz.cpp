@@ -5,7 +5,7 @@
 //
 // Beyond not crashing: what was read, written back by the exit's writers and
 // read again, must come back the same.
-#include "economics/pricedata.hpp"
+#include "prices/pricedata.hpp"
 #include "scratchfolder.hpp"
 #include "shell/errorlog.hpp"
 
@@ -15,11 +15,11 @@
 namespace {
 
 using namespace arbolex;
-using economics::PriceData;
+using prices::PriceData;
 
-constexpr std::array kFiles = {economics::kCurrentPricesFile, economics::kPrivatePricesFile,
-                               economics::kUserPricesFile, economics::kAveragePricesFile,
-                               economics::kUserAssortmentsFile};
+constexpr std::array kFiles = {prices::kCurrentPricesFile, prices::kPrivatePricesFile,
+                               prices::kUserPricesFile, prices::kAveragePricesFile,
+                               prices::kUserAssortmentsFile};
 
 void writeParts(const QString &folder, const QList<QByteArray> &parts) {
     for (std::size_t i = 0; i < kFiles.size(); ++i) {
@@ -34,14 +34,14 @@ void writeParts(const QString &folder, const QList<QByteArray> &parts) {
 PriceData read(const QString &folder) {
     PriceData data;
     shell::ErrorLog log(fuzz::nowhere());
-    economics::GetPricesFromFiles(folder, data, log);
+    prices::GetPricesFromFiles(folder, data, log);
     return data;
 }
 
 /// A name holding a double quote cannot be written back quoted: the format
 /// has no escape for it.
 bool namesSurvive(const PriceData &data) {
-    for (const economics::UserCategory &c : data.categories) {
+    for (const prices::UserCategory &c : data.categories) {
         if (c.name.contains(QLatin1Char('"'))) {
             return false;
         }
@@ -75,8 +75,8 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t *data, std::size_t size
     // The exit writes three price lists and the categories; the private-sector
     // file is never written, so it stays as the input gave it.
     shell::ErrorLog log(fuzz::nowhere());
-    economics::WritePricesInFiles(economics::kWriteAllPrices, folder, first, log);
-    economics::WriteUserDefinedAssortmentsInFile(folder, first, log);
+    prices::WritePricesInFiles(prices::kWriteAllPrices, folder, first, log);
+    prices::WriteUserDefinedAssortmentsInFile(folder, first, log);
     requireSame(first, read(folder));
     return 0;
 }

@@ -26,7 +26,7 @@ for file in bin/arbolex bin/arbolex-cli \
     share/metainfo/$id.metainfo.xml share/mime/packages/$id.xml \
     share/arbolex/data/CURPRIC.qdm share/arbolex/data/OVRA_PRIC.qdm \
     share/arbolex/data/USRPRIC.qdm share/arbolex/data/AvPRIC_npv.qdm \
-    share/arbolex/data/UD_Assort.qdm share/arbolex/data/AssortPrices.qdm \
+    share/arbolex/data/UD_Assort.qdm share/arbolex/data/AssortPrices.qdm share/arbolex/data/Costs.qdm \
     share/arbolex/data/IFPRM1.dat; do
     [[ -e $prefix/$file ]] || fail "$file is not installed"
 done

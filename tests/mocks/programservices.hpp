@@ -6,8 +6,8 @@
 
 #include "mocks/fakeinteractive.hpp"
 
-#include "economics/prices.hpp"
 #include "engine/grow.hpp"
+#include "prices/prices.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
 
@@ -33,7 +33,7 @@ struct ProgramServices {
     FakeInteractive interactive;
     shell::EngineReport report{interactive, log};
     engine::Grow grow{&report};
-    economics::Prices prices;
+    prices::Prices prices;
 };
 
 } // namespace arbolex::testing

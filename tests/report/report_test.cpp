@@ -5,7 +5,9 @@
 
 #include "charts/reportcontent.hpp"
 #include "document/documentwriter.hpp"
-#include "economics/pricedata.hpp"
+#include "economics/economicsmessages.hpp"
+#include "economics/economicswindowlogic.hpp"
+#include "prices/pricedata.hpp"
 #include "report/chartexport.hpp"
 #include "report/reportwriter.hpp"
 
@@ -13,6 +15,7 @@
 #include <QImage>
 #include <QProcess>
 #include <QRegularExpression>
+#include <QStandardPaths>
 
 namespace arbolex::testing {
 namespace {
@@ -35,7 +38,7 @@ int pdfPages(const QString &path) {
 class ReportTest : public MainWindowTest {
 protected:
     ReportTest() {
-        economics::GetPricesFromFiles(QStringLiteral(ARBOLEX_DATA_SOURCE), prices.data(), log);
+        prices::GetPricesFromFiles(QStringLiteral(ARBOLEX_DATA_SOURCE), prices.data(), log);
     }
 
     void closeRotation() {
@@ -50,7 +53,7 @@ protected:
 
 TEST_F(ReportTest, ContentCarriesTheRotationAndLeavesTheWindowAsItWas) {
     closeRotation();
-    const charts::ReportContent content = charts::reportContent(logic);
+    const charts::ReportContent content = charts::reportContent(work);
     EXPECT_EQ(content.projection.rows.size(), static_cast<std::size_t>(logic.table().lastRow()));
     EXPECT_EQ(content.projection.captions.size(), content.projection.groups.size());
     EXPECT_FALSE(content.summary.empty());
@@ -74,7 +77,7 @@ TEST_F(ReportTest, PdfHoldsTheTextPagesThenOnePagePerChart) {
     closeRotation();
     const QString pdf = path(QStringLiteral("report.pdf"));
     const int pages =
-        report::writeReportPdf(charts::reportContent(logic), pdf, QStringLiteral("today"));
+        report::writeReportPdf(charts::reportContent(work), pdf, QStringLiteral("today"));
     EXPECT_GE(pages, 4); // at least one page of text and the three charts
     EXPECT_EQ(pdfPages(pdf), pages);
 
@@ -82,7 +85,7 @@ TEST_F(ReportTest, PdfHoldsTheTextPagesThenOnePagePerChart) {
     logic.cmdClear_Click();
     typeStand(QStringLiteral("30"));
     logic.cmdGrow_Click();
-    const charts::ReportContent young = charts::reportContent(logic);
+    const charts::ReportContent young = charts::reportContent(work);
     EXPECT_TRUE(young.cashFlow.empty());
     EXPECT_TRUE(young.cashFlowChart.empty());
     EXPECT_EQ(pdfPages(pdf), pages) << "unchanged until written again";
@@ -91,9 +94,54 @@ TEST_F(ReportTest, PdfHoldsTheTextPagesThenOnePagePerChart) {
     EXPECT_EQ(youngPages, 3) << "one page of text, stand and increments";
 }
 
+TEST_F(ReportTest, EconomicsPageOnlyWhileTheEconomicsWindowShowsTheTablesFigures) {
+    closeRotation();
+    economics::EconomicsWindowLogic &economics = session.economics();
+    const QString pdf = path(QStringLiteral("economics.pdf"));
+    const int plainPages = report::writeReportPdf(charts::reportContent(work), pdf, QString());
+    EXPECT_FALSE(charts::reportContent(work, economics).economics)
+        << "the economics window never valued the rotation";
+
+    economics.cmdEconomics_Click();
+    charts::ReportContent content = charts::reportContent(work, economics);
+    ASSERT_TRUE(content.economics.has_value());
+    const charts::EconomicsPage &page = *content.economics;
+    EXPECT_EQ(page.title, QStringLiteral("Economics of the rotation at 5.00 % a year"));
+    // The figures as the window shows them, in its order.
+    ASSERT_EQ(page.figures.size(), 11U);
+    EXPECT_EQ(page.figures.front().first, economics::economicstext::figureNpv());
+    EXPECT_EQ(page.figures.front().second, economicsView.text(economics::EconomicsControl::lblNPV));
+    EXPECT_EQ(page.figures.back().second,
+              economicsView.text(economics::EconomicsControl::lblYieldClass));
+    EXPECT_FALSE(page.rotations.empty());
+    EXPECT_TRUE(page.regimes.empty()) << "the optimiser has not run";
+
+    // The optimiser's regimes, then the user's own; captions on one line.
+    economics.cmdOptimise_Click();
+    content = charts::reportContent(work, economics);
+    ASSERT_TRUE(content.economics.has_value());
+    const charts::ReportTable &regimes = content.economics->regimes;
+    ASSERT_EQ(regimes.rows.size(), economics.regimes().size() + 1);
+    EXPECT_EQ(regimes.rows.back().first(), economics::economicstext::regimeYours());
+    for (const QString &caption : regimes.captions) {
+        EXPECT_FALSE(caption.contains(u'\n')) << caption.toStdString();
+    }
+    EXPECT_EQ(report::writeReportPdf(content, pdf, QString()), plainPages + 1);
+    EXPECT_EQ(pdfPages(pdf), plainPages + 1);
+
+    // A table changed since is not the one valued: no page until Compute.
+    work.removeRowsFrom(logic.table().lastRow());
+    EXPECT_FALSE(charts::reportContent(work, economics).economics);
+    economics.cmdCompute_Click();
+    EXPECT_TRUE(charts::reportContent(work, economics).economics);
+    logic.ClearAll();
+    EXPECT_FALSE(charts::reportContent(work, economics).economics);
+    EXPECT_TRUE(interactive.messages.isEmpty());
+}
+
 TEST_F(ReportTest, UnwritableFilesAreRefused) {
     closeRotation();
-    const charts::ReportContent content = charts::reportContent(logic);
+    const charts::ReportContent content = charts::reportContent(work);
     const QString nowhere = path(QStringLiteral("no-such-folder/file"));
     EXPECT_EQ(report::writeReportPdf(content, nowhere + QStringLiteral(".pdf"), QString()), 0);
     EXPECT_FALSE(report::saveChartPng(content.standChart, nowhere + QStringLiteral(".png"),
@@ -104,7 +152,7 @@ TEST_F(ReportTest, UnwritableFilesAreRefused) {
 
 TEST_F(ReportTest, ChartsExportAsPngAndSvg) {
     closeRotation();
-    const charts::ReportContent content = charts::reportContent(logic);
+    const charts::ReportContent content = charts::reportContent(work);
     const QString png = path(QStringLiteral("stand.png"));
     ASSERT_TRUE(report::saveChartPng(content.standChart, png, QSize(640, 420)));
     const QImage image(png);
@@ -119,17 +167,27 @@ TEST_F(ReportTest, ChartsExportAsPngAndSvg) {
 }
 
 #ifdef ARBOLEX_CLI_PATH
-TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
-    ASSERT_TRUE(copyShippedData(dir.path()));
-    const QString script = path(QStringLiteral("rotation.txt"));
-    QFile file(script);
-    ASSERT_TRUE(file.open(QIODevice::WriteOnly));
-    file.write("model 0\nset txtFromA 15\nset txtFromN 2500\nset txtFromH 7\n"
-               "set txtFromB 20\nset txtNetArea 10\nset txtToA 60\nset txtByA 5\n"
-               "press cmdGrow\nanswer yes\npress cmdFinalCut\n");
-    file.close();
-    const QString pdf = path(QStringLiteral("cli.pdf"));
-    const auto run = [&](const QStringList &arguments) {
+/// The Sitka spruce rotation of closeRotation() as a script of the runner.
+constexpr char kRotationScript[] =
+    "model 0\nset txtFromA 15\nset txtFromN 2500\nset txtFromH 7\n"
+    "set txtFromB 20\nset txtNetArea 10\nset txtToA 60\nset txtByA 5\n"
+    "press cmdGrow\nanswer yes\npress cmdFinalCut\n";
+
+class ReportCommandTest : public ReportTest {
+protected:
+    ReportCommandTest() { EXPECT_TRUE(copyShippedData(dir.path())); }
+
+    QString writeScript(const QString &name, const QByteArray &lines) const {
+        const QString script = path(name);
+        QFile file(script);
+        EXPECT_TRUE(file.open(QIODevice::WriteOnly));
+        file.write(lines);
+        return script;
+    }
+
+    /// `arbolex-cli report ARGUMENTS` on the test's data folder: its exit
+    /// status and standard output.
+    std::pair<int, QString> run(const QStringList &arguments) const {
         QProcess process;
         QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
         environment.remove(QStringLiteral("QT_QPA_PLATFORM")); // it must not need a screen
@@ -137,9 +195,28 @@ TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
         process.start(QStringLiteral(ARBOLEX_CLI_PATH),
                       QStringList{QStringLiteral("report")} + arguments +
                           QStringList{QStringLiteral("--data-dir"), dir.path()});
-        EXPECT_TRUE(process.waitForFinished(60000));
+        EXPECT_TRUE(process.waitForFinished(120000));
         return std::pair{process.exitCode(), QString::fromUtf8(process.readAllStandardOutput())};
-    };
+    }
+};
+
+/// The text of pages `first` to `last` of a PDF, through poppler's pdftotext;
+/// empty without it.
+QString pdfText(const QString &pdf, int first, int last) {
+    const QString tool = QStandardPaths::findExecutable(QStringLiteral("pdftotext"));
+    if (tool.isEmpty()) {
+        return {};
+    }
+    QProcess process;
+    process.start(tool, {QStringLiteral("-f"), QString::number(first), QStringLiteral("-l"),
+                         QString::number(last), pdf, QStringLiteral("-")});
+    process.waitForFinished(60000);
+    return QString::fromUtf8(process.readAllStandardOutput());
+}
+
+TEST_F(ReportCommandTest, CommandLineWritesTheSamePdfWithoutAScreen) {
+    const QString script = writeScript(QStringLiteral("rotation.txt"), kRotationScript);
+    const QString pdf = path(QStringLiteral("cli.pdf"));
     const auto [status, out] =
         run({QStringLiteral("--script"), script, QStringLiteral("--out"), pdf});
     ASSERT_EQ(status, 0) << out.toStdString();
@@ -150,13 +227,13 @@ TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
     type(MainControl::txtNetArea, QStringLiteral("10"));
     typeStand(QStringLiteral("40"));
     logic.cmdGrow_Click();
-    logic.setIdentification(
+    work.setIdentification(
         {QStringLiteral("Kilbrack"), QStringLiteral("12"), QStringLiteral("b"), QString()});
     const QString saved = path(QStringLiteral("kilbrack.arbolex"));
     QString reason;
-    ASSERT_TRUE(document::writeDocumentFile(saved, logic.snapshot(), reason))
+    ASSERT_TRUE(document::writeDocumentFile(saved, work.snapshot(), reason))
         << reason.toStdString();
-    EXPECT_EQ(charts::reportContent(logic).forest, QStringLiteral("Kilbrack"));
+    EXPECT_EQ(charts::reportContent(work).forest, QStringLiteral("Kilbrack"));
     EXPECT_EQ(run({saved, QStringLiteral("--out"), pdf}).first, 0);
     EXPECT_EQ(pdfPages(pdf), 3) << "text, stand and increments: no cash flow yet";
 
@@ -169,6 +246,42 @@ TEST_F(ReportTest, CommandLineWritesTheSamePdfWithoutAScreen) {
                    QStringLiteral("--out"), pdf})
                   .first,
               2);
+}
+
+TEST_F(ReportCommandTest, ScriptThatValuedTheRotationAddsTheEconomicsPage) {
+    if (QStandardPaths::findExecutable(QStringLiteral("pdftotext")).isEmpty()) {
+        GTEST_SKIP() << "no pdftotext (poppler-utils) to read the pages";
+    }
+    const QString plain = path(QStringLiteral("plain.pdf"));
+    const QString valued = path(QStringLiteral("valued.pdf"));
+    ASSERT_EQ(
+        run({QStringLiteral("--script"), writeScript(QStringLiteral("plain.txt"), kRotationScript),
+             QStringLiteral("--out"), plain})
+            .first,
+        0);
+    const QByteArray economics = QByteArray(kRotationScript) +
+                                 "press cmdEconomics\n"
+                                 "set frmEconomics.txtInterestRate 3.00\n"
+                                 "press frmEconomics.cmdCompute\n"
+                                 "press frmEconomics.cmdOptimise\n";
+    ASSERT_EQ(
+        run({QStringLiteral("--script"), writeScript(QStringLiteral("economics.txt"), economics),
+             QStringLiteral("--out"), valued})
+            .first,
+        0);
+    const int pages = pdfPages(valued);
+    ASSERT_EQ(pages, pdfPages(plain) + 1);
+    EXPECT_FALSE(pdfText(plain, 1, pdfPages(plain)).contains(QStringLiteral("Economics of")));
+    const QString last = pdfText(valued, pages, pages);
+    for (const QString &shown :
+         {QStringLiteral("Economics of the rotation at 3.00 % a year"),
+          QStringLiteral("Land expectation value"),
+          QStringLiteral("NPV, LEV and MAI by rotation age"),
+          QStringLiteral("regimes of the largest LEV at 3.00 % a year"),
+          economics::economicstext::regimeYours(), QStringLiteral("Page %1 of %1").arg(pages)}) {
+        EXPECT_TRUE(last.contains(shown)) << shown.toStdString() << " not in\n"
+                                          << last.toStdString();
+    }
 }
 #endif
 

@@ -151,9 +151,15 @@ INSTANTIATE_TEST_SUITE_P(
                     ProblemCase{"before today", {}, 14, true}));
 
 TEST_F(RotationTest, RegimesTheStandCannotCarryAreRefused) {
+    // The thinning window refuses to remove more than stands: the path ends
+    // at the first thinning, and a rotation past it gets the window's message.
     Regime heavy = m_thinning;
     heavy.thinVolume = 5000.0f;
-    EXPECT_TRUE(refused(kSitka, heavy).badInput);
+    const GrowthPath stopped = grown(kSitka, heavy);
+    ASSERT_TRUE(stopped.stop.has_value());
+    EXPECT_EQ(stopped.lastAge(), 20);
+    EXPECT_EQ(rotationProblem(stopped, heavy, 40),
+              "FAULT - Proposed thinning leads to negative or zero Volume.");
     Regime early = m_thinning;
     early.thinFrom = 12;
     EXPECT_TRUE(refused(kSitka, early).badInput);
@@ -219,6 +225,48 @@ TEST_F(RotationTest, BreakEvenFactorOnThePricesBringsTheLevToZero) {
     EXPECT_LT(*v.breakEvenPriceFactor, 1.0);
     ASSERT_EQ(v.irr.outcome, valuation::IrrOutcome::kRoot);
     EXPECT_GT(v.irr.ratePercent, 3.0);
+}
+
+TEST_F(RotationTest, CashFlowEntriesCountInEveryRotationThatReachesThem) {
+    const GrowthPath path = grown(kSitka, m_thinning);
+    Economics e = economics(3.0);
+    e.annualCost = 5.0;
+    const RotationValue plain = valueRotation(path, 45, e);
+    e.entries = {{16, 1200.0, 0.0}, {28, 0.0, 300.5}, {45, 450.0, 0.0}, {55, 999.0, 0.0}};
+    const RotationValue v = valueRotation(path, 45, e);
+    EXPECT_EQ(v.cashflow[16].cost, 1205.0);
+    EXPECT_EQ(v.cashflow[28].otherRevenue, 300.5);
+    EXPECT_EQ(v.cashflow[28].revenue, plain.cashflow[28].revenue) << "not timber";
+    EXPECT_EQ(v.cashflow[45].cost, 455.0);
+    // From the present age each year's cash flow is discounted and rounded
+    // to cents: the entries move the NPV by their own discounted cents.
+    const auto cents = [](double euro, int years) {
+        return std::nearbyint(euro / std::pow(1.03, years) * 100.0) / 100.0;
+    };
+    EXPECT_NEAR(*v.npv - *plain.npv, -cents(1200.0, 1) + cents(300.5, 13) - cents(450.0, 30), 0.03);
+    // The entry at 55 comes after the final cut at 45: it is not counted.
+    e.entries.pop_back();
+    EXPECT_EQ(valueRotation(path, 45, e).lev, v.lev);
+    // Other revenues do not follow timber prices: the break-even factor on the
+    // prices alone brings the LEV to 0.
+    ASSERT_TRUE(v.breakEvenPriceFactor.has_value());
+    for (double &p : e.prices) {
+        p *= *v.breakEvenPriceFactor;
+    }
+    EXPECT_NEAR(*valueRotation(path, 45, e).lev, 0.0, 1e-6);
+    // The explorer's rotations that reach 55 count its entry.
+    e.prices = stepPrices();
+    e.entries = {{55, 999.0, 0.0}};
+    const RotationExplorer explorer = exploreRotations(path, m_thinning, e);
+    Economics none = e;
+    none.entries.clear();
+    const RotationExplorer without = exploreRotations(path, m_thinning, none);
+    ASSERT_EQ(explorer.rows.size(), without.rows.size());
+    for (std::size_t i = 0; i < explorer.rows.size(); ++i) {
+        const RotationRow &row = explorer.rows[i];
+        EXPECT_EQ(row.npv, valueRotation(path, row.age, e).npv) << row.age;
+        EXPECT_EQ(row.age < 55, row.lev == without.rows[i].lev) << row.age;
+    }
 }
 
 TEST_F(RotationTest, ExplorerAgreesWithEachRotationAndNamesBothOptima) {

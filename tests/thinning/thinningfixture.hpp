@@ -2,7 +2,8 @@
 
 #include "workflow/mainwindowfixture.hpp"
 
-#include "economics/pricedata.hpp"
+#include "prices/costfile.hpp"
+#include "prices/pricedata.hpp"
 #include "shell/vbformat.hpp"
 #include "thinning/headlessthinview.hpp"
 #include "thinning/thinwindowlogic.hpp"
@@ -13,14 +14,14 @@ namespace arbolex::testing {
 
 using thinning::ThinControl;
 
-/// The main window with a thinning window attached, the shipped price lists,
-/// and model 0 grown from age 15 to `to`.
+/// The main window with a thinning window attached, the shipped price lists
+/// and default costs, and model 0 grown from age 15 to `to`.
 class ThinningTest : public MainWindowTest {
 protected:
     ThinningTest() {
         const QDir source(QStringLiteral(ARBOLEX_DATA_SOURCE));
-        economics::GetPricesFromFiles(source.path(), prices.data(), log);
-        logic.attachThinning(&thin);
+        prices::GetPricesFromFiles(source.path(), prices.data(), log);
+        prices::GetCostsFromFile(source.path(), prices.data(), log);
     }
 
     void growTo(const QString &to, const QString &by = QStringLiteral("5")) {
@@ -37,10 +38,9 @@ protected:
     void typeThin(ThinControl c, const QString &text) { thin.typeText(c, text); }
     float number(ThinControl c) const { return static_cast<float>(shell::val(thinView.text(c))); }
 
-    const workflow::TableRow &lastRow() const { return logic.table().row(logic.table().lastRow()); }
+    const work::TableRow &lastRow() const { return logic.table().row(logic.table().lastRow()); }
 
-    thinning::HeadlessThinView thinView;
-    thinning::ThinWindowLogic thin{logic, thinView, interactive};
+    thinning::ThinWindowLogic &thin = session.thinning();
 };
 
 } // namespace arbolex::testing

@@ -2,7 +2,7 @@
 // re-opening one, and the thinning loop.
 #include "thinningfixture.hpp"
 
-#include "economics/pricelookup.hpp"
+#include "prices/pricelookup.hpp"
 #include "thinning/thinmessages.hpp"
 #include "workflow/mainmessages.hpp"
 
@@ -10,6 +10,7 @@ namespace arbolex::testing {
 namespace {
 
 using namespace workflow;
+using namespace work;
 
 TEST_F(ThinningTest, AcceptWithNothingRemovedStoresNothing) {
     openThinning();
@@ -20,7 +21,7 @@ TEST_F(ThinningTest, AcceptWithNothingRemovedStoresNothing) {
     thin.cmdAccept_Click();
     EXPECT_EQ(logic.table().rowCount(), rows);
     EXPECT_FALSE(thinView.isShown());
-    EXPECT_TRUE(thin.flags().noThinningYet);
+    EXPECT_FALSE(work.thinned());
 }
 
 TEST_F(ThinningTest, AcceptedThinningRowShowsTheThinnedStandAndItsValue) {
@@ -41,16 +42,16 @@ TEST_F(ThinningTest, AcceptedThinningRowShowsTheThinnedStandAndItsValue) {
     EXPECT_EQ(row.cells[kColBasalArea], shell::formatNumber(w.postBasalArea, u"##0.0"));
     EXPECT_EQ(row.cells[kColThinVolumePerHa], QStringLiteral("60"));
     const double meanTree = row.record.removedVolume / std::nearbyint(row.record.removedStocking);
-    const double price = economics::TrouveIndicePrix(meanTree, prices.data().current, interactive);
+    const double price = prices::TrouveIndicePrix(meanTree, prices.data().current, interactive);
     EXPECT_EQ(row.cells[kColValuePerHa],
               shell::formatNumber(row.record.removedVolume * price, u"####0"));
-    EXPECT_GT(logic.timberRevenue().at(30), 0.0);
+    EXPECT_GT(work.timberRevenue().at(30), 0.0);
     // Total production is the stand before the thinning.
     EXPECT_EQ(row.cells[kColTotBasalArea], shell::formatNumber(w.preBasalArea, u"##0.0"));
     // The thinned stand is the new grow-from stand.
     EXPECT_EQ(view.text(MainControl::txtFromB), row.cells[kColBasalArea]);
     EXPECT_EQ(view.text(MainControl::txtFromN), row.cells[kColStocking]);
-    EXPECT_FALSE(thin.flags().noThinningYet);
+    EXPECT_TRUE(work.thinned());
     EXPECT_FALSE(thinView.isShown());
 }
 

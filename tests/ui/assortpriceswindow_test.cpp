@@ -1,6 +1,6 @@
 // The assortment prices window wired to its logic: opened from the timber
 // prices window, keys reach the prices only after Allow Changes, and pasting
-// never does.
+// never does; Escape and the close button close each price list alone.
 #include "guifixture.hpp"
 
 #include "economics/assortpriceswindowlogic.hpp"
@@ -20,13 +20,7 @@ using economics::AssortPricesControl;
 
 class AssortPricesGuiTest : public MainWindowGuiTest {
 protected:
-    AssortPricesGuiTest() {
-        pricesWindow.attach(pricesLogic);
-        assortWindow.attach(assortLogic);
-        pricesLogic.attachAssortmentPrices(&assortLogic);
-        logic.attachTimberPrices(&pricesLogic);
-        window.show();
-    }
+    AssortPricesGuiTest() { window.show(); }
 
     QLineEdit *priceField(int k) const {
         return qobject_cast<QLineEdit *>(
@@ -36,10 +30,10 @@ protected:
         qobject_cast<QPushButton *>(assortWindow.control({c, 0}))->click();
     }
 
-    ui::TimberPricesWindow pricesWindow{&window};
-    economics::TimberPricesWindowLogic pricesLogic{prices, log, pricesWindow};
-    ui::AssortPricesWindow assortWindow{&window};
-    economics::AssortPricesWindowLogic assortLogic{prices.data(), log, assortWindow, interactive};
+    ui::TimberPricesWindow &pricesWindow = desktop.pricesWindow();
+    economics::TimberPricesWindowLogic &pricesLogic = session.timberPrices();
+    ui::AssortPricesWindow &assortWindow = desktop.assortPricesWindow();
+    economics::AssortPricesWindowLogic &assortLogic = session.assortPrices();
 };
 
 TEST_F(AssortPricesGuiTest, OpenedFromTheTimberPricesAndEditedThroughTheKeyFilter) {
@@ -70,6 +64,28 @@ TEST_F(AssortPricesGuiTest, OpenedFromTheTimberPricesAndEditedThroughTheKeyFilte
 
     press(AssortPricesControl::cmdCloseAsmtPrices);
     EXPECT_FALSE(assortWindow.isVisible());
+}
+
+TEST_F(AssortPricesGuiTest, EscapeAndTheCloseButtonCloseEachPriceListAlone) {
+    logic.cmdShowTimberPrice_Click();
+    assortLogic.show();
+    ASSERT_TRUE(pricesWindow.isVisible());
+    ASSERT_TRUE(assortWindow.isVisible());
+    pressKey(&assortWindow, Qt::Key_Escape);
+    EXPECT_FALSE(assortWindow.isVisible());
+    EXPECT_TRUE(pricesWindow.isVisible());
+
+    assortLogic.show();
+    static_cast<QWidget &>(pricesWindow).close(); // the title bar's close button
+    EXPECT_FALSE(pricesWindow.isVisible());
+    EXPECT_TRUE(assortWindow.isVisible());
+    static_cast<QWidget &>(assortWindow).close();
+    EXPECT_FALSE(assortWindow.isVisible());
+
+    logic.cmdShowTimberPrice_Click();
+    pressKey(&pricesWindow, Qt::Key_Escape);
+    EXPECT_FALSE(pricesWindow.isVisible());
+    EXPECT_TRUE(interactive.messages.isEmpty());
 }
 
 } // namespace

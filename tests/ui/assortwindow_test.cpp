@@ -31,17 +31,7 @@ void click(QWidget *button) {
 
 class AssortWindowGuiTest : public MainWindowGuiTest {
 protected:
-    AssortWindowGuiTest() {
-        thinWindow.attach(thin);
-        logic.attachThinning(&thin);
-        assortWindow.attach(assort);
-        logic.attachAssortments(&assort);
-        thin.attachAssortments(&assort);
-        userWindow.attach(user);
-        QObject::connect(window.assortUserAction(), &QAction::triggered, &window,
-                         [this] { user.mnuAssortUser_Click(); });
-        window.show();
-    }
+    AssortWindowGuiTest() { window.show(); }
 
     void growTo(const QString &age) {
         field(MainControl::txtToA)->setText(age);
@@ -50,12 +40,12 @@ protected:
 
     QString shown(AssortControl c) const { return assortWindow.text(c); }
 
-    ui::ThinWindow thinWindow{&window};
-    thinning::ThinWindowLogic thin{logic, thinWindow, interactive};
-    ui::AssortWindow assortWindow{&window};
-    assortments::AssortWindowLogic assort{logic, assortWindow, interactive};
-    ui::AssortUserWindow userWindow{&window};
-    assortments::AssortUserLogic user{prices.data(), assort.session(), userWindow, interactive};
+    ui::ThinWindow &thinWindow = desktop.thinWindow();
+    thinning::ThinWindowLogic &thin = session.thinning();
+    ui::AssortWindow &assortWindow = desktop.assortWindow();
+    assortments::AssortWindowLogic &assort = session.assort();
+    ui::AssortUserWindow &userWindow = desktop.assortUserWindow();
+    assortments::AssortUserLogic &user = session.assortUser();
 };
 
 TEST_F(AssortWindowGuiTest, AssortButtonReportsTheSelectedGrowthRow) {

@@ -28,7 +28,6 @@ void click(QWidget *button) {
 class EconomicsWindowGuiTest : public MainWindowGuiTest {
 protected:
     EconomicsWindowGuiTest() {
-        economicsWindow.attach(economics);
         window.show();
         field(MainControl::txtToA)->setText(QStringLiteral("45"));
         logic.cmdGrow_Click();
@@ -46,10 +45,9 @@ protected:
 
     ~EconomicsWindowGuiTest() override { economicsWindow.waitForWork(); }
 
-    ui::ThinWindow thinWindow{&window};
-    thinning::ThinWindowLogic thin{logic, thinWindow, interactive};
-    ui::EconomicsWindow economicsWindow{&window};
-    economics::EconomicsWindowLogic economics{logic, thin, economicsWindow, interactive};
+    thinning::ThinWindowLogic &thin = session.thinning();
+    ui::EconomicsWindow &economicsWindow = desktop.economicsWindow();
+    economics::EconomicsWindowLogic &economics = session.economics();
 };
 
 TEST_F(EconomicsWindowGuiTest, EveryChartIsDrawnByTheTimeItsTabIsShown) {

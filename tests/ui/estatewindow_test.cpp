@@ -1,6 +1,7 @@
 // The estate window on the screen: the run goes beside the window, the table
 // sorts by the figures' values, a double-click opens the row under the mouse
 // whatever the order, rows not grown are marked, and the chart stacks species.
+#include "estate/resulttable.hpp"
 #include "guifixture.hpp"
 
 #include "document/documentcontroller.hpp"
@@ -23,8 +24,6 @@ using estatewindow::EstateResultsModel;
 class EstateWindowGuiTest : public MainWindowGuiTest {
 protected:
     EstateWindowGuiTest() {
-        estateWindow.attach(estate);
-        documents.start();
         QFile example(QDir(QStringLiteral(ARBOLEX_DATA_SOURCE))
                           .filePath(QStringLiteral("examples/estate.csv")));
         QFile marked(dir.filePath(QStringLiteral("marked.csv")));
@@ -42,11 +41,9 @@ protected:
         QCoreApplication::processEvents();
     }
 
-    ui::ThinWindow thinWindow{&window};
-    thinning::ThinWindowLogic thin{logic, thinWindow, interactive};
-    document::DocumentController documents{logic, interactive, nullptr};
-    ui::EstateWindow estateWindow{&window};
-    estatewindow::EstateWindowLogic estate{logic, thin, documents, estateWindow, interactive};
+    document::DocumentController &documents = session.documents();
+    ui::EstateWindow &estateWindow = desktop.estateWindow();
+    estatewindow::EstateWindowLogic &estate = session.estate();
 };
 
 TEST_F(EstateWindowGuiTest, SortedTableOpensTheRowDoubleClickedAndMarksTheRefused) {
@@ -60,8 +57,13 @@ TEST_F(EstateWindowGuiTest, SortedTableOpensTheRowDoubleClickedAndMarksTheRefuse
     table->sortByColumn(EstateResultsModel::kNpvColumn, Qt::DescendingOrder);
     double best = 0.0;
     QString bestId;
+    const auto &columns = estate::figureColumns();
+    const auto npvColumn = static_cast<std::size_t>(
+        std::find_if(columns.begin(), columns.end(),
+                     [](const estate::ResultColumn &c) { return c.name == "npv_ha"; }) -
+        columns.begin());
     for (const auto &row : estate.model().rows()) {
-        const double npv = QString::fromStdString(row.figures[11]).toDouble();
+        const double npv = QString::fromStdString(row.figures.at(npvColumn)).toDouble();
         if (row.grown && npv > best) {
             best = npv;
             bestId = row.id;
@@ -78,7 +80,7 @@ TEST_F(EstateWindowGuiTest, SortedTableOpensTheRowDoubleClickedAndMarksTheRefuse
 
     table->sortByColumn(EstateResultsModel::kNpvColumn, Qt::DescendingOrder);
     emit table->doubleClicked(shown->index(0, EstateResultsModel::kNpvColumn));
-    EXPECT_EQ(logic.identification().subCompartment, bestId);
+    EXPECT_EQ(work.identification().subCompartment, bestId);
     EXPECT_EQ(documents.displayName(), bestId);
     // The chart: one stacked set per species over every year of the forecast.
     const auto *view = estateWindow.findChild<QChartView *>();

@@ -2,10 +2,11 @@
 
 #include "mocks/programservices.hpp"
 
-#include "economics/prices.hpp"
 #include "engine/grow.hpp"
+#include "prices/prices.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
+#include "ui/desktop.hpp"
 #include "ui/mainwindow.hpp"
 #include "workflow/mainwindowlogic.hpp"
 
@@ -38,21 +39,27 @@ inline void typeKeys(QWidget *widget, const QString &text) {
     }
 }
 
-/// The main window on the screen (offscreen) with its logic, loaded from a
-/// temporary copy of the shipped data folder and settings in a temporary file.
-class MainWindowGuiTest : public ::testing::Test, protected ProgramServices {
+/// The desktop program's windows on the screen (offscreen) over one session,
+/// loaded from a temporary copy of the shipped data folder, with settings in a
+/// temporary file and message boxes recorded instead of shown.
+class MainWindowGuiTest : public ::testing::Test {
 protected:
-    MainWindowGuiTest() {
-        window.attach(logic, settings);
-        logic.Form_Load(settings, QRect(0, 0, 1600, 1000));
-    }
+    MainWindowGuiTest() { desktop.load(QRect(0, 0, 1600, 1000)); }
 
     QLineEdit *field(MainControl c) const { return qobject_cast<QLineEdit *>(window.control(c)); }
 
+    QTemporaryDir dir;
+    FakeInteractive interactive;
     bool dataCopied = copyShippedData(dir.path());
     QSettings settings{dir.filePath(QStringLiteral("settings.ini")), QSettings::IniFormat};
-    ui::MainWindow window;
-    workflow::MainWindowLogic logic{grow, prices, log, dir.path(), window, interactive};
+    ui::Desktop desktop{dir.path(), dir.path(), {&interactive, &settings}};
+    session::Session &session = desktop.session();
+    shell::ErrorLog &log = session.errorLog();
+    engine::Grow &grow = session.grow();
+    prices::Prices &prices = session.prices();
+    work::StandWork &work = session.work();
+    ui::MainWindow &window = desktop.mainWindow();
+    workflow::MainWindowLogic &logic = session.main();
 };
 
 } // namespace arbolex::testing

@@ -1,7 +1,8 @@
 // The main window wired to its logic: typing in the fields, leaving them, the
-// grow and clear commands through their buttons, the grid and its selection,
-// the model menu and closing the window.
+// grow and clear commands through their buttons, the other commands of the
+// panel, the grid and its selection, the model menu and closing the window.
 #include "guifixture.hpp"
+#include "work/worktexts.hpp"
 
 #include "shell/vbformat.hpp"
 #include "ui/projectionmodel.hpp"
@@ -18,7 +19,7 @@
 namespace arbolex::testing {
 namespace {
 
-using workflow::ProjectionTable;
+using work::ProjectionTable;
 
 void click(QWidget *button) {
     qobject_cast<QPushButton *>(button)->click();
@@ -94,7 +95,7 @@ TEST_F(MainWindowGuiTest, GrowButtonFillsTheGridWithTheLogicsRows) {
         }
     }
     EXPECT_EQ(model.data(model.index(0, 0)).toString(), QStringLiteral("15"));
-    EXPECT_EQ(model.headerData(0, Qt::Vertical).toString(), workflow::text::rowLabelGrowth());
+    EXPECT_EQ(model.headerData(0, Qt::Vertical).toString(), work::text::rowLabelGrowth());
 
     // The grid follows the logic's current row: the last one.
     EXPECT_EQ(table.currentRow(), 8);
@@ -123,17 +124,51 @@ TEST_F(MainWindowGuiTest, GridSelectionGoesToTheLogicAndUseRowContinuesFromIt) {
 TEST_F(MainWindowGuiTest, ClearAllAndClearSwitchTheHeaderLayout) {
     click(window.control(MainControl::cmdGrow));
     const ui::ProjectionModel &model = *window.gridModel();
-    ASSERT_EQ(model.columnCount(), workflow::kColumnCount);
+    ASSERT_EQ(model.columnCount(), work::kColumnCount);
 
     click(window.control(MainControl::cmdClearAll));
     EXPECT_EQ(model.rowCount(), 0);
-    EXPECT_EQ(model.columnCount(), workflow::kColumnCount - 1); // no money column
+    EXPECT_EQ(model.columnCount(), work::kColumnCount - 1); // no money column
     EXPECT_EQ(model.headerData(13, Qt::Horizontal).toString(), QStringLiteral("Tot Vol "));
     EXPECT_EQ(model.headerData(14, Qt::Horizontal).toString(), QStringLiteral("Tot Val"));
 
     click(window.control(MainControl::cmdClear));
-    EXPECT_EQ(model.columnCount(), workflow::kColumnCount);
+    EXPECT_EQ(model.columnCount(), work::kColumnCount);
     EXPECT_EQ(model.headerData(13, Qt::Horizontal).toString(), QStringLiteral(" \u20ac / ha"));
+}
+
+TEST_F(MainWindowGuiTest, EveryCommandButtonRunsItsOwnHandler) {
+    window.show();
+    field(MainControl::txtToA)->setText(QStringLiteral("60"));
+    click(window.control(MainControl::cmdGrow));
+    click(window.control(MainControl::cmdThin));
+    EXPECT_TRUE(desktop.thinWindow().isVisible());
+    desktop.thinWindow().reject();
+    click(window.control(MainControl::cmdAssort));
+    EXPECT_TRUE(desktop.assortWindow().isVisible());
+    desktop.assortWindow().hide();
+    click(window.control(MainControl::cmdShowTimberPrice));
+    EXPECT_TRUE(desktop.pricesWindow().isVisible());
+    desktop.pricesWindow().reject();
+
+    // Final Cut, its net present value accepted: NPV… opens the cash flow.
+    click(window.control(MainControl::cmdFinalCut));
+    EXPECT_TRUE(logic.table().row(logic.table().lastRow()).finalCut);
+    ASSERT_TRUE(window.control(MainControl::cmdNPV)->isEnabled());
+    click(window.control(MainControl::cmdNPV));
+    EXPECT_TRUE(desktop.npvWindow().isVisible());
+
+    click(window.control(MainControl::cmdSummary));
+    EXPECT_TRUE(logic.showingSummary());
+    click(window.control(MainControl::cmdSummary));
+    EXPECT_FALSE(logic.showingSummary());
+
+    // Delete Rows asks first; No keeps the rows.
+    const int rows = logic.table().lastRow();
+    interactive.answers = {false};
+    click(window.control(MainControl::cmdDeleteRows));
+    EXPECT_EQ(interactive.questions.size(), 2) << "the NPV question, then this one";
+    EXPECT_EQ(logic.table().lastRow(), rows);
 }
 
 TEST_F(MainWindowGuiTest, ModelMenuListsTheCatalogueAndSwitchesTheModel) {
@@ -153,7 +188,7 @@ TEST_F(MainWindowGuiTest, ModelMenuListsTheCatalogueAndSwitchesTheModel) {
 
     entries[3]->trigger();
     EXPECT_EQ(grow.modelId(), 3);
-    EXPECT_TRUE(window.windowTitle().endsWith(QStringLiteral("NS - (UnThinned)")));
+    EXPECT_TRUE(window.windowTitle().contains(QStringLiteral("MODEL IN USE :  NS - (UnThinned)")));
     EXPECT_EQ(window.modelMenu()->checkedAction(), entries[3]);
 
     // A model chosen elsewhere is marked in the menu too.
@@ -167,7 +202,10 @@ TEST_F(MainWindowGuiTest, ClosingTheWindowSavesPlacementAndStartupFile) {
     window.setPlacement(QRect(40, 60, 1160, 720));
     field(MainControl::txtFromA)->setText(QStringLiteral("22"));
     QFile::remove(dir.filePath(QStringLiteral("IFPRM1.dat")));
+    // The changed field is unsaved work: the window asks, and it is discarded.
+    interactive.unsavedAnswers = {shell::UnsavedChoice::Discard};
     window.close();
+    EXPECT_EQ(interactive.questions.size(), 1);
     settings.sync();
     EXPECT_EQ(settings.value(QStringLiteral("Settings/MainWidth")).toInt(), 1160);
     EXPECT_EQ(settings.value(QStringLiteral("Settings/MainHeight")).toInt(), 720);

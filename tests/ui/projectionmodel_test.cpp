@@ -10,15 +10,15 @@
 namespace arbolex::testing {
 namespace {
 
-using workflow::ProjectionTable;
-using workflow::RowKind;
-using workflow::TableRow;
+using work::ProjectionTable;
+using work::RowKind;
+using work::TableRow;
 
 TableRow rowOf(RowKind kind, const QString &age) {
     TableRow row;
     row.kind = kind;
-    row.cells = QStringList(workflow::kColumnCount, QString());
-    row.cells[workflow::kColAge] = age;
+    row.cells = QStringList(work::kColumnCount, QString());
+    row.cells[work::kColAge] = age;
     return row;
 }
 
@@ -55,11 +55,11 @@ TEST(ProjectionModelTest, AppendedRowsAreInsertedAndClearingResets) {
     EXPECT_EQ(seen.insertedLast, 2);
     EXPECT_EQ(model.data(model.index(2, 0)).toString(), QStringLiteral("25"));
 
-    table.clear(workflow::HeaderLayout::WithoutMoney);
+    table.clear(work::HeaderLayout::WithoutMoney);
     model.refresh(1);
     EXPECT_EQ(seen.resets, 1);
     EXPECT_EQ(model.rowCount(), 0);
-    EXPECT_EQ(model.columnCount(), workflow::kColumnCount - 1);
+    EXPECT_EQ(model.columnCount(), work::kColumnCount - 1);
 }
 
 TEST(ProjectionModelTest, ThinningRowsAndSeparatorsAreToldApart) {
@@ -72,18 +72,17 @@ TEST(ProjectionModelTest, ThinningRowsAndSeparatorsAreToldApart) {
         return model.data(model.index(row, column), Qt::BackgroundRole);
     };
     // Growth rows keep the grid's alternating colours; thinning rows are tinted.
-    EXPECT_FALSE(background(0, workflow::kColAge).isValid());
-    ASSERT_TRUE(background(1, workflow::kColAge).canConvert<QBrush>());
-    EXPECT_EQ(model.data(model.index(0, workflow::kColAge), Qt::TextAlignmentRole)
-                      .value<Qt::Alignment>() &
-                  Qt::AlignRight,
-              Qt::AlignRight);
+    EXPECT_FALSE(background(0, work::kColAge).isValid());
+    ASSERT_TRUE(background(1, work::kColAge).canConvert<QBrush>());
+    EXPECT_EQ(
+        model.data(model.index(0, work::kColAge), Qt::TextAlignmentRole).value<Qt::Alignment>() &
+            Qt::AlignRight,
+        Qt::AlignRight);
 
     for (int c = 0; c < model.columnCount(); ++c) {
         const int column = model.tableColumn(c);
-        const bool separator = column == workflow::kColSeparator1 ||
-                               column == workflow::kColSeparator2 ||
-                               column == workflow::kColSeparator3;
+        const bool separator = column == work::kColSeparator1 || column == work::kColSeparator2 ||
+                               column == work::kColSeparator3;
         EXPECT_EQ(model.isSeparator(c), separator) << "column " << column;
     }
 }

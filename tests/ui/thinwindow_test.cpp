@@ -2,6 +2,7 @@
 // window's Thin button, the fields' key filter, preview, accept, the ways out
 // without a thinning, and the loop frame.
 #include "guifixture.hpp"
+#include "work/worktexts.hpp"
 
 #include "shell/vbtext.hpp"
 #include "thinning/thinwindowlogic.hpp"
@@ -29,11 +30,7 @@ void click(QWidget *button) {
 /// 7 m, 20 m²/ha) with the thinning window attached as in the program.
 class ThinWindowGuiTest : public MainWindowGuiTest {
 protected:
-    ThinWindowGuiTest() {
-        thinWindow.attach(thin);
-        logic.attachThinning(&thin);
-        window.show();
-    }
+    ThinWindowGuiTest() { window.show(); }
 
     /// Grows to `age` by 5 and presses the main window's Thin button.
     void openThinningAt(const QString &age) {
@@ -52,8 +49,8 @@ protected:
         return interactive.messages.isEmpty() ? QString() : interactive.messages.front().text;
     }
 
-    ui::ThinWindow thinWindow{&window};
-    thinning::ThinWindowLogic thin{logic, thinWindow, interactive};
+    ui::ThinWindow &thinWindow = desktop.thinWindow();
+    thinning::ThinWindowLogic &thin = session.thinning();
 };
 
 TEST_F(ThinWindowGuiTest, MainThinButtonIsOfferedByThinnedModelsOnly) {
@@ -102,8 +99,8 @@ TEST_F(ThinWindowGuiTest, OpensCentredOverTheMainWindowWithTheStandBeforeThinnin
     const QPoint offset = thinWindow.frameGeometry().center() - window.frameGeometry().center();
     EXPECT_LE(offset.manhattanLength(), 2);
 
-    const workflow::TableRow &last = logic.table().row(logic.table().lastRow());
-    EXPECT_EQ(thinWindow.text(ThinControl::lblPreN), last.cells[workflow::kColStocking]);
+    const work::TableRow &last = logic.table().row(logic.table().lastRow());
+    EXPECT_EQ(thinWindow.text(ThinControl::lblPreN), last.cells[work::kColStocking]);
     EXPECT_NEAR(number(ThinControl::lblPreV), last.record.volume, 0.01);
     EXPECT_TRUE(thinWindow.text(ThinControl::txtRemV).isEmpty());
     EXPECT_FALSE(thinControl(ThinControl::cmdAccept)->isEnabled()); // nothing previewed yet
@@ -134,7 +131,7 @@ TEST_F(ThinWindowGuiTest, PreviewFillsThePostThinColumnAndAcceptWritesTheThinnin
     click(thinControl(ThinControl::cmdAccept));
     EXPECT_FALSE(thinWindow.isVisible());
     ASSERT_EQ(gridRows(), rowsBefore + 1);
-    EXPECT_EQ(rowLabel(gridRows()), workflow::text::rowLabelThinning());
+    EXPECT_EQ(rowLabel(gridRows()), work::text::rowLabelThinning());
     EXPECT_EQ(window.gridModel()->data(window.gridModel()->index(gridRows() - 1, 0)).toString(),
               QStringLiteral("30"));
     // The next grow continues from the thinned stand.
@@ -206,8 +203,8 @@ TEST_F(ThinWindowGuiTest, LoopControlsFollowActivateLoopAndLoopThinsEveryFewYear
     for (int r = 1; r <= gridRows(); ++r) {
         labels << rowLabel(r);
     }
-    const QString g = workflow::text::rowLabelGrowth();
-    const QString t = workflow::text::rowLabelThinning();
+    const QString g = work::text::rowLabelGrowth();
+    const QString t = work::text::rowLabelThinning();
     EXPECT_EQ(labels, (QStringList{g, g, t, g, t, g, t, g}));
     EXPECT_TRUE(thinWindow.isVisible());
     EXPECT_TRUE(thinWindow.windowTitle().endsWith(QStringLiteral("Thinning at age 35")));

@@ -20,11 +20,7 @@ void click(QWidget *button) {
 
 class TimberPricesGuiTest : public MainWindowGuiTest {
 protected:
-    TimberPricesGuiTest() {
-        pricesWindow.attach(pricesLogic);
-        logic.attachTimberPrices(&pricesLogic);
-        window.show();
-    }
+    TimberPricesGuiTest() { window.show(); }
 
     QLineEdit *priceField(int index) const {
         return qobject_cast<QLineEdit *>(
@@ -39,8 +35,8 @@ protected:
         typeKeys(edit, keys);
     }
 
-    ui::TimberPricesWindow pricesWindow{&window};
-    economics::TimberPricesWindowLogic pricesLogic{prices, log, pricesWindow};
+    ui::TimberPricesWindow &pricesWindow = desktop.pricesWindow();
+    economics::TimberPricesWindowLogic &pricesLogic = session.timberPrices();
 };
 
 TEST_F(TimberPricesGuiTest, ShowTimberPricesOpensTheListsBesideTheirClasses) {
@@ -57,8 +53,8 @@ TEST_F(TimberPricesGuiTest, ShowTimberPricesOpensTheListsBesideTheirClasses) {
         qobject_cast<QRadioButton *>(single(TimberPricesControl::OptCurentPrices))->isChecked());
     // Every price is level with its class caption.
     for (int f = 0; f < economics::kPriceFieldCount; ++f) {
-        const QWidget *caption = pricesWindow.control(
-            {TimberPricesControl::lblTimbCat, f % economics::kPriceClassCount});
+        const QWidget *caption =
+            pricesWindow.control({TimberPricesControl::lblTimbCat, f % prices::kPriceClassCount});
         const int fieldMiddle =
             priceField(f)->mapTo(&pricesWindow, priceField(f)->rect().center()).y();
         const int captionMiddle = caption->mapTo(&pricesWindow, caption->rect().center()).y();
@@ -100,7 +96,7 @@ TEST_F(TimberPricesGuiTest, OptionButtonsChooseThePricesInUseAndNegativesAreRed)
     prices.data().privateSector[5] = -26.1;
     click(window.control(MainControl::cmdShowTimberPrice));
     click(single(TimberPricesControl::OptOvraPrices));
-    EXPECT_EQ(prices.priceSetInUse(), economics::kPrivatePrices);
+    EXPECT_EQ(prices.priceSetInUse(), prices::kPrivatePrices);
     EXPECT_EQ(prices.pricesInUse()[5], 26.1);
 
     QLineEdit *negative = priceField(39 + 5);

@@ -2,15 +2,17 @@
 // increments, continuing a projection, the change check, clearing and the
 // yield class.
 #include "mainwindowfixture.hpp"
+#include "work/worktexts.hpp"
 
+#include "rotation/yieldclass.hpp"
 #include "shell/vbformat.hpp"
 #include "workflow/mainmessages.hpp"
-#include "workflow/yieldclass.hpp"
 
 namespace arbolex::testing {
 namespace {
 
 using namespace workflow;
+using namespace work;
 
 TEST_F(MainWindowTest, GrowAppendsOneGrowthRowPerStep) {
     typeStand();
@@ -21,7 +23,7 @@ TEST_F(MainWindowTest, GrowAppendsOneGrowthRowPerStep) {
     for (int r = 1; r < t.rowCount(); ++r) {
         const TableRow &row = t.row(r);
         EXPECT_TRUE(row.isGrowth());
-        EXPECT_EQ(row.label, text::rowLabelGrowth());
+        EXPECT_EQ(row.label, work::text::rowLabelGrowth());
         EXPECT_EQ(cell(r, kColAge), QString::number(10 + 5 * r));
         EXPECT_EQ(row.cells.size(), kColumnCount);
         EXPECT_TRUE(cell(r, kColThinStocking).isEmpty());
@@ -89,7 +91,7 @@ TEST_F(MainWindowTest, ThinnedModelRefusesAChangedStart) {
     type(MainControl::txtFromA, QStringLiteral("20"));
     logic.cmdGrow_Click();
     ASSERT_EQ(interactive.messages.size(), 1);
-    EXPECT_EQ(interactive.messages[0].text, text::changesNotAllowed());
+    EXPECT_EQ(interactive.messages[0].text, workflow::text::changesNotAllowed());
     EXPECT_EQ(interactive.messages[0].style, 64);
     EXPECT_EQ(view.text(MainControl::txtFromA), QStringLiteral("50")) << "restored from the row";
     EXPECT_EQ(logic.table().rowCount(), 9);
@@ -110,7 +112,7 @@ TEST_F(MainWindowTest, UnthinnedModelMayRestartAnywhere) {
 TEST_F(MainWindowTest, UseRowCopiesItsCellsIntoTheFields) {
     logic.UseFlxRow();
     ASSERT_EQ(interactive.messages.size(), 1) << "no row to use";
-    EXPECT_EQ(interactive.messages[0].text, text::transferFailed());
+    EXPECT_EQ(interactive.messages[0].text, workflow::text::transferFailed());
     interactive.messages.clear();
 
     typeStand();
@@ -148,6 +150,7 @@ TEST_F(MainWindowTest, ClearAndClearAllShowTheirHeaderLayouts) {
 }
 
 TEST(YieldClassTest, CulminationAndEvenClasses) {
+    using rotation::yieldClass;
     EXPECT_EQ(yieldClass({}), 0);
     EXPECT_EQ(yieldClass({5, 8, 11, 12.9}), 0) << "still rising";
     EXPECT_EQ(yieldClass({5, 13, 12}), 14);
@@ -162,10 +165,10 @@ TEST_F(MainWindowTest, YieldClassShowsOnceTheMaiCulminates) {
     type(MainControl::txtFromH, QStringLiteral("11"));
     logic.cmdGrow_Click();
     EXPECT_TRUE(view.text(MainControl::lblYC).isEmpty());
-    EXPECT_EQ(view.hint(MainControl::lblYC), text::yieldClassInsufficient());
+    EXPECT_EQ(view.hint(MainControl::lblYC), workflow::text::yieldClassInsufficient());
     type(MainControl::txtToA, QStringLiteral("60"));
     logic.cmdGrow_Click();
-    EXPECT_EQ(logic.yieldClass(), 24);
+    EXPECT_EQ(work.yieldClass(), 24);
     EXPECT_EQ(view.text(MainControl::lblYC), QStringLiteral("24"));
 }
 

@@ -23,9 +23,9 @@ class GrowFromCheckTest : public MainWindowTest, public ::testing::WithParamInte
 TEST_P(GrowFromCheckTest, RefusesWithItsMessageAndFocus) {
     const CheckCase &c = GetParam();
     typeStand();
-    view.setText(c.control, QLatin1String(c.value));
+    logic.fields().fieldEdited(c.control, QLatin1String(c.value));
     if (c.control == MainControl::txtFromB) {
-        view.setText(MainControl::txtFromD, QString());
+        logic.fields().fieldEdited(MainControl::txtFromD, QString());
     }
     logic.cmdGrow_Click();
     ASSERT_EQ(interactive.messages.size(), 1);
@@ -62,10 +62,10 @@ INSTANTIATE_TEST_SUITE_P(Faults, GrowFromCheckTest, ::testing::Values(
 TEST_F(MainWindowTest, RangeBoundsAreInclusive) {
     for (const auto &[age, stocking] : {std::pair{"10", "100"}, std::pair{"60", "5000"}}) {
         typeStand(QStringLiteral("60"), QStringLiteral("0.1"));
-        view.setText(MainControl::txtFromA, QLatin1String(age));
-        view.setText(MainControl::txtFromN, QLatin1String(stocking));
-        EXPECT_TRUE(logic.ChkGrowFromFlds());
-        EXPECT_TRUE(logic.ChkGrowFromBnds()) << age << " " << stocking;
+        logic.fields().fieldEdited(MainControl::txtFromA, QLatin1String(age));
+        logic.fields().fieldEdited(MainControl::txtFromN, QLatin1String(stocking));
+        EXPECT_TRUE(logic.fields().ChkGrowFromFlds());
+        EXPECT_TRUE(logic.fields().ChkGrowFromBnds()) << age << " " << stocking;
     }
     EXPECT_TRUE(interactive.messages.isEmpty());
 }
@@ -74,7 +74,7 @@ TEST_F(MainWindowTest, LodgepoleUnthinnedStopsAtAge58) {
     logic.mnuModel_Click(7);
     typeStand(QStringLiteral("59"));
     type(MainControl::txtFromH, QStringLiteral("6"));
-    EXPECT_FALSE(logic.ChkGrowFromBnds());
+    EXPECT_FALSE(logic.fields().ChkGrowFromBnds());
     ASSERT_EQ(interactive.messages.size(), 1);
     EXPECT_EQ(interactive.messages[0].text, text::rangeToAgeLead() + QStringLiteral("58]"));
 }
@@ -82,30 +82,30 @@ TEST_F(MainWindowTest, LodgepoleUnthinnedStopsAtAge58) {
 TEST_F(MainWindowTest, BasalAreaAndDbhCompleteEachOther) {
     type(MainControl::txtFromN, QStringLiteral("2500"));
     type(MainControl::txtFromB, QStringLiteral("20"));
-    ASSERT_TRUE(logic.ChkGrowFromBD());
+    ASSERT_TRUE(logic.fields().ChkGrowFromBD());
     EXPECT_EQ(view.text(MainControl::txtFromD), QStringLiteral("10.1"));
 
-    view.setText(MainControl::txtFromB, QString());
+    logic.fields().fieldEdited(MainControl::txtFromB, QString());
     type(MainControl::txtFromD, QStringLiteral("12"));
-    ASSERT_TRUE(logic.ChkGrowFromBD());
+    ASSERT_TRUE(logic.fields().ChkGrowFromBD());
     EXPECT_EQ(view.text(MainControl::txtFromB), QStringLiteral("28.27"));
 
     // Both typed: the basal area wins and the DBH is derived again.
     type(MainControl::txtFromB, QStringLiteral("20"));
     type(MainControl::txtFromD, QStringLiteral("30"));
-    ASSERT_TRUE(logic.ChkGrowFromBD());
+    ASSERT_TRUE(logic.fields().ChkGrowFromBD());
     EXPECT_EQ(view.text(MainControl::txtFromD), QStringLiteral("10.1"));
 
     // A stocking of 0 counts as one stem: DBH = 200·√(BA/π).
     type(MainControl::txtFromN, QStringLiteral("0"));
-    view.setText(MainControl::txtFromD, QString());
-    ASSERT_TRUE(logic.ChkGrowFromBD());
+    logic.fields().fieldEdited(MainControl::txtFromD, QString());
+    ASSERT_TRUE(logic.fields().ChkGrowFromBD());
     EXPECT_EQ(view.text(MainControl::txtFromD), QStringLiteral("504.6"));
 
     // Neither given: nothing changes and the check still succeeds.
-    view.setText(MainControl::txtFromB, QString());
-    view.setText(MainControl::txtFromD, QString());
-    EXPECT_TRUE(logic.ChkGrowFromBD());
+    logic.fields().fieldEdited(MainControl::txtFromB, QString());
+    logic.fields().fieldEdited(MainControl::txtFromD, QString());
+    EXPECT_TRUE(logic.fields().ChkGrowFromBD());
     EXPECT_TRUE(view.text(MainControl::txtFromB).isEmpty());
 }
 

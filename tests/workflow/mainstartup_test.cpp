@@ -14,6 +14,7 @@ namespace arbolex::testing {
 namespace {
 
 using namespace workflow;
+using namespace work;
 
 const QRect kScreen(0, 0, 1920, 1080);
 
@@ -63,14 +64,14 @@ TEST_F(MainStartupTest, UnloadAndLoadRoundTrip) {
     type(MainControl::txtNetArea, QStringLiteral("12.5"));
     view.setPlacement(QRect(40, 60, 1000, 700));
     prices.data().userDefined[3] = 17.25;
-    logic.cashFlow().setInterestRate(3.25);
+    work.cashFlow().setInterestRate(3.25);
     logic.Form_Unload(settings);
 
-    HeadlessMainView nextView;
-    economics::Prices nextPrices;
-    MainWindowLogic next(grow, nextPrices, log, dir.path(), nextView, interactive);
-    next.Form_Load(settings, kScreen);
-    EXPECT_EQ(grow.modelId(), 4);
+    SessionServices nextRun(dir.path());
+    HeadlessMainView &nextView = nextRun.view;
+    prices::Prices &nextPrices = nextRun.prices;
+    nextRun.logic.Form_Load(settings, kScreen);
+    EXPECT_EQ(nextRun.grow.modelId(), 4);
     for (MainControl c : {MainControl::txtFromA, MainControl::txtFromN, MainControl::txtFromH,
                           MainControl::txtFromB, MainControl::txtToA, MainControl::txtByA,
                           MainControl::txtNetArea}) {
@@ -80,7 +81,7 @@ TEST_F(MainStartupTest, UnloadAndLoadRoundTrip) {
     }
     EXPECT_EQ(nextView.placement(), QRect(40, 60, 1000, 700));
     EXPECT_EQ(nextPrices.data().userDefined[3], 17.25);
-    EXPECT_EQ(next.cashFlow().interestRate(), 3.25);
+    EXPECT_EQ(nextRun.work.cashFlow().interestRate(), 3.25);
     EXPECT_TRUE(logLines().isEmpty());
 }
 

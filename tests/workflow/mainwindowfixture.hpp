@@ -2,9 +2,10 @@
 
 #include "mocks/programservices.hpp"
 #include "mocks/qtprinters.hpp"
+#include "mocks/sessionservices.hpp"
 
-#include "economics/prices.hpp"
 #include "engine/grow.hpp"
+#include "prices/prices.hpp"
 #include "shell/enginereport.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/vbtext.hpp"
@@ -22,7 +23,7 @@ using workflow::MainControl;
 
 /// A main window without a screen over a temporary data folder, with model 0
 /// active and the grow-from fields of a young Sitka spruce stand.
-class MainWindowTest : public ::testing::Test, protected ProgramServices {
+class MainWindowTest : public ::testing::Test, protected SessionServices {
 protected:
     MainWindowTest() {
         grow.GetModel(0);
@@ -51,9 +52,6 @@ protected:
         }
         return QString::fromUtf8(f.readAll()).split(QStringLiteral("\r\n"), Qt::SkipEmptyParts);
     }
-
-    workflow::HeadlessMainView view;
-    workflow::MainWindowLogic logic{grow, prices, log, dir.path(), view, interactive};
 };
 
 } // namespace arbolex::testing

@@ -1,20 +1,20 @@
 // The running sums of the removals that the total production reads.
-#include "workflow/projectiontable.hpp"
+#include "work/projectiontable.hpp"
 
 #include <gtest/gtest.h>
 
 namespace arbolex::workflow {
 namespace {
 
-TableRow removing(float volume) {
-    TableRow row;
+work::TableRow removing(float volume) {
+    work::TableRow row;
     row.record.removedVolume = volume;
     row.record.removedStocking = volume * 10.0f;
     return row;
 }
 
 TEST(ProjectionTableTest, RemovalSumsFollowEveryChangeOfTheRows) {
-    ProjectionTable table;
+    work::ProjectionTable table;
     for (const float volume : {0.0f, 40.0f, 0.0f, 35.5f}) {
         table.append(removing(volume));
     }
@@ -29,7 +29,7 @@ TEST(ProjectionTableTest, RemovalSumsFollowEveryChangeOfTheRows) {
     table.append(removing(1.0f));
     EXPECT_EQ(table.removalsUpTo(4).volume, 11.0) << "a removed row is not summed";
 
-    table.clear(HeaderLayout::WithMoney);
+    table.clear(work::HeaderLayout::WithMoney);
     EXPECT_EQ(table.removalsUpTo(4).volume, 0.0);
     table.append(removing(2.0f));
     EXPECT_EQ(table.removalsUpTo(1).volume, 2.0);

@@ -3,25 +3,22 @@
 #include "thinning/thinningfixture.hpp"
 
 #include "economics/npvwindowlogic.hpp"
-#include "economics/pricelookup.hpp"
+#include "prices/pricelookup.hpp"
+#include "rotation/yieldclass.hpp"
 #include "shell/iclipboard.hpp"
 #include "workflow/mainmessages.hpp"
-#include "workflow/yieldclass.hpp"
 
 namespace arbolex::testing {
 namespace {
 
 using namespace workflow;
+using namespace work;
 
 /// A Sitka spruce stand (age 15, 2500 stems/ha, 9 m, 22 m²/ha, 10 ha)
 /// grown to 30, thinned by 50 m³/ha and grown on to 60 by 5.
 class RotationTest : public ThinningTest {
 protected:
-    RotationTest() {
-        logic.attachNpv(&npv);
-        logic.attachClipboard(&clipboard);
-        prices.selectPriceSet(economics::kCurrentPrices);
-    }
+    RotationTest() { prices.selectPriceSet(prices::kCurrentPrices); }
 
     void growThinAndGrow(const QString &netArea = QStringLiteral("10")) {
         type(MainControl::txtFromA, QStringLiteral("15"));
@@ -49,16 +46,13 @@ protected:
         return all;
     }
 
-    economics::HeadlessNpvView npvView;
-    shell::HeadlessClipboard clipboard;
-    economics::NpvWindowLogic npv{logic.cashFlow(), logic.timberRevenue(), log,
-                                  npvView,          interactive,           clipboard};
+    economics::NpvWindowLogic &npv = session.npv();
 };
 
 TEST_F(RotationTest, FinalCutFellsTheStandingCropAndValuesIt) {
     growThinAndGrow();
     const int rows = logic.table().rowCount();
-    const double standing = logic.standingVolume();
+    const double standing = work.standingVolume();
     logic.cmdFinalCut_Click();
     ASSERT_EQ(logic.table().rowCount(), rows) << "the last growth row is the one felled";
     const TableRow &felled = lastRow();
@@ -73,7 +67,7 @@ TEST_F(RotationTest, FinalCutFellsTheStandingCropAndValuesIt) {
     }
     const double trees = std::nearbyint(shell::val(felled.cells[kColStocking]));
     const double meanTree = shell::val(felled.cells[kColVolumePerTree]);
-    const auto k = static_cast<std::size_t>(economics::priceClassOf(meanTree, interactive));
+    const auto k = static_cast<std::size_t>(prices::priceClassOf(meanTree, interactive));
     const double price = prices.pricesInUse()[k];
     EXPECT_EQ(felled.cells[kColValuePerHa], shell::formatNumber(standing * price, u"0"));
     EXPECT_EQ(felled.cells[kColThinTotalVolume],
@@ -85,8 +79,8 @@ TEST_F(RotationTest, FinalCutFellsTheStandingCropAndValuesIt) {
         EXPECT_EQ(felled.cells[c], QStringLiteral("0")) << "column " << c;
     }
     // The cash flow earns the long-term average price of the same class.
-    EXPECT_EQ(logic.timberRevenue().at(60), standing * prices.data().longTermAverage[k]);
-    EXPECT_GT(logic.timberRevenue().at(30), 0.0);
+    EXPECT_EQ(work.timberRevenue().at(60), standing * prices.data().longTermAverage[k]);
+    EXPECT_GT(work.timberRevenue().at(30), 0.0);
 
     // The rotation is closed.
     EXPECT_FALSE(view.isEnabled(MainControl::cmdGrow));
@@ -108,7 +102,7 @@ TEST_F(RotationTest, FinalCutFixesAnEvenYieldClassAndOffersTheNetPresentValue) {
         }
     }
     logic.cmdFinalCut_Click();
-    const int yc = workflow::yieldClass(mai);
+    const int yc = rotation::yieldClass(mai);
     EXPECT_GT(yc, 0);
     EXPECT_EQ(yc % 2, 0);
     EXPECT_EQ(view.text(MainControl::lblYC), QString::number(yc));
@@ -120,8 +114,8 @@ TEST_F(RotationTest, FinalCutFixesAnEvenYieldClassAndOffersTheNetPresentValue) {
     EXPECT_EQ(interactive.questions[0].text, text::npvOffer());
     EXPECT_TRUE(view.isEnabled(MainControl::cmdNPV));
     // The cash flow runs from the first year of the table to the final cut.
-    EXPECT_EQ(logic.cashFlow().rotationLength(), 45);
-    EXPECT_EQ(logic.cashFlow().firstYear(), 15);
+    EXPECT_EQ(work.cashFlow().rotationLength(), 45);
+    EXPECT_EQ(work.cashFlow().firstYear(), 15);
     logic.cmdNPV_Click();
     EXPECT_TRUE(npvView.isShown());
     EXPECT_EQ(npv.grid().size(), 47u);
@@ -132,7 +126,7 @@ TEST_F(RotationTest, DecliningTheNetPresentValueLeavesItOff) {
     interactive.answers = {false};
     logic.cmdFinalCut_Click();
     EXPECT_FALSE(view.isEnabled(MainControl::cmdNPV));
-    EXPECT_EQ(logic.cashFlow().years(), 0);
+    EXPECT_EQ(work.cashFlow().years(), 0);
     logic.cmdNPV_Click();
     EXPECT_FALSE(npvView.isShown());
     // Without a net area the sub-compartment totals are 0.
@@ -148,7 +142,7 @@ TEST_F(RotationTest, FinalCutAfterAThinningFellsWhatTheThinningLeft) {
     thin.cmdAccept_Click();
     const int thinRow = logic.table().lastRow();
     const QStringList thinCells = logic.table().row(thinRow).cells;
-    const double thinningRevenue = logic.timberRevenue().at(30);
+    const double thinningRevenue = work.timberRevenue().at(30);
     logic.cmdFinalCut_Click();
 
     ASSERT_EQ(logic.table().lastRow(), thinRow + 1);
@@ -159,8 +153,8 @@ TEST_F(RotationTest, FinalCutAfterAThinningFellsWhatTheThinningLeft) {
     EXPECT_EQ(felled.record.stocking, logic.table().row(thinRow).record.stocking);
     EXPECT_EQ(felled.cells[kColThinStocking], thinCells[kColStocking]);
     // Both harvests of the year earn their revenue.
-    EXPECT_GT(logic.timberRevenue().at(30), thinningRevenue);
-    EXPECT_DOUBLE_EQ(logic.timberRevenue().at(30), thinningRevenue + felled.timberRevenue);
+    EXPECT_GT(work.timberRevenue().at(30), thinningRevenue);
+    EXPECT_DOUBLE_EQ(work.timberRevenue().at(30), thinningRevenue + felled.timberRevenue);
     EXPECT_EQ(view.text(MainControl::lblYC), QStringLiteral("0"));
 }
 
@@ -168,7 +162,7 @@ TEST_F(RotationTest, FinalCutNeedsAStand) {
     logic.cmdFinalCut_Click();
     ASSERT_EQ(interactive.messages.size(), 1);
     EXPECT_EQ(interactive.messages[0].text, text::nothingToFell());
-    EXPECT_FALSE(logic.felled());
+    EXPECT_FALSE(work.felled());
 }
 
 TEST_F(RotationTest, SummaryCarriesTheStartTheThinningsTheFinalCutAndTotals) {
@@ -221,20 +215,20 @@ TEST_F(RotationTest, DeletingRowsReopensTheRotationWhereItWas) {
     logic.select(5, logic.table().lastRow());
     interactive.answers = {false};
     logic.cmdDeleteRows_Click();
-    EXPECT_TRUE(logic.felled()) << "No keeps every row";
+    EXPECT_TRUE(work.felled()) << "No keeps every row";
     ASSERT_EQ(interactive.questions.size(), 2);
     EXPECT_TRUE(interactive.questions[1].text.startsWith(QStringLiteral("PLEASE CONFIRM - ")));
 
     logic.select(5, logic.table().lastRow());
     logic.cmdDeleteRows_Click();
     ASSERT_EQ(logic.table().lastRow(), 4);
-    EXPECT_FALSE(logic.felled());
-    EXPECT_TRUE(logic.timberRevenue().byAge().empty());
-    EXPECT_EQ(logic.cashFlow().years(), 0);
+    EXPECT_FALSE(work.felled());
+    EXPECT_TRUE(work.timberRevenue().byAge().empty());
+    EXPECT_EQ(work.cashFlow().years(), 0);
     EXPECT_TRUE(view.isEnabled(MainControl::cmdGrow));
     EXPECT_TRUE(view.isEnabled(MainControl::cmdThin));
     EXPECT_FALSE(view.isEnabled(MainControl::cmdNPV));
-    EXPECT_TRUE(thin.flags().noThinningYet);
+    EXPECT_FALSE(work.thinned());
     EXPECT_EQ(logic.table().headerLayout(), HeaderLayout::WithMoney);
     EXPECT_EQ(view.text(MainControl::txtFromA), QStringLiteral("30"));
     EXPECT_EQ(view.text(MainControl::lblYC), QString()) << "the MAI has not culminated by 30";
@@ -245,8 +239,8 @@ TEST_F(RotationTest, DeletingRowsReopensTheRotationWhereItWas) {
     logic.cmdGrow_Click();
     const std::vector<QStringList> continued = cells();
 
-    HeadlessMainView freshView;
-    MainWindowLogic fresh(grow, prices, log, dir.path(), freshView, interactive);
+    SessionServices freshRun(dir.path());
+    MainWindowLogic &fresh = freshRun.logic;
     fresh.mnuModel_Click(0);
     fresh.typeText(MainControl::txtFromA, QStringLiteral("15"));
     fresh.typeText(MainControl::txtFromN, QStringLiteral("2500"));

@@ -1,0 +1,45 @@
+#include "prices/pricefiles.hpp"
+
+#include "prices/assortmentpricefile.hpp"
+#include "prices/costfile.hpp"
+#include "prices/pricedata.hpp"
+#include "prices/prices.hpp"
+#include "shell/apperror.hpp"
+#include "shell/datahistory.hpp"
+#include "shell/errorlog.hpp"
+
+#include <QDir>
+
+namespace arbolex::prices {
+
+void readPriceFiles(const QString &dataFolder, Prices &prices, shell::ErrorLog &log) {
+    GetPricesFromFiles(dataFolder, prices.data(), log);
+    GetAssortmentPricesFromFile(dataFolder, prices.data(), log);
+    GetCostsFromFile(dataFolder, prices.data(), log);
+}
+
+void rereadPriceFiles(const QString &dataFolder, Prices &prices, shell::ErrorLog &log) {
+    const std::int16_t inUse = prices.priceSetInUse();
+    prices.data() = PriceData{};
+    readPriceFiles(dataFolder, prices, log);
+    prices.selectPriceSet(inUse);
+}
+
+void writePriceFilesAtExit(const QString &dataFolder, const Prices &prices,
+                           const shell::DataHistory *history, const QString &label,
+                           shell::ErrorLog &log) {
+    if (history != nullptr) {
+        for (const char *name : kFilesWrittenAtExit) {
+            shell::guard(log, label, [&] {
+                if (!history->keep(QDir(dataFolder).filePath(QLatin1String(name)))) {
+                    shell::raiseAppFault(shell::RuntimeError::pathFileAccessError());
+                }
+            });
+        }
+    }
+    WritePricesInFiles(3, dataFolder, prices.data(), log);
+    WriteUserDefinedAssortmentsInFile(dataFolder, prices.data(), log);
+    WriteAssortmentPricesInFile(dataFolder, prices.data(), log);
+}
+
+} // namespace arbolex::prices
