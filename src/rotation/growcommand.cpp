@@ -18,6 +18,14 @@ GrowFromValues shownGrowFrom(const engine::StandState &s, float targetAge) {
 
 Growth growStand(engine::Grow &grow, float age, float basalArea, float stocking, float topHeight,
                  float targetAge, float step) {
+    std::vector<engine::StandState> states;
+    Growth g = growStand(grow, age, basalArea, stocking, topHeight, targetAge, step, states);
+    g.states = std::move(states);
+    return g;
+}
+
+Growth growStand(engine::Grow &grow, float age, float basalArea, float stocking, float topHeight,
+                 float targetAge, float step, std::vector<engine::StandState> &states) {
     Growth g;
     g.siteIndexKnown = grow.SiteIndex(age, topHeight);
     // A site index that could not be computed leaves 0 in the engine, and the
@@ -31,7 +39,7 @@ Growth growStand(engine::Grow &grow, float age, float basalArea, float stocking,
     g.stocking = stocking;
     g.topHeight = topHeight;
     g.targetAge = targetAge;
-    g.projected = grow.PROJ(age, basalArea, stocking, topHeight, targetAge, step, g.states);
+    g.projected = grow.PROJ(age, basalArea, stocking, topHeight, targetAge, step, states);
     return g;
 }
 

@@ -69,4 +69,10 @@ VolumeThinningStep thinByVolume(engine::Grow &grow, const engine::StandState &pr
 Growth growStand(engine::Grow &grow, float age, float basalArea, float stocking, float topHeight,
                  float targetAge, float step);
 
+/// The same, with the start state and the projected states appended to
+/// `states` (Growth::states stays empty): a path grown in several presses
+/// keeps one vector of states instead of one for every press.
+Growth growStand(engine::Grow &grow, float age, float basalArea, float stocking, float topHeight,
+                 float targetAge, float step, std::vector<engine::StandState> &states);
+
 } // namespace arbolex::rotation
