@@ -332,6 +332,8 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
         return std::nullopt;
     }
 
+    // The model's coefficients stay those of the stand's model along the path.
+    const float maxTopHeight = grow.maxTopHeight();
     const int growTo = finalCut ? std::min(*finalCut, path.ageLimit) : path.ageLimit;
     const std::optional<int> lastThinning = lastThinningAge(regime, growTo);
     int nextThinning = regime.thinFrom;
@@ -345,8 +347,8 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
         const int target = thinning ? nextThinning : growTo;
         if (!first) {
             // The window checks what its fields show of the thinned stand.
-            if (auto fault = growFromFault(shownGrowFrom(from, static_cast<float>(target)),
-                                           grow.maxTopHeight(), path.ageLimit)) {
+            if (auto fault = shownGrowFromFault(from, static_cast<float>(target), maxTopHeight,
+                                                path.ageLimit)) {
                 path.stop = GrowthPath::Stop{static_cast<int>(from.age), std::move(fault->text)};
                 break;
             }
