@@ -6,6 +6,7 @@
 #include <cmath>
 #include <cstdlib>
 #include <cstring>
+#include <optional>
 
 namespace arbolex::format {
 
@@ -168,6 +169,46 @@ std::size_t formatInto(double value, const Pattern &p, char *out) {
     return static_cast<std::size_t>(o - out);
 }
 
+/// Powers of ten that a double holds exactly, 10^0 to 10^15.
+constexpr std::array<double, 16> kExactPowersOfTen = {1e0, 1e1, 1e2,  1e3,  1e4,  1e5,  1e6,  1e7,
+                                                      1e8, 1e9, 1e10, 1e11, 1e12, 1e13, 1e14, 1e15};
+
+/// Largest scaled figure taken by shownByScaling: far below 2^52, where a
+/// double still holds every whole number and its fraction exactly.
+constexpr double kLargestScaled = 1e15;
+
+/// The figure of formatInto(value, p) read back, computed without its text
+/// where that gives the same double: the text is ±K / 10^d for the whole
+/// number K nearest to |value| · 10^d (d the pattern's decimals), so its
+/// value is the correctly rounded quotient K / 10^d. K is taken from the
+/// scaled double when that lies far enough from a half that neither the
+/// rounding of the scaling nor that of the 15 significant digits the text is
+/// rounded from can move it across; std::nullopt leaves it to the text.
+std::optional<double> shownByScaling(double value, const Pattern &p) {
+    if (p.maxDecimals >= static_cast<int>(kExactPowersOfTen.size())) {
+        return std::nullopt;
+    }
+    const double scale = kExactPowersOfTen[static_cast<std::size_t>(p.maxDecimals)];
+    const double scaled = std::fabs(value) * scale;
+    if (!(scaled < kLargestScaled)) {
+        return std::nullopt;
+    }
+    const double whole = std::floor(scaled);
+    const double fraction = scaled - whole;
+    // 15 significant digits are within 5e-15 of the value, relatively, and
+    // the product within 2^-53 of the exact one.
+    const double margin = scaled * 1e-14 + 1e-300;
+    if (std::fabs(fraction - 0.5) <= margin) {
+        return std::nullopt;
+    }
+    const double k = fraction > 0.5 ? whole + 1.0 : whole;
+    if (k == 0.0) {
+        return 0.0; // the text of a figure that rounds to zero has no sign
+    }
+    const double shown = k / scale;
+    return value < 0.0 ? -shown : shown;
+}
+
 /// Room formatInto needs for the pattern `p`.
 std::size_t roomFor(const Pattern &p) {
     return kDigitRoom + static_cast<std::size_t>(p.integerZeros + p.minDecimals) + 2;
@@ -190,6 +231,9 @@ double shownValue(double value, std::string_view pattern) {
         return val(generalNumber(value));
     }
     const Pattern p = parsePattern(pattern);
+    if (const std::optional<double> shown = shownByScaling(value, p)) {
+        return *shown;
+    }
     const std::size_t room = roomFor(p);
     if (room > kDigitRoom + 64) {
         return val(formatNumber(value, pattern)); // a pattern of very many zeros
