@@ -8,6 +8,7 @@
 
 #include "engine/assortment.hpp"
 #include "engine/catalogue.hpp"
+#include "engine/checkedmath.hpp"
 #include "engine/report.hpp"
 #include "engine/standstate.hpp"
 
@@ -244,6 +245,9 @@ private:
     void assortmentFailure(std::string_view text, std::string_view mark);
 
     IEngineReport *m_report = nullptr;
+    /// The thinning response's last powers (a pure function of their
+    /// arguments, so kept whatever the model).
+    mutable checked::PowerMemo m_powers;
 
     std::int16_t m_modelId = 0;
     std::string m_label;
