@@ -6,7 +6,11 @@
 // RuntimeFault, which never leaves the engine: every public procedure of Grow
 // catches it and reports it once.
 
+#include <array>
+#include <bit>
 #include <cmath>
+#include <cstddef>
+#include <cstdint>
 #include <string_view>
 
 namespace arbolex::engine {
@@ -86,6 +90,46 @@ inline float single(double x, unsigned line = __builtin_LINE()) {
     }
     return f;
 }
+
+/// checked::pow with the last few powers kept: a solver that asks again for
+/// the power of the same base and exponent (the fixed terms of the thinning
+/// response at every Newton step, and the residual stocking its derivative
+/// computes again) gets the very same double without computing it. Only a
+/// power that succeeded is kept, so one that fails fails again, on its own
+/// line.
+class PowerMemo {
+public:
+    double operator()(double base, double exponent, unsigned line = __builtin_LINE()) {
+        const auto b = std::bit_cast<std::uint64_t>(base);
+        const auto x = std::bit_cast<std::uint64_t>(exponent);
+        std::size_t oldest = 0;
+        for (std::size_t i = 0; i < kSlots; ++i) {
+            if (m_used[i] != 0 && m_base[i] == b && m_exponent[i] == x) {
+                m_used[i] = ++m_clock;
+                return m_value[i];
+            }
+            if (m_used[i] < m_used[oldest]) {
+                oldest = i;
+            }
+        }
+        const double value = pow(base, exponent, line);
+        m_base[oldest] = b;
+        m_exponent[oldest] = x;
+        m_value[oldest] = value;
+        m_used[oldest] = ++m_clock;
+        return value;
+    }
+
+private:
+    /// Enough for the powers of one Newton step and the fixed ones.
+    static constexpr std::size_t kSlots = 8;
+    std::array<std::uint64_t, kSlots> m_base{};
+    std::array<std::uint64_t, kSlots> m_exponent{};
+    std::array<double, kSlots> m_value{};
+    /// When each slot was last used; 0 for an empty slot.
+    std::array<std::uint64_t, kSlots> m_used{};
+    std::uint64_t m_clock = 0;
+};
 
 } // namespace checked
 } // namespace arbolex::engine

@@ -8,6 +8,7 @@
 
 #include "engine/assortment.hpp"
 #include "engine/catalogue.hpp"
+#include "engine/checkedmath.hpp"
 #include "engine/report.hpp"
 #include "engine/standstate.hpp"
 
@@ -217,8 +218,13 @@ private:
         double f1, f2, f3;
     };
 
+    /// The rate, the transition and the step factors, each kept for the
+    /// arguments it was last computed from (projection.cpp).
     float rateOf(float siteIndex) const;
     StepFactors projectionFactors(double years, float rho) const;
+    float computeRate(float siteIndex) const;
+    void makeTransition(float SI);
+    StepFactors computeFactors(double years, float rho) const;
     State3 forward(float G, float N, float H) const;
     bool invertible(const State3 &z) const;
     void applyStep(const State3 &z, double f1, double f2, double f3, State3 &out) const;
@@ -244,6 +250,33 @@ private:
     void assortmentFailure(std::string_view text, std::string_view mark);
 
     IEngineReport *m_report = nullptr;
+    /// Changed by every GetModel: what was kept for one model's coefficients
+    /// is never used for another's.
+    unsigned m_modelGeneration = 0;
+    struct KeptRate {
+        bool known = false;
+        unsigned generation = 0;
+        std::uint32_t siteIndex = 0;
+        float rho = 0.0f;
+    };
+    mutable KeptRate m_keptRate;
+    struct KeptTransition {
+        bool known = false;
+        unsigned generation = 0;
+        std::uint32_t siteIndex = 0;
+    };
+    KeptTransition m_keptTransition;
+    struct KeptFactors {
+        bool known = false;
+        unsigned generation = 0;
+        std::uint64_t years = 0;
+        std::uint32_t rho = 0;
+        StepFactors factors{};
+    };
+    mutable KeptFactors m_keptFactors;
+    /// The thinning response's last powers (a pure function of their
+    /// arguments, so kept whatever the model).
+    mutable checked::PowerMemo m_powers;
 
     std::int16_t m_modelId = 0;
     std::string m_label;

@@ -23,6 +23,7 @@ bool Grow::GetModel(std::int16_t modelId, std::int16_t part) {
     const CatalogueEntry &entry = catalogue()[static_cast<std::size_t>(modelId)];
     m_label = entry.label;
     m_modelId = modelId;
+    ++m_modelGeneration;
     // Every coefficient of a loaded set is written, zeros included, so nothing
     // of the previous model survives in it.
     if (part == kPartAll || part == kPartStateModel) {

@@ -53,7 +53,7 @@ bool Grow::SiteIndex(float A, float H) {
     return m_siteIndex > 0.0f;
 }
 
-float Grow::rateOf(float siteIndex) const {
+float Grow::computeRate(float siteIndex) const {
     const double b = S(1);
     const double K = S(6);
     const double t0 = S(7);
@@ -70,7 +70,7 @@ float Grow::rate(float siteIndex) const {
     }
 }
 
-void Grow::TM(float SI) {
+void Grow::makeTransition(float SI) {
     clearUpperVectorState();
     try {
         const double rho = rateOf(SI);
@@ -125,7 +125,7 @@ void Grow::applyStep(const State3 &z, double f1, double f2, double f3, State3 &o
     out.z3 = w3;
 }
 
-Grow::StepFactors Grow::projectionFactors(double years, float rho) const {
+Grow::StepFactors Grow::computeFactors(double years, float rho) const {
     const double e = checked::exp(years * rho);
     return {checked::pow(e, S(2)), checked::pow(e, S(3)), checked::pow(e, -1.0)};
 }
@@ -243,6 +243,53 @@ bool Grow::PROJ(float A, float G, float N, float H, float targetAge, float step,
         reportFault(fault, {}, {}, " in Grow.PROJ()");
         return false;
     }
+}
+
+// What the projection keeps of its last rate, transition and step factors.
+// Each is a function of the model's coefficients and its arguments alone, so
+// asking again with the same arguments for the same model gives the very
+// same numbers: a path grown press after press asks for the rate of one site
+// index in TM and again in PROJ, and often for the same site index after a
+// thinning as before it. Only what was computed without a failure is kept.
+// (Defined here, after the procedures, so that the lines the error log names
+// in them stay where they were.)
+
+float Grow::rateOf(float siteIndex) const {
+    const auto key = std::bit_cast<std::uint32_t>(siteIndex);
+    if (m_keptRate.known && m_keptRate.generation == m_modelGeneration &&
+        m_keptRate.siteIndex == key) {
+        return m_keptRate.rho;
+    }
+    const float rho = computeRate(siteIndex);
+    m_keptRate = {true, m_modelGeneration, key, rho};
+    return rho;
+}
+
+void Grow::TM(float SI) {
+    clearUpperVectorState();
+    const auto key = std::bit_cast<std::uint32_t>(SI);
+    if (m_keptTransition.known && m_keptTransition.generation == m_modelGeneration &&
+        m_keptTransition.siteIndex == key) {
+        return; // M1, M2 and S8 are those of this site index already
+    }
+    m_keptTransition.known = false;
+    const unsigned faultsBefore = m_faultCount;
+    makeTransition(SI);
+    if (m_faultCount == faultsBefore) {
+        m_keptTransition = {true, m_modelGeneration, key};
+    }
+}
+
+Grow::StepFactors Grow::projectionFactors(double years, float rho) const {
+    const auto yearsKey = std::bit_cast<std::uint64_t>(years);
+    const auto rhoKey = std::bit_cast<std::uint32_t>(rho);
+    if (m_keptFactors.known && m_keptFactors.generation == m_modelGeneration &&
+        m_keptFactors.years == yearsKey && m_keptFactors.rho == rhoKey) {
+        return m_keptFactors.factors;
+    }
+    const StepFactors factors = computeFactors(years, rho);
+    m_keptFactors = {true, m_modelGeneration, yearsKey, rhoKey, factors};
+    return factors;
 }
 
 } // namespace arbolex::engine

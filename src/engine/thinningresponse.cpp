@@ -23,7 +23,7 @@ constexpr std::string_view kNewtonLead =
 
 float Grow::nres(float H, float N, float G, float Gr) const {
     using checked::div;
-    using checked::pow;
+    checked::PowerMemo &pow = m_powers;
     const double a = m_t[0];
     const double c = m_t[1];
     const double d = m_t[2];
@@ -45,7 +45,7 @@ double Grow::bres(float H, float N, float G, float Nr) const {
 
 double Grow::parn2b2(float H, float N, float G, float Gr) const {
     using checked::div;
-    using checked::pow;
+    checked::PowerMemo &pow = m_powers;
     const double a = m_t[0];
     const double c = m_t[1];
     const double d = m_t[2];

@@ -11,8 +11,14 @@ namespace {
 constexpr std::size_t kBufferBytes = 1 << 16;
 
 bool needsQuotes(std::string_view value) {
-    return value.find_first_of(",\"\r\n") != std::string_view::npos ||
-           (!value.empty() && (value.front() == ' ' || value.back() == ' '));
+    // One pass over the value: find_first_of would look each byte up in the
+    // set with a call of its own.
+    for (const char c : value) {
+        if (c == ',' || c == '"' || c == '\r' || c == '\n') {
+            return true;
+        }
+    }
+    return !value.empty() && (value.front() == ' ' || value.back() == ' ');
 }
 
 } // namespace
@@ -33,7 +39,12 @@ void appendCsvField(std::string &line, std::string_view value) {
 }
 
 std::string csvLine(const std::vector<std::string> &fields) {
+    std::size_t length = fields.size() + 1;
+    for (const std::string &field : fields) {
+        length += field.size();
+    }
     std::string line;
+    line.reserve(length + 8); // room for a quoted field or two without a new block
     for (std::size_t i = 0; i < fields.size(); ++i) {
         if (i > 0) {
             line.push_back(',');

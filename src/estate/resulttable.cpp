@@ -2,7 +2,10 @@
 
 #include "valuation/discounting.hpp"
 
+#include <array>
 #include <charconv>
+#include <cmath>
+#include <cstdint>
 
 namespace arbolex::estate {
 
@@ -25,8 +28,48 @@ std::string quantity(double x) {
     return written(x, std::chars_format::general, 9);
 }
 
-/// A volume or an amount to a given number of decimals ("%.3f").
+/// Powers of ten to the decimals the tables print figures with.
+constexpr std::array<double, 4> kPowersOfTen = {1.0, 10.0, 100.0, 1000.0};
+
+/// A volume or an amount to a given number of decimals ("%.3f"): the exact
+/// value rounded to the nearest, ties to even. Where the value scaled by
+/// 10^decimals lies clearly away from a half, the whole number nearest the
+/// exact product is that nearest the scaled double (within 2^-53 of it), and
+/// its digits are written out with the point put in; near a half, to_chars
+/// rounds the exact value.
 std::string fixed(double x, int decimals) {
+    if (decimals >= 0 && decimals < static_cast<int>(kPowersOfTen.size())) {
+        const double scaled = std::fabs(x) * kPowersOfTen[static_cast<std::size_t>(decimals)];
+        const double whole = std::floor(scaled);
+        const double fraction = scaled - whole;
+        if (scaled < 1e15 && std::fabs(fraction - 0.5) > scaled * 0x1p-51 + 1e-300) {
+            const auto nearest = static_cast<std::uint64_t>(fraction > 0.5 ? whole + 1.0 : whole);
+            std::array<char, 24> digits{};
+            const char *end =
+                std::to_chars(digits.data(), digits.data() + digits.size(), nearest).ptr;
+            const auto count = static_cast<std::size_t>(end - digits.data());
+            const auto places = static_cast<std::size_t>(decimals);
+            std::string out;
+            if (std::signbit(x)) {
+                out.push_back('-'); // as printf: "-0.000" for a negative value that rounds to 0
+            }
+            if (count <= places) {
+                out.push_back('0');
+                if (places > 0) {
+                    out.push_back('.');
+                    out.append(places - count, '0');
+                }
+                out.append(digits.data(), count);
+            } else {
+                out.append(digits.data(), count - places);
+                if (places > 0) {
+                    out.push_back('.');
+                    out.append(digits.data() + count - places, places);
+                }
+            }
+            return out;
+        }
+    }
     return written(x, std::chars_format::fixed, decimals);
 }
 

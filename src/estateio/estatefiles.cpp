@@ -34,7 +34,8 @@ public:
     }
 
     void prepare(const estate::EstateRow &row, estate::RowResult &result) const override {
-        std::vector<std::string> values;
+        // One vector of values per thread, its room kept from row to row.
+        thread_local std::vector<std::string> values;
         estate::resultValues(m_layout, row.line, row.values, result, values);
         result.prepared = m_results.line(values);
     }

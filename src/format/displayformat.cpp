@@ -5,6 +5,8 @@
 #include <charconv>
 #include <cmath>
 #include <cstdlib>
+#include <cstring>
+#include <optional>
 
 namespace arbolex::format {
 
@@ -39,21 +41,6 @@ Pattern parsePattern(std::string_view pattern) {
     return p;
 }
 
-/// Adds one unit in the last digit of a string of decimal digits; returns
-/// false when the carry runs out of the left end.
-bool incrementDigits(std::string &digits) {
-    // Reverse iterators rather than std::views::reverse, which clang 14 cannot
-    // compile with the standard library of gcc 12 (the fuzzing build).
-    for (auto digit = digits.rbegin(); digit != digits.rend(); ++digit) {
-        if (*digit != '9') {
-            ++*digit;
-            return true;
-        }
-        *digit = '0';
-    }
-    return false;
-}
-
 bool isDigit(char c) {
     return c >= '0' && c <= '9';
 }
@@ -78,76 +65,181 @@ std::string_view trimmed(std::string_view text) {
 
 } // namespace
 
-std::string formatNumber(double value, std::string_view pattern) {
-    if (!std::isfinite(value)) {
-        return generalNumber(value);
-    }
-    const Pattern p = parsePattern(pattern);
+namespace {
 
+/// Room for the digits of any finite double under any pattern: 309 integer
+/// digits, or 323 zeros and 15 digits after the point, and a carry.
+constexpr std::size_t kDigitRoom = 360;
+
+/// `value` (finite) formatted with `p` into `out`, which holds at least
+/// kDigitRoom + the pattern's mandatory digits + 2 characters; returns the
+/// length. The text of formatNumber, built in place: a number shown in the
+/// table or read back from it makes no string on the way.
+std::size_t formatInto(double value, const Pattern &p, char *out) {
     // The magnitude as 15 significant digits "d.dddddddddddddde±XX".
-    std::array<char, 40> buffer{};
-    const auto result =
-        std::to_chars(buffer.data(), buffer.data() + buffer.size(), std::fabs(value),
-                      std::chars_format::scientific, kSignificantDigits - 1);
-    const std::string text(buffer.data(), result.ptr);
-    const std::size_t e = text.find('e');
-    const std::string mantissa = text.substr(0, 1) + text.substr(2, e - 2);
-    const int pointAt = std::atoi(text.c_str() + e + 1) + 1; // digits before the point
+    std::array<char, 40> text{};
+    const auto result = std::to_chars(text.data(), text.data() + text.size(), std::fabs(value),
+                                      std::chars_format::scientific, kSignificantDigits - 1);
+    const char *const begin = text.data();
+    const char *e = std::find(begin, static_cast<const char *>(result.ptr), 'e');
+    int exponent = 0;
+    std::from_chars(e + (e[1] == '+' ? 2 : 1), result.ptr, exponent);
+    const int pointAt = exponent + 1; // digits before the point
+    char mantissa[kSignificantDigits];
+    mantissa[0] = text[0];
+    std::copy(begin + 2, e, mantissa + 1);
 
-    std::string integerDigits;
-    std::string decimals;
+    // The integer digits, then the decimals, in one run of digits.
+    std::array<char, kDigitRoom> digits{};
+    std::size_t integerCount = 0;
+    std::size_t decimalCount = 0;
     if (value == 0.0) {
         // nothing: both parts stay empty
     } else if (pointAt <= 0) {
-        decimals = std::string(static_cast<std::size_t>(-pointAt), '0') + mantissa;
+        const auto zeros = static_cast<std::size_t>(-pointAt);
+        std::fill_n(digits.data(), zeros, '0');
+        std::copy_n(mantissa, kSignificantDigits, digits.data() + zeros);
+        decimalCount = zeros + kSignificantDigits;
     } else if (pointAt >= kSignificantDigits) {
-        integerDigits =
-            mantissa + std::string(static_cast<std::size_t>(pointAt) - mantissa.size(), '0');
+        integerCount = static_cast<std::size_t>(pointAt);
+        std::copy_n(mantissa, kSignificantDigits, digits.data());
+        std::fill(digits.data() + kSignificantDigits, digits.data() + integerCount, '0');
     } else {
-        integerDigits = mantissa.substr(0, static_cast<std::size_t>(pointAt));
-        decimals = mantissa.substr(static_cast<std::size_t>(pointAt));
+        integerCount = static_cast<std::size_t>(pointAt);
+        decimalCount = kSignificantDigits - integerCount;
+        std::copy_n(mantissa, kSignificantDigits, digits.data());
     }
 
     // Round half away from zero to the pattern's decimals.
     const auto maxDecimals = static_cast<std::size_t>(p.maxDecimals);
-    if (decimals.size() > maxDecimals) {
-        const bool up = decimals[maxDecimals] >= '5';
-        decimals.resize(maxDecimals);
+    char *first = digits.data() + 1; // room for a carry out of the left end
+    std::memmove(first, digits.data(), integerCount + decimalCount);
+    if (decimalCount > maxDecimals) {
+        const bool up = first[integerCount + maxDecimals] >= '5';
+        decimalCount = maxDecimals;
         if (up) {
-            std::string all = integerDigits + decimals;
-            if (!incrementDigits(all)) {
-                all.insert(all.begin(), '1');
+            char *digit = first + integerCount + decimalCount;
+            bool carry = true;
+            while (carry && digit != first) {
+                --digit;
+                if (*digit != '9') {
+                    ++*digit;
+                    carry = false;
+                } else {
+                    *digit = '0';
+                }
             }
-            integerDigits = all.substr(0, all.size() - decimals.size());
-            decimals = all.substr(all.size() - decimals.size());
+            if (carry) {
+                *--first = '1';
+                ++integerCount;
+            }
         }
     }
 
     // Optional decimals lose their trailing zeros; mandatory ones are padded.
     const auto minDecimals = static_cast<std::size_t>(p.minDecimals);
-    while (decimals.size() > minDecimals && decimals.back() == '0') {
-        decimals.pop_back();
+    const char *decimals = first + integerCount;
+    while (decimalCount > minDecimals && decimals[decimalCount - 1] == '0') {
+        --decimalCount;
     }
-    decimals.resize(std::max(decimals.size(), minDecimals), '0');
+    const std::size_t decimalZeros = decimalCount < minDecimals ? minDecimals - decimalCount : 0;
 
-    const std::size_t firstNonZero = integerDigits.find_first_not_of('0');
-    integerDigits.erase(0, firstNonZero == std::string::npos ? integerDigits.size() : firstNonZero);
+    const char *integer = first;
+    while (integerCount > 0 && *integer == '0') {
+        ++integer;
+        --integerCount;
+    }
     const auto integerZeros = static_cast<std::size_t>(p.integerZeros);
-    if (integerDigits.size() < integerZeros) {
-        integerDigits.insert(0, integerZeros - integerDigits.size(), '0');
-    }
+    const std::size_t leadingZeros = integerCount < integerZeros ? integerZeros - integerCount : 0;
 
-    const bool isZero = (integerDigits + decimals).find_first_not_of('0') == std::string::npos;
-    std::string out;
+    const bool isZero =
+        std::all_of(integer, integer + integerCount, [](char c) { return c == '0'; }) &&
+        std::all_of(decimals, decimals + decimalCount, [](char c) { return c == '0'; });
+    char *o = out;
     if (value < 0 && !isZero) {
-        out += '-';
+        *o++ = '-';
     }
-    out += integerDigits;
+    o = std::fill_n(o, leadingZeros, '0');
+    o = std::copy_n(integer, integerCount, o);
     if (p.hasPoint) {
-        out += '.';
-        out += decimals;
+        *o++ = '.';
+        o = std::copy_n(decimals, decimalCount, o);
+        o = std::fill_n(o, decimalZeros, '0');
     }
+    return static_cast<std::size_t>(o - out);
+}
+
+/// Powers of ten that a double holds exactly, 10^0 to 10^15.
+constexpr std::array<double, 16> kExactPowersOfTen = {1e0, 1e1, 1e2,  1e3,  1e4,  1e5,  1e6,  1e7,
+                                                      1e8, 1e9, 1e10, 1e11, 1e12, 1e13, 1e14, 1e15};
+
+/// Largest scaled figure taken by shownByScaling: far below 2^52, where a
+/// double still holds every whole number and its fraction exactly.
+constexpr double kLargestScaled = 1e15;
+
+/// The figure of formatInto(value, p) read back, computed without its text
+/// where that gives the same double: the text is ±K / 10^d for the whole
+/// number K nearest to |value| · 10^d (d the pattern's decimals), so its
+/// value is the correctly rounded quotient K / 10^d. K is taken from the
+/// scaled double when that lies far enough from a half that neither the
+/// rounding of the scaling nor that of the 15 significant digits the text is
+/// rounded from can move it across; std::nullopt leaves it to the text.
+std::optional<double> shownByScaling(double value, const Pattern &p) {
+    if (p.maxDecimals >= static_cast<int>(kExactPowersOfTen.size())) {
+        return std::nullopt;
+    }
+    const double scale = kExactPowersOfTen[static_cast<std::size_t>(p.maxDecimals)];
+    const double scaled = std::fabs(value) * scale;
+    if (!(scaled < kLargestScaled)) {
+        return std::nullopt;
+    }
+    const double whole = std::floor(scaled);
+    const double fraction = scaled - whole;
+    // 15 significant digits are within 5e-15 of the value, relatively, and
+    // the product within 2^-53 of the exact one.
+    const double margin = scaled * 1e-14 + 1e-300;
+    if (std::fabs(fraction - 0.5) <= margin) {
+        return std::nullopt;
+    }
+    const double k = fraction > 0.5 ? whole + 1.0 : whole;
+    if (k == 0.0) {
+        return 0.0; // the text of a figure that rounds to zero has no sign
+    }
+    const double shown = k / scale;
+    return value < 0.0 ? -shown : shown;
+}
+
+/// Room formatInto needs for the pattern `p`.
+std::size_t roomFor(const Pattern &p) {
+    return kDigitRoom + static_cast<std::size_t>(p.integerZeros + p.minDecimals) + 2;
+}
+
+} // namespace
+
+std::string formatNumber(double value, std::string_view pattern) {
+    if (!std::isfinite(value)) {
+        return generalNumber(value);
+    }
+    const Pattern p = parsePattern(pattern);
+    std::string out(roomFor(p), '\0');
+    out.resize(formatInto(value, p, out.data()));
     return out;
+}
+
+double shownValue(double value, std::string_view pattern) {
+    if (!std::isfinite(value)) {
+        return val(generalNumber(value));
+    }
+    const Pattern p = parsePattern(pattern);
+    if (const std::optional<double> shown = shownByScaling(value, p)) {
+        return *shown;
+    }
+    const std::size_t room = roomFor(p);
+    if (room > kDigitRoom + 64) {
+        return val(formatNumber(value, pattern)); // a pattern of very many zeros
+    }
+    std::array<char, kDigitRoom + 64> text;
+    return val(std::string_view(text.data(), formatInto(value, p, text.data())));
 }
 
 std::string generalNumber(double value) {

@@ -45,8 +45,7 @@ double val(std::string_view text);
 
 /// The figure a shown text holds: `value` formatted with `pattern`, then read
 /// back. Where a figure is read back from what the table shows, this says so.
-inline double shownValue(double value, std::string_view pattern) {
-    return val(formatNumber(value, pattern));
-}
+/// The same as val(formatNumber(value, pattern)), without making the text a string.
+double shownValue(double value, std::string_view pattern);
 
 } // namespace arbolex::format

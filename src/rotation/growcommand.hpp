@@ -31,6 +31,14 @@ inline constexpr std::string_view kBasalAreaCell = "##0.0";
 /// The grow command checks these; it grows from the row's exact state.
 GrowFromValues shownGrowFrom(const engine::StandState &s, float targetAge);
 
+/// growFromFault(shownGrowFrom(s, targetAge), maxTopHeight, maxTargetAge), the
+/// same fault or none, with a cell formatted and read back only where its
+/// rounding could decide a check: a figure well inside or well outside its
+/// range shows a figure on the same side of each bound. A path grown past
+/// several thinnings checks every thinned stand this way.
+std::optional<GrowFromFault> shownGrowFromFault(const engine::StandState &s, float targetAge,
+                                                float maxTopHeight, int maxTargetAge);
+
 /// What one press of the grow command computed.
 struct Growth {
     /// Site index of the grow-from age and top height, m (0 when it could not
@@ -68,5 +76,11 @@ VolumeThinningStep thinByVolume(engine::Grow &grow, const engine::StandState &pr
 /// as the grow command does.
 Growth growStand(engine::Grow &grow, float age, float basalArea, float stocking, float topHeight,
                  float targetAge, float step);
+
+/// The same, with the start state and the projected states appended to
+/// `states` (Growth::states stays empty): a path grown in several presses
+/// keeps one vector of states instead of one for every press.
+Growth growStand(engine::Grow &grow, float age, float basalArea, float stocking, float topHeight,
+                 float targetAge, float step, std::vector<engine::StandState> &states);
 
 } // namespace arbolex::rotation

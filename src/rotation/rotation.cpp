@@ -11,6 +11,7 @@
 #include <algorithm>
 #include <cmath>
 #include <limits>
+#include <span>
 
 namespace arbolex::rotation {
 
@@ -51,6 +52,22 @@ double removedBefore(const GrowthPath &path, int age) {
 
 double meanAnnualIncrement(const GrowthPath &path, int age) {
     return age > 0 ? (double{path.at(age).volume} + removedBefore(path, age)) / age : 0.0;
+}
+
+/// meanAnnualIncrement of every age from `from` to `to`, appended to `mai`:
+/// the thinnings' volumes summed once, oldest first, as removedBefore sums
+/// them for each age.
+void meanAnnualIncrements(const GrowthPath &path, int from, int to, std::vector<double> &mai) {
+    mai.reserve(mai.size() + static_cast<std::size_t>(std::max(0, to - from + 1)));
+    double removed = 0.0;
+    auto next = path.thinnings.begin();
+    for (int a = from; a <= to; ++a) {
+        while (next != path.thinnings.end() && next->age < a) {
+            removed += double{next->volume};
+            ++next;
+        }
+        mai.push_back(a > 0 ? (double{path.at(a).volume} + removed) / a : 0.0);
+    }
 }
 
 /// Cash flow by age 0..rotation: timber revenue, other revenues, costs and
@@ -113,8 +130,9 @@ struct Figures {
 
 Figures figures(const std::vector<double> &net, int presentAge, double ratePercent) {
     Figures out;
-    const std::vector<double> fromPresent(net.begin() + presentAge, net.end());
-    out.npv = valuation::netPresentValue(fromPresent, ratePercent);
+    const std::span<const double> fromPresent =
+        std::span<const double>(net).subspan(static_cast<std::size_t>(presentAge));
+    out.npv = valuation::netPresentValueOf(fromPresent, ratePercent);
     out.lev = valuation::landExpectationValue(net, ratePercent);
     if (out.lev) {
         // The forest value adds the LEV to the same net present value.
@@ -348,9 +366,12 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
         return std::nullopt;
     }
 
+    // The model's coefficients stay those of the stand's model along the path.
+    const float maxTopHeight = grow.maxTopHeight();
     const int growTo = finalCut ? std::min(*finalCut, path.ageLimit) : path.ageLimit;
     const std::optional<int> lastThinning = lastThinningAge(regime, growTo);
     int nextThinning = regime.thinFrom;
+    path.years.reserve(static_cast<std::size_t>(std::max(0, growTo - presentAge)) + 2);
     // Each press of Grow: from its stand (the typed one, then each thinned
     // one, exact as the table keeps it) to the next thinning or the end.
     engine::StandState from{stand.age, stand.basalArea, stand.stocking, stand.height, 0.0f};
@@ -360,25 +381,29 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
         const int target = thinning ? nextThinning : growTo;
         if (!first) {
             // The window checks what its fields show of the thinned stand.
-            if (auto fault = growFromFault(shownGrowFrom(from, static_cast<float>(target)),
-                                           grow.maxTopHeight(), path.ageLimit)) {
+            if (auto fault = shownGrowFromFault(from, static_cast<float>(target), maxTopHeight,
+                                                path.ageLimit)) {
                 path.stop = GrowthPath::Stop{static_cast<int>(from.age), std::move(fault->text)};
                 break;
             }
         }
-        Growth growth = growStand(grow, from.age, from.basalArea, from.stocking, from.topHeight,
-                                  static_cast<float>(target), 1.0f);
+        // The states go straight onto the path; the first is where the
+        // projection started from, which after a thinning the path holds as
+        // the state before it.
+        const std::size_t start = path.years.size();
+        const Growth growth =
+            growStand(grow, from.age, from.basalArea, from.stocking, from.topHeight,
+                      static_cast<float>(target), 1.0f, path.years);
         if (!growth.projected || grow.faultCount() != faultsBefore) {
             return engineFailed(standtext::kProjectionFailed);
         }
         if (first) {
             path.presentAge = static_cast<int>(growth.age);
             path.siteIndex = growth.siteIndex;
-            path.years.push_back(growth.states.front());
             first = false;
+        } else {
+            path.years.erase(path.years.begin() + static_cast<std::ptrdiff_t>(start));
         }
-        // The first state is where the projection started from.
-        path.years.insert(path.years.end(), growth.states.begin() + 1, growth.states.end());
         if (!thinning) {
             break;
         }
@@ -416,10 +441,7 @@ std::optional<GrowthPath> growPath(engine::Grow &grow, const Stand &stand, const
 
 int pathYieldClass(const GrowthPath &path) {
     std::vector<double> mai;
-    mai.reserve(path.years.size());
-    for (int a = path.presentAge; a <= path.lastAge(); ++a) {
-        mai.push_back(meanAnnualIncrement(path, a));
-    }
+    meanAnnualIncrements(path, path.presentAge, path.lastAge(), mai);
     return yieldClass(mai);
 }
 
@@ -519,9 +541,7 @@ RotationValue valueRotation(const GrowthPath &path, int rotation, const Economic
                             Appraisal appraisal) {
     RotationValue v = valueHarvests(rotationHarvests(path, rotation), economics, appraisal);
     std::vector<double> mai;
-    for (int a = path.presentAge; a <= rotation; ++a) {
-        mai.push_back(meanAnnualIncrement(path, a));
-    }
+    meanAnnualIncrements(path, path.presentAge, rotation, mai);
     v.maxMai = mai.empty() ? 0.0 : *std::max_element(mai.begin(), mai.end());
     v.yieldClass = yieldClass(mai);
     return v;

@@ -91,6 +91,10 @@ std::optional<double> discountedCashFlow(double cashFlow, double ratePercent, in
 }
 
 std::optional<double> netPresentValue(const std::vector<double> &cashFlows, double ratePercent) {
+    return netPresentValueOf(cashFlows, ratePercent);
+}
+
+std::optional<double> netPresentValueOf(std::span<const double> cashFlows, double ratePercent) {
     engine::clearUpperVectorState();
     // The factors by repeated multiplication, q^i = q^(i−1) · q, which
     // differ from std::pow's by at most (i + 1) units in the last place;

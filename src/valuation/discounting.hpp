@@ -5,6 +5,7 @@
 // windows compute the same numbers.
 
 #include <optional>
+#include <span>
 #include <vector>
 
 namespace arbolex::valuation {
@@ -25,5 +26,8 @@ std::optional<double> discountedCashFlow(double cashFlow, double ratePercent, in
 /// present: the sum of the discounted cash flows, each rounded to cents first.
 /// std::nullopt when a discount factor overflows.
 std::optional<double> netPresentValue(const std::vector<double> &cashFlows, double ratePercent);
+
+/// The same over a part of a longer cash flow (from the present age on), without copying it.
+std::optional<double> netPresentValueOf(std::span<const double> cashFlows, double ratePercent);
 
 } // namespace arbolex::valuation

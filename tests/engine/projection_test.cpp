@@ -277,3 +277,45 @@ TEST_F(ProjectionTest, FailedInversionKeepsTheStatesSoFar) {
 
 } // namespace
 } // namespace arbolex::engine::testing
+
+namespace arbolex::engine::testing {
+namespace {
+
+// One engine keeps its last rate, transition and step factors; whatever it
+// was asked before, it must project as an engine that was never asked
+// anything: a new model (or the same one chosen again, which clears S8) and a
+// new site index compute them again.
+TEST(KeptTransitionTest, ProjectsAsAFreshEngineWhateverCameBefore) {
+    Grow kept;
+    const struct {
+        int model;
+        float siteIndex;
+    } sequence[] = {{0, 16.0f}, {4, 16.0f}, {4, 16.0f}, {0, 16.0f}, {0, 18.5f},
+                    {7, 18.5f}, {7, 14.0f}, {0, 14.0f}, {0, 14.0f}};
+    for (const auto &s : sequence) {
+        Grow fresh;
+        for (Grow *g : {&kept, &fresh}) {
+            ASSERT_TRUE(g->GetModel(static_cast<std::int16_t>(s.model)));
+            g->setSiteIndex(s.siteIndex);
+            g->TM(s.siteIndex);
+        }
+        EXPECT_EQ(kept.M1(), fresh.M1()) << s.model << " " << s.siteIndex;
+        EXPECT_EQ(kept.M2(), fresh.M2()) << s.model << " " << s.siteIndex;
+        EXPECT_EQ(kept.S(8), fresh.S(8)) << s.model << " " << s.siteIndex;
+        EXPECT_EQ(kept.rate(s.siteIndex), fresh.rate(s.siteIndex));
+        std::vector<StandState> a;
+        std::vector<StandState> b;
+        ASSERT_TRUE(kept.PROJ(15.0f, 20.0f, 2500.0f, 7.0f, 40.0f, 1.0f, a));
+        ASSERT_TRUE(fresh.PROJ(15.0f, 20.0f, 2500.0f, 7.0f, 40.0f, 1.0f, b));
+        ASSERT_EQ(a.size(), b.size());
+        for (std::size_t i = 0; i < a.size(); ++i) {
+            EXPECT_EQ(a[i].basalArea, b[i].basalArea) << i;
+            EXPECT_EQ(a[i].stocking, b[i].stocking) << i;
+            EXPECT_EQ(a[i].topHeight, b[i].topHeight) << i;
+            EXPECT_EQ(a[i].volume, b[i].volume) << i;
+        }
+    }
+}
+
+} // namespace
+} // namespace arbolex::engine::testing

@@ -3,6 +3,8 @@
 #include "recordingreport.hpp"
 
 #include <cmath>
+#include <utility>
+#include <vector>
 
 namespace arbolex::engine::testing {
 namespace {
@@ -114,6 +116,45 @@ TEST_F(ThinningFailureTest, NonPositiveVolumeFailsInAPowerAndIsReportedOnce) {
         EXPECT_TRUE(report.logLines[0].ends_with(" in Grow.NRES"));
         report.clear();
     }
+}
+
+} // namespace
+} // namespace arbolex::engine::testing
+
+namespace arbolex::engine::testing {
+namespace {
+
+// The thinning response keeps its last powers: a kept power must be the
+// power to the bit, an empty slot must match nothing, and a power that fails
+// must fail every time, on the line that asked for it.
+TEST(PowerMemoTest, KeepsOnlyPowersThatSucceeded) {
+    checked::PowerMemo pow;
+    EXPECT_EQ(pow(0.0, 0.0), 1.0); // not the zeros of an empty slot
+    std::vector<std::pair<double, double>> arguments;
+    for (int i = 1; i <= 12; ++i) {
+        arguments.emplace_back(1.0 + i / 7.0, -0.4 - i / 11.0);
+    }
+    for (int pass = 0; pass < 3; ++pass) {
+        for (const auto &[base, exponent] : arguments) {
+            EXPECT_EQ(pow(base, exponent), std::pow(base, exponent)) << base << "^" << exponent;
+            EXPECT_EQ(pow(base, exponent), std::pow(base, exponent)) << base << "^" << exponent;
+        }
+    }
+    for (int attempt = 0; attempt < 2; ++attempt) {
+        unsigned line = 0;
+        try {
+            line = __LINE__ + 1;
+            pow(-2.0, 0.5);
+            ADD_FAILURE() << "a negative base with a fractional exponent";
+        } catch (const RuntimeFault &fault) {
+            EXPECT_EQ(fault.number, kInvalidCall);
+            EXPECT_EQ(fault.line, line);
+        }
+    }
+    EXPECT_THROW(pow(0.0, -1.0), RuntimeFault);
+    EXPECT_EQ(pow(-0.0, 3.0), std::pow(-0.0, 3.0));
+    EXPECT_TRUE(std::signbit(pow(-0.0, 3.0)));
+    EXPECT_FALSE(std::signbit(pow(0.0, 3.0)));
 }
 
 } // namespace

@@ -46,5 +46,33 @@ INSTANTIATE_TEST_SUITE_P(HardDigits, ResultFigureTest,
                                            1e-7, 123456789.0, 1.23456789e-5, 3.4e38, 1e21,
                                            0.1 + 0.2, 22.9799121, 1148.99561));
 
+// A volume is written from its scaled value except near a half of its last
+// decimal, where only the exact value decides: the halves, the doubles either
+// side of them and negative figures that round to zero.
+TEST(ResultFigureTest, VolumesNearAHalfAreWrittenAsPrintfWritesThem) {
+    std::vector<double> volumes = {0.0625,
+                                   0.1875,
+                                   2.3125,
+                                   -0.0625,
+                                   -0.0001,
+                                   -0.0004999,
+                                   0.00049999999999999,
+                                   999999999.9995,
+                                   4503599627.3704995};
+    for (int k = 0; k < 3000; k += 7) {
+        const double half = (k + 0.5) / 1000.0;
+        volumes.insert(volumes.end(), {half, std::nextafter(half, 0.0), std::nextafter(half, 1e9),
+                                       -half, half * 1000.0, 12345.0 + half});
+    }
+    for (const double v : volumes) {
+        RowResult row;
+        row.areaHa = 1.0;
+        row.thinningVolume = v;
+        std::vector<std::string> values;
+        figureValues(row, values);
+        EXPECT_EQ(values[4], printed("%.3f", v)) << v;
+    }
+}
+
 } // namespace
 } // namespace arbolex::estate

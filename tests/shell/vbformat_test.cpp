@@ -2,9 +2,16 @@
 // independence from the locale.
 #include "shell/vbformat.hpp"
 
+#include "format/displayformat.hpp"
+
 #include <QLocale>
 
 #include <gtest/gtest.h>
+
+#include <bit>
+#include <cmath>
+#include <cstdint>
+#include <vector>
 
 namespace arbolex::shell {
 namespace {
@@ -40,6 +47,48 @@ TEST(FormatNumberTest, MatchesClassicFormat) {
     for (const auto &c : cases) {
         EXPECT_EQ(formatNumber(c.value, QString::fromLatin1(c.pattern)).toStdString(), c.expected)
             << c.value << " with \"" << c.pattern << '"';
+    }
+}
+
+// A shown figure is taken without its text where the scaled value is far
+// from a half; at a half, and where 15 significant digits round the value
+// onto one, it must still be the text read back, to the bit.
+TEST(FormatNumberTest, ShownValueIsTheTextReadBack) {
+    const char *patterns[] = {"#", "0", "#.0", "##0.0", "#0.00", "###0.00", "#0.000", "0.00##"};
+    std::vector<double> values = {0.0,
+                                  -0.0,
+                                  2.5,
+                                  -2.5,
+                                  0.125,
+                                  1.005,
+                                  2.675,
+                                  9.9996,
+                                  99.95,
+                                  0.0005,
+                                  -0.004,
+                                  -0.05,
+                                  1234.565,
+                                  1e14,
+                                  1e-300,
+                                  5e-324,
+                                  0.1 + 0.2,
+                                  249.995,
+                                  0.3499999999999999};
+    // Decimal halves and the doubles either side of them.
+    for (int k = 1; k < 2000; k += 37) {
+        for (const double scale : {10.0, 100.0, 1000.0, 10000.0}) {
+            const double half = (k + 0.5) / scale;
+            values.insert(values.end(),
+                          {half, std::nextafter(half, 0.0), std::nextafter(half, 1e9), -half});
+        }
+    }
+    for (const double v : values) {
+        for (const char *p : patterns) {
+            const double text = format::val(format::formatNumber(v, p));
+            EXPECT_EQ(std::bit_cast<std::uint64_t>(format::shownValue(v, p)),
+                      std::bit_cast<std::uint64_t>(text))
+                << v << " with \"" << p << '"';
+        }
     }
 }
 
