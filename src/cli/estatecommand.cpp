@@ -74,6 +74,8 @@ estateio::EstateJob readJob(const QStringList &arguments, const QString &dataFol
     job.defaults.year =
         options.has("year") ? options.wholeNumber("year", 1, 9999) : QDate::currentDate().year();
     job.defaults.economics = readEconomics(options, dataFolder, run);
+    // The carbon of every row costs as much as its growth: only when asked.
+    job.defaults.economics.carbonAccount = options.has("carbon-price");
     job.settings.threads =
         options.has("threads") ? options.wholeNumber("threads", 1, 1024) : defaultThreads();
     Shard shard;

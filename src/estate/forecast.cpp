@@ -43,6 +43,7 @@ std::optional<std::int64_t> units(const std::string &text, int decimals) {
 } // namespace
 
 void Forecast::add(const RowResult &row) {
+    m_withCarbon = m_withCarbon || row.hasCarbon;
     for (const ForecastEntry &h : row.harvests) {
         add(h.year, row.species,
             {h.thinningLitres, h.finalCutLitres, h.revenueCents, h.carbonRemovalKg,
@@ -50,7 +51,9 @@ void Forecast::add(const RowResult &row) {
     }
 }
 
-void Forecast::add(int year, const std::string &species, const ForecastTotals &totals) {
+void Forecast::add(int year, const std::string &species, const ForecastTotals &totals,
+                   bool withCarbon) {
+    m_withCarbon = m_withCarbon || withCarbon;
     if (species != kAllSpecies) {
         m_bySpecies[{year, species}] += totals;
     }
@@ -60,6 +63,7 @@ void Forecast::add(const Forecast &other) {
     for (const auto &[key, totals] : other.m_bySpecies) {
         m_bySpecies[key] += totals;
     }
+    m_withCarbon = m_withCarbon || other.m_withCarbon;
 }
 
 std::vector<Forecast::Line> Forecast::lines(int firstYear) const {
@@ -70,7 +74,7 @@ std::vector<Forecast::Line> Forecast::lines(int firstYear) const {
     const int lastYear = m_bySpecies.rbegin()->first.first;
     auto next = m_bySpecies.begin();
     for (int year = firstYear; year <= lastYear; ++year) {
-        Line all{year, kAllSpecies, {}};
+        Line all{year, kAllSpecies, {}, m_withCarbon};
         std::vector<Line> species;
         // Harvests before the first year (a stand older than its final cut
         // cannot have one) are skipped by the walk, not summed.
@@ -79,7 +83,7 @@ std::vector<Forecast::Line> Forecast::lines(int firstYear) const {
         }
         for (; next != m_bySpecies.end() && next->first.first == year; ++next) {
             all.totals += next->second;
-            species.push_back({year, next->first.second, next->second});
+            species.push_back({year, next->first.second, next->second, m_withCarbon});
         }
         out.push_back(all);
         out.insert(out.end(), species.begin(), species.end());
@@ -100,8 +104,8 @@ std::vector<std::string> forecastValues(const Forecast::Line &line) {
             fixed(line.totals.thinningLitres, 3),
             fixed(line.totals.finalCutLitres, 3),
             fixed(line.totals.revenueCents, 2),
-            fixed(line.totals.carbonRemovalKg, 3),
-            fixed(line.totals.carbonUnitsKg, 3)};
+            line.withCarbon ? fixed(line.totals.carbonRemovalKg, 3) : std::string(),
+            line.withCarbon ? fixed(line.totals.carbonUnitsKg, 3) : std::string()};
 }
 
 std::optional<Forecast::Line> forecastLine(const std::vector<std::string> &values) {
@@ -112,13 +116,17 @@ std::optional<Forecast::Line> forecastLine(const std::vector<std::string> &value
     const auto thinning = units(values[2], 3);
     const auto finalCut = units(values[3], 3);
     const auto revenue = units(values[4], 2);
-    const auto removal = units(values[5], 3);
-    const auto issued = units(values[6], 3);
+    // A forecast without carbon leaves both carbon cells empty.
+    const bool withCarbon = !values[5].empty() || !values[6].empty();
+    const auto removal = withCarbon ? units(values[5], 3) : std::optional<std::int64_t>(0);
+    const auto issued = withCarbon ? units(values[6], 3) : std::optional<std::int64_t>(0);
     if (!year || values[1].empty() || !thinning || !finalCut || !revenue || !removal || !issued) {
         return std::nullopt;
     }
-    return Forecast::Line{
-        static_cast<int>(*year), values[1], {*thinning, *finalCut, *revenue, *removal, *issued}};
+    return Forecast::Line{static_cast<int>(*year),
+                          values[1],
+                          {*thinning, *finalCut, *revenue, *removal, *issued},
+                          withCarbon};
 }
 
 } // namespace arbolex::estate

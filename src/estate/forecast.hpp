@@ -43,14 +43,16 @@ public:
     /// Adds the harvests of a row that was grown.
     void add(const RowResult &row);
     /// Adds one line of a forecast ("all" lines are the sums, and skipped).
-    void add(int year, const std::string &species, const ForecastTotals &totals);
+    void add(int year, const std::string &species, const ForecastTotals &totals,
+             bool withCarbon = false);
     void add(const Forecast &other);
 
-    /// One line of the table.
+    /// One line of the table; its carbon only when the rows had theirs.
     struct Line {
         int year = 0;
         std::string species;
         ForecastTotals totals;
+        bool withCarbon = false;
     };
     /// Every calendar year from `firstYear` to the last harvest: the estate's
     /// line ("all"), then one line per species harvested that year, by name.
@@ -60,6 +62,8 @@ public:
 
 private:
     std::map<std::pair<int, std::string>, ForecastTotals> m_bySpecies;
+    /// True once a row or a line brought its carbon.
+    bool m_withCarbon = false;
 };
 
 /// Columns of the forecast table.

@@ -136,10 +136,14 @@ void figureValues(const RowResult &row, std::vector<std::string> &values) {
     values.push_back(moneyForArea(row.lev, area));
     values.push_back(money(row.forestValue));
     values.push_back(moneyForArea(row.forestValue, area));
-    values.push_back(quantity(row.carbonStock));
-    values.push_back(quantity(row.carbonLongTermAverage));
-    values.push_back(fixed(row.carbonUnits * area, 3));
-    values.push_back(money(row.npvCarbon));
+    if (row.hasCarbon) {
+        values.push_back(quantity(row.carbonStock));
+        values.push_back(quantity(row.carbonLongTermAverage));
+        values.push_back(fixed(row.carbonUnits * area, 3));
+        values.push_back(money(row.npvCarbon));
+    } else {
+        values.insert(values.end(), 4, std::string());
+    }
     values.emplace_back(statusWord(row.status));
 }
 

@@ -139,6 +139,7 @@ void RowEvaluator::carbon(const carbon::Account &account, int presentAge, int pr
         return;
     }
     const carbon::AccountYear &today = account.years[static_cast<std::size_t>(presentAge)];
+    result.hasCarbon = true;
     result.carbonStock = today.trees + today.harvested;
     result.carbonLongTermAverage = account.longTermAverage;
     result.carbonUnits = account.unitsTotal;

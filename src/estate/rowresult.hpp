@@ -71,6 +71,7 @@ struct RowResult {
     /// Carbon in the trees today and their long-term average stock over the
     /// rotation, t CO₂e/ha; the carbon units of the rotation, t CO₂e/ha; and
     /// the NPV of the carbon money, euro/ha (0 unless carbon counts).
+    bool hasCarbon = false;
     double carbonStock = 0.0;
     double carbonLongTermAverage = 0.0;
     double carbonUnits = 0.0;

@@ -488,7 +488,9 @@ RotationValue valueHarvests(const RotationHarvests &harvests, const Economics &e
     price(v.finalCut, harvests.volumeRatio, economics, false);
     std::vector<Harvest> all = v.thinnings;
     all.push_back(v.finalCut);
-    v.carbon = rotationCarbon(harvests, economics.carbonParameters);
+    if (economics.carbonAccount || economics.carbon.counts()) {
+        v.carbon = rotationCarbon(harvests, economics.carbonParameters);
+    }
     const bool carbonCounts = economics.carbon.counts() && !v.carbon.years.empty();
     const Flows f = cashFlows(all, rotation, economics,
                               carbonCounts ? carbon::carbonCashFlow(v.carbon, economics.carbon,

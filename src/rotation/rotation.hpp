@@ -92,6 +92,10 @@ struct Economics {
     carbon::Pricing carbon{};
     /// The constants of the carbon account.
     carbon::Parameters carbonParameters{};
+    /// Whether a valuation keeps the carbon account when carbon money does
+    /// not count: dividing every harvest into its products costs as much as
+    /// growing the stand, which an estate asks for only when it wants carbon.
+    bool carbonAccount = true;
 };
 
 /// A thinning or the final cut, per hectare.

@@ -130,7 +130,7 @@ TEST_F(EstateRunTest, ShardsTogetherAreTheWholeEstateAndTheirForecastsAddUp) {
     for (const Forecast::Line &l : whole.summary.forecast.lines(2026)) {
         const auto back = forecastLine(forecastValues(l));
         ASSERT_TRUE(back.has_value());
-        reread.add(back->year, back->species, back->totals);
+        reread.add(back->year, back->species, back->totals, back->withCarbon);
     }
     EXPECT_EQ(reread, whole.summary.forecast);
 }

@@ -91,7 +91,9 @@ TEST_F(EstateWindowTest, RowsAndForecastAreTheCommandLinesAndTheInputIsOnlyRead)
         {QStringLiteral("estate"), exampleEstate(), QStringLiteral("--out"), out,
          QStringLiteral("--year"), QString::number(d.year), QStringLiteral("--rate"),
          QStringLiteral("3.5"), QStringLiteral("--prices"), QStringLiteral("longterm"),
-         QStringLiteral("--threads"), QStringLiteral("1")},
+         QStringLiteral("--threads"), QStringLiteral("1"),
+         // The window keeps every row's carbon; the program when asked.
+         QStringLiteral("--carbon-price"), QStringLiteral("0")},
         cliData.path());
     ASSERT_LE(r.exitCode, 1) << r.err.toStdString();
 
