@@ -79,7 +79,8 @@ ChartAxis moneyAxis(double low, double high, const QString &title) {
     return axis;
 }
 
-ChartData rotationChart(const rotation::RotationExplorer &explorer, const QString &title) {
+ChartData rotationChart(const rotation::RotationExplorer &explorer, const QString &title,
+                        int economicWithoutCarbon) {
     ChartData chart;
     chart.title = title;
     if (explorer.rows.empty()) {
@@ -131,6 +132,12 @@ ChartData rotationChart(const rotation::RotationExplorer &explorer, const QStrin
         chart.markers.push_back({static_cast<double>(explorer.economicRotation),
                                  rotationLabel(et::markEconomic(), explorer.economicRotation),
                                  kGrey, kAxisMoney});
+    }
+    if (economicWithoutCarbon > 0 && economicWithoutCarbon != explorer.economicRotation) {
+        chart.markers.push_back(
+            {static_cast<double>(economicWithoutCarbon),
+             rotationLabel(et::markEconomicWithoutCarbon(), economicWithoutCarbon), kBlue,
+             kAxisMoney});
     }
     return chart;
 }
@@ -221,7 +228,8 @@ ChartData histogramChart(const rotation::MonteCarloResult &result, const QString
 EconomicsCharts economicsCharts(economics::EconomicsWindowLogic &logic) {
     EconomicsCharts charts;
     const QString rate = QLatin1Char(' ') + et::atRate(logic.rateText());
-    charts.rotations = rotationChart(logic.explorer(), et::panelRotations() + rate);
+    charts.rotations = rotationChart(logic.explorer(), et::panelRotations() + rate,
+                                     logic.economicRotationWithoutCarbon());
     const auto &value = logic.value();
     if (value && value->npv && value->lev) {
         charts.tornadoNpv =

@@ -29,6 +29,8 @@ QString tabCaption(ChartPanel::Chart chart) {
         return charts::text::titleStand();
     case ChartPanel::kIncrements:
         return charts::text::titleIncrements();
+    case ChartPanel::kCarbon:
+        return charts::text::titleCarbon();
     default:
         return charts::text::titleCashFlow();
     }
@@ -36,8 +38,14 @@ QString tabCaption(ChartPanel::Chart chart) {
 
 /// What an empty tab says.
 QString emptyText(ChartPanel::Chart chart) {
-    return chart == ChartPanel::kCashFlow ? charts::text::emptyCashFlow()
-                                          : charts::text::emptyStand();
+    switch (chart) {
+    case ChartPanel::kCashFlow:
+        return charts::text::emptyCashFlow();
+    case ChartPanel::kCarbon:
+        return charts::text::emptyCarbon();
+    default:
+        return charts::text::emptyStand();
+    }
 }
 
 std::size_t slot(ChartPanel::Chart chart) {
@@ -92,9 +100,8 @@ ChartPanel::ChartPanel(QWidget *parent) : QWidget(parent) {
     });
 }
 
-void ChartPanel::showCharts(const charts::ChartData &stand, const charts::ChartData &increments,
-                            const charts::ChartData &cashFlow) {
-    m_data = {stand, increments, cashFlow};
+void ChartPanel::showCharts(const charts::RotationCharts &drawn) {
+    m_data = {drawn.stand, drawn.increments, drawn.cashFlow, drawn.carbon};
     m_drawn.fill(false);
     draw(current());
 }
