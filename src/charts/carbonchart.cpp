@@ -51,7 +51,11 @@ ChartData carbonAccountChart(const carbon::Account &account) {
     }
     ChartSeries trees = series(text::seriesCarbonTrees(), kTrees);
     ChartSeries products = series(text::seriesCarbonProducts(), kProducts);
+    // The account closes: the net removal to date is the trees and products,
+    // so it runs dashed over the trees until a harvest sends carbon away.
     ChartSeries removal = series(text::seriesNetRemoval(), kRemoval);
+    removal.pattern = ChartSeries::Pattern::Dashed;
+    trees.width = 3.0;
     ChartSeries units = series(text::seriesUnits(), kUnits);
     ChartSeries average = series(text::seriesLongTermAverage(), kAverage);
     average.pattern = ChartSeries::Pattern::Dashed;

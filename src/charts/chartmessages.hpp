@@ -107,19 +107,19 @@ inline QString unitCarbon() {
     return QStringLiteral("t CO₂e/ha");
 }
 inline QString seriesCarbonTrees() {
-    return QStringLiteral("In the trees");
+    return QStringLiteral("Trees");
 }
 inline QString seriesCarbonProducts() {
-    return QStringLiteral("In products");
+    return QStringLiteral("Products");
 }
 inline QString seriesNetRemoval() {
-    return QStringLiteral("Cumulative net removal");
+    return QStringLiteral("Net removal");
 }
 inline QString seriesUnits() {
     return QStringLiteral("Units issued");
 }
 inline QString seriesLongTermAverage() {
-    return QStringLiteral("Long-term average stock");
+    return QStringLiteral("Average stock");
 }
 /// The long-term average stock and the units issued, t CO₂e/ha.
 inline QString noteCarbon(const QString &average, const QString &units) {
@@ -143,6 +143,19 @@ inline QString axisHarvestYear() {
 }
 
 // The chart panel
+/// The tabs' captions, shorter than the charts' titles: four fit beside the table.
+inline QString tabStand() {
+    return QStringLiteral("Stand");
+}
+inline QString tabIncrements() {
+    return QStringLiteral("Increment");
+}
+inline QString tabCashFlow() {
+    return QStringLiteral("Cash flow");
+}
+inline QString tabCarbon() {
+    return QStringLiteral("Carbon");
+}
 inline QString buttonExportPng() {
     return QStringLiteral("Export PNG…");
 }

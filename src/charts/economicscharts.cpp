@@ -21,6 +21,7 @@ constexpr std::uint32_t kGreen = 0x009e73;
 constexpr std::uint32_t kOrange = 0xe69f00;
 constexpr std::uint32_t kVermilion = 0xd55e00;
 constexpr std::uint32_t kGrey = 0x6e6e6e;
+constexpr std::uint32_t kReddishPurple = 0xcc79a7;
 
 /// Line widths, pixels: the money a little bolder than the increment.
 constexpr double kMoneyLine = 2.4;
@@ -136,7 +137,7 @@ ChartData rotationChart(const rotation::RotationExplorer &explorer, const QStrin
     if (economicWithoutCarbon > 0 && economicWithoutCarbon != explorer.economicRotation) {
         chart.markers.push_back(
             {static_cast<double>(economicWithoutCarbon),
-             rotationLabel(et::markEconomicWithoutCarbon(), economicWithoutCarbon), kBlue,
+             rotationLabel(et::markEconomicWithoutCarbon(), economicWithoutCarbon), kReddishPurple,
              kAxisMoney});
     }
     return chart;

@@ -206,7 +206,7 @@ inline QString figureCarbon() {
     return QStringLiteral("Carbon");
 }
 inline QString markEconomicWithoutCarbon() {
-    return QStringLiteral("Economic without carbon");
+    return QStringLiteral("Timber alone");
 }
 inline QString noFigure() {
     return QStringLiteral("—");

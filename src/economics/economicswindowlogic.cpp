@@ -84,6 +84,11 @@ QString entriesText(const std::vector<rotation::CashFlowEntry> &entries) {
                : QStringLiteral(" · the cash flow's ") + parts.join(QStringLiteral(" and "));
 }
 
+/// The carbon money, for the line of the money: "" when carbon is not paid.
+QString carbonText(const carbon::Pricing &pricing) {
+    return pricing.counts() ? QStringLiteral(" · ") + pricingText(pricing) : QString();
+}
+
 /// A cost as its field shows it.
 QString costText(double euro) {
     return shell::generalNumber(euro);
@@ -378,7 +383,8 @@ void EconomicsWindowLogic::showFigures() {
                                    euroText(m_economics.establishmentCost) +
                                    QStringLiteral(" €/ha · annual cost ") +
                                    euroText(m_economics.annualCost) + QStringLiteral(" €/ha/yr") +
-                                   entriesText(m_economics.entries));
+                                   entriesText(m_economics.entries) +
+                                   carbonText(m_economics.carbon));
     m_view.setText(C::lblNPV, euroPerHaText(v.npv));
     m_view.setText(C::lblLEV, euroPerHaText(v.lev));
     m_view.setText(C::lblEAA, v.eaa ? euroText(*v.eaa) + QStringLiteral(" €/ha/yr")

@@ -14,6 +14,7 @@
 #include <QLineEdit>
 #include <QPushButton>
 #include <QRadioButton>
+#include <QStyle>
 #include <QTableWidget>
 #include <QVBoxLayout>
 
@@ -31,9 +32,9 @@ namespace {
 /// Width of the price field, in digits of the window's font: room for "10000.00".
 constexpr int kPriceDigits = 9;
 /// Width of the window's text, in average characters of its font.
-constexpr int kTextChars = 96;
+constexpr int kTextChars = 124;
 /// Tallest the constants' table grows before it scrolls, pixels.
-constexpr int kTallestTable = 560;
+constexpr int kTallestTable = 600;
 
 std::size_t slot(C c) {
     return static_cast<std::size_t>(c);
@@ -215,13 +216,26 @@ void CarbonPriceWindow::setConstants(const std::vector<QStringList> &grid) {
     m_constants->setColumnWidth(0, m_constants->columnWidth(0) + 12);
     m_constants->setColumnWidth(1, m_constants->columnWidth(1) + 12);
     // Known before the window is first laid out, so the rows are as tall as
-    // their wrapped sources.
-    m_constants->setColumnWidth(2, m_constants->width() - 2 * m_constants->frameWidth() -
-                                       m_constants->columnWidth(0) - m_constants->columnWidth(1));
-    m_constants->resizeRowsToContents();
-    int height = m_constants->horizontalHeader()->height() + 2 * m_constants->frameWidth();
-    for (int row = 0; row < m_constants->rowCount(); ++row) {
-        height += m_constants->rowHeight(row);
+    // their wrapped sources; a table taller than the most it shows keeps room
+    // for its scroll bar.
+    const auto layOutRows = [this](int scrollBar) {
+        m_constants->setColumnWidth(2, m_constants->width() - 2 * m_constants->frameWidth() -
+                                           m_constants->columnWidth(0) -
+                                           m_constants->columnWidth(1) - scrollBar);
+        m_constants->resizeRowsToContents();
+        int height =
+            m_constants->horizontalHeader()->sizeHint().height() + 2 * m_constants->frameWidth();
+        for (int row = 0; row < m_constants->rowCount(); ++row) {
+            height += m_constants->rowHeight(row);
+        }
+        return height;
+    };
+    int height = layOutRows(0);
+    if (height > kTallestTable) {
+        m_constants->setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOn);
+        height = layOutRows(style()->pixelMetric(QStyle::PM_ScrollBarExtent));
+    } else {
+        m_constants->setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     }
     m_constants->setFixedHeight(std::min(height, kTallestTable));
 }

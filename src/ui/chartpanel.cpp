@@ -36,6 +36,19 @@ QString tabCaption(ChartPanel::Chart chart) {
     }
 }
 
+QString tabLabel(ChartPanel::Chart chart) {
+    switch (chart) {
+    case ChartPanel::kStand:
+        return charts::text::tabStand();
+    case ChartPanel::kIncrements:
+        return charts::text::tabIncrements();
+    case ChartPanel::kCarbon:
+        return charts::text::tabCarbon();
+    default:
+        return charts::text::tabCashFlow();
+    }
+}
+
 /// What an empty tab says.
 QString emptyText(ChartPanel::Chart chart) {
     switch (chart) {
@@ -76,7 +89,7 @@ ChartPanel::ChartPanel(QWidget *parent) : QWidget(parent) {
         stack->addWidget(view);
         m_views.at(slot(chart)) = view;
         m_empty.at(slot(chart)) = empty;
-        m_tabs->addTab(page, tabCaption(chart));
+        m_tabs->addTab(page, tabLabel(chart));
     }
     layout->addWidget(m_tabs, 1);
 

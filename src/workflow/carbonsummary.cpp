@@ -12,7 +12,12 @@ CarbonSummary carbonSummary(const std::optional<rotation::RotationValue> &value,
                             std::optional<std::pair<int, double>> lastStand) {
     using economics::tonnesText;
     CarbonSummary block;
-    block.heading = text::summaryCarbonHeading(economics::pricingText(economics.carbon));
+    QString pricing = economics::pricingText(economics.carbon);
+    if (economics.carbon.counts()) {
+        pricing += QStringLiteral(", NPV at ") + economics::percentText(economics.ratePercent) +
+                   QStringLiteral(" % a year");
+    }
+    block.heading = text::summaryCarbonHeading(pricing);
     if (!value || value->carbon.years.empty()) {
         if (lastStand) {
             block.figures.emplace_back(text::summaryCarbonInTrees(lastStand->first),

@@ -147,7 +147,7 @@ inline QString summary() {
 }
 /// Heading of the summary's carbon block, naming the carbon money.
 inline QString summaryCarbonHeading(const QString &pricing) {
-    return QStringLiteral("Carbon, t CO\u2082e/ha (") + pricing + QLatin1Char(')');
+    return QStringLiteral("Carbon, t CO\u2082e/ha \u00b7 ") + pricing;
 }
 inline QString summaryCarbonAtFinalCut() {
     return QStringLiteral("Stock at the final cut (trees, before felling)");
