@@ -33,6 +33,7 @@ window_of() {
     npv) echo "Net Present Value" ;;
     timber-prices) echo "Timber Prices" ;;
     assort-prices) echo "Assortment Prices" ;;
+    carbon-price) echo "Carbon Price" ;;
     assort-user) echo "User assortment categories" ;;
     assort-growth | assort-thinning | assort-user-report) echo "Assortment at age" ;;
     economics-table) echo "" ;;

@@ -231,4 +231,14 @@ std::string carbonText(const Settings &settings) {
     return out.str();
 }
 
+std::vector<ConstantEntry> constantEntries(const Settings &settings) {
+    std::vector<ConstantEntry> constants;
+    for (const Entry &e : entries()) {
+        if (e.name != "price" && e.name != "payment") {
+            constants.push_back({e.name, e.show(settings), e.comment});
+        }
+    }
+    return constants;
+}
+
 } // namespace arbolex::carbon

@@ -11,6 +11,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace arbolex::carbon {
 
@@ -52,5 +53,20 @@ CarbonReading readCarbonText(std::string_view text);
 /// The text of a carbon file holding `settings`, every name with its
 /// source as a comment.
 std::string carbonText(const Settings &settings);
+
+/// One constant of the account as the carbon file writes it.
+struct ConstantEntry {
+    /// Its name in the file ("half_life.paper").
+    std::string name;
+    /// Its value as the file writes it ("2", "yes").
+    std::string value;
+    /// The comment above it: what it is and its source. A name that follows
+    /// another under the same comment has none.
+    std::string source;
+};
+
+/// Every constant of the account in `settings` (not the price nor the
+/// payment), in the file's order.
+std::vector<ConstantEntry> constantEntries(const Settings &settings);
 
 } // namespace arbolex::carbon

@@ -96,6 +96,41 @@ inline QString noteNpv(const QString &npv, const QString &rate) {
     return QStringLiteral("Net present value %1 €/ha at %2 %").arg(npv, rate);
 }
 
+// Carbon
+inline QString titleCarbon() {
+    return QStringLiteral("Carbon");
+}
+inline QString axisCarbon() {
+    return QStringLiteral("Carbon (t CO₂e/ha)");
+}
+inline QString unitCarbon() {
+    return QStringLiteral("t CO₂e/ha");
+}
+inline QString seriesCarbonTrees() {
+    return QStringLiteral("Trees");
+}
+inline QString seriesCarbonProducts() {
+    return QStringLiteral("Products");
+}
+inline QString seriesNetRemoval() {
+    return QStringLiteral("Net removal");
+}
+inline QString seriesUnits() {
+    return QStringLiteral("Units issued");
+}
+inline QString seriesLongTermAverage() {
+    return QStringLiteral("Average stock");
+}
+/// The long-term average stock and the units issued, t CO₂e/ha.
+inline QString noteCarbon(const QString &average, const QString &units) {
+    return QStringLiteral("Long-term average %1 t CO₂e/ha · %2 t CO₂e/ha of units issued")
+        .arg(average, units);
+}
+inline QString noteCarbonBeforeFinalCut() {
+    return QStringLiteral("The trees of the table's rows: the account of products, removals "
+                          "and units follows the final cut.");
+}
+
 // Harvest forecast of an estate
 inline QString titleHarvest() {
     return QStringLiteral("Harvest forecast by year and species");
@@ -108,6 +143,19 @@ inline QString axisHarvestYear() {
 }
 
 // The chart panel
+/// The tabs' captions, shorter than the charts' titles: four fit beside the table.
+inline QString tabStand() {
+    return QStringLiteral("Stand");
+}
+inline QString tabIncrements() {
+    return QStringLiteral("Increment");
+}
+inline QString tabCashFlow() {
+    return QStringLiteral("Cash flow");
+}
+inline QString tabCarbon() {
+    return QStringLiteral("Carbon");
+}
 inline QString buttonExportPng() {
     return QStringLiteral("Export PNG…");
 }
@@ -122,6 +170,9 @@ inline QString filterSvg() {
 }
 inline QString emptyStand() {
     return QStringLiteral("Grow a stand to see its chart.");
+}
+inline QString emptyCarbon() {
+    return QStringLiteral("Grow a stand to see the carbon in its trees.");
 }
 inline QString emptyCashFlow() {
     return QStringLiteral("No cash flow yet: close the rotation with a final cut and "

@@ -21,6 +21,7 @@ constexpr std::uint32_t kGreen = 0x009e73;
 constexpr std::uint32_t kOrange = 0xe69f00;
 constexpr std::uint32_t kVermilion = 0xd55e00;
 constexpr std::uint32_t kGrey = 0x6e6e6e;
+constexpr std::uint32_t kReddishPurple = 0xcc79a7;
 
 /// Line widths, pixels: the money a little bolder than the increment.
 constexpr double kMoneyLine = 2.4;
@@ -79,7 +80,8 @@ ChartAxis moneyAxis(double low, double high, const QString &title) {
     return axis;
 }
 
-ChartData rotationChart(const rotation::RotationExplorer &explorer, const QString &title) {
+ChartData rotationChart(const rotation::RotationExplorer &explorer, const QString &title,
+                        int economicWithoutCarbon) {
     ChartData chart;
     chart.title = title;
     if (explorer.rows.empty()) {
@@ -131,6 +133,12 @@ ChartData rotationChart(const rotation::RotationExplorer &explorer, const QStrin
         chart.markers.push_back({static_cast<double>(explorer.economicRotation),
                                  rotationLabel(et::markEconomic(), explorer.economicRotation),
                                  kGrey, kAxisMoney});
+    }
+    if (economicWithoutCarbon > 0 && economicWithoutCarbon != explorer.economicRotation) {
+        chart.markers.push_back(
+            {static_cast<double>(economicWithoutCarbon),
+             rotationLabel(et::markEconomicWithoutCarbon(), economicWithoutCarbon), kReddishPurple,
+             kAxisMoney});
     }
     return chart;
 }
@@ -221,7 +229,8 @@ ChartData histogramChart(const rotation::MonteCarloResult &result, const QString
 EconomicsCharts economicsCharts(economics::EconomicsWindowLogic &logic) {
     EconomicsCharts charts;
     const QString rate = QLatin1Char(' ') + et::atRate(logic.rateText());
-    charts.rotations = rotationChart(logic.explorer(), et::panelRotations() + rate);
+    charts.rotations = rotationChart(logic.explorer(), et::panelRotations() + rate,
+                                     logic.economicRotationWithoutCarbon());
     const auto &value = logic.value();
     if (value && value->npv && value->lev) {
         charts.tornadoNpv =

@@ -25,9 +25,11 @@ enum RotationAxis : int { kAxisMoney = 0, kAxisMai = 1 };
 ChartAxis moneyAxis(double low, double high, const QString &title);
 
 /// NPV and LEV (€/ha, left axis) and MAI (m³/ha/yr, right axis) by rotation
-/// age, the biological and economic rotations marked; only the title when
-/// the explorer has no rows.
-ChartData rotationChart(const rotation::RotationExplorer &explorer, const QString &title);
+/// age, the biological and economic rotations marked, and the economic
+/// rotation without carbon money (`economicWithoutCarbon`, years) where
+/// paying carbon moves it; only the title when the explorer has no rows.
+ChartData rotationChart(const rotation::RotationExplorer &explorer, const QString &title,
+                        int economicWithoutCarbon = 0);
 
 /// NPV (or LEV with `lev`) at the low and high end of each factor, as lying
 /// bars from the value at today's figures `base` (€/ha), the widest swing on top.

@@ -1,12 +1,18 @@
 #include "charts/reportcontent.hpp"
 #include "work/worktexts.hpp"
 
+#include "charts/carbonchart.hpp"
 #include "charts/economicscharts.hpp"
 #include "charts/reportmessages.hpp"
 #include "charts/standcharts.hpp"
+#include "economics/carbonformat.hpp"
+#include "economics/carbonpricemessages.hpp"
+#include "economics/economicsformat.hpp"
 #include "economics/economicsmessages.hpp"
 #include "economics/economicswindowlogic.hpp"
+#include "economics/tableregime.hpp"
 #include "engine/grow.hpp"
+#include "engine/modeldescription.hpp"
 #include "shell/vbformat.hpp"
 #include "work/mdlnpv.hpp"
 #include "work/standwork.hpp"
@@ -119,7 +125,16 @@ EconomicsPage economicsPage(economics::EconomicsWindowLogic &logic) {
     for (const auto &[caption, label] : economics::valueFigures()) {
         page.figures.emplace_back(caption, view.text(label));
     }
-    page.rotations = rotationChart(logic.explorer(), et::panelRotations() + rate);
+    const auto sum = [&view](EconomicsControl timber, EconomicsControl carbon) {
+        return view.text(timber) + QStringLiteral(" + ") + view.text(carbon);
+    };
+    page.figures.emplace_back(et::figureNpvSplit(),
+                              sum(EconomicsControl::lblNpvTimber, EconomicsControl::lblNpvCarbon));
+    page.figures.emplace_back(et::figureLevSplit(),
+                              sum(EconomicsControl::lblLevTimber, EconomicsControl::lblLevCarbon));
+    page.figures.emplace_back(et::figureCarbon(), view.text(EconomicsControl::lblCarbonRotation));
+    page.rotations = rotationChart(logic.explorer(), et::panelRotations() + rate,
+                                   logic.economicRotationWithoutCarbon());
     if (!logic.regimes().empty()) {
         std::vector<QStringList> grid = logic.regimeGrid();
         // Captions in two lines on screen run on in print.
@@ -133,12 +148,83 @@ EconomicsPage economicsPage(economics::EconomicsWindowLogic &logic) {
     return page;
 }
 
+/// The carbon page of a felled table: its rotation valued with the work's
+/// money, as the economics window values it.
+std::optional<CarbonPage> carbonPage(const work::StandWork &work, const ReportContent &content) {
+    const rotation::Economics money = work.economics();
+    const std::int16_t model = work.grow().modelId();
+    const auto harvests =
+        economics::harvestsFromTable(work.table(), model, work.grow().volumeRatio());
+    const auto value = economics::valueTableRotation(work, money);
+    if (!harvests || !value || value->carbon.years.empty()) {
+        return std::nullopt;
+    }
+    using economics::tonnesText;
+    const carbon::Account &account = value->carbon;
+    const carbon::AccountYear &cut = account.years.back();
+    CarbonPage page;
+    page.title = text::carbonTitle();
+    QStringList place;
+    for (const QString &part : {content.forest, content.compartment, content.subCompartment}) {
+        if (!part.trimmed().isEmpty()) {
+            place << part.trimmed();
+        }
+    }
+    const std::string_view species = engine::speciesCode(model);
+    const QString code =
+        QString::fromLatin1(species.data(), static_cast<qsizetype>(species.size()));
+    QString pricing = economics::pricingText(money.carbon);
+    if (money.carbon.counts()) {
+        pricing += QStringLiteral(", discounted at ") + economics::percentText(money.ratePercent) +
+                   QStringLiteral(" % a year");
+    }
+    page.identification = {
+        {text::carbonSubCompartment(), place.join(QStringLiteral(" · "))},
+        {text::captionModel(), content.modelLabel},
+        {text::carbonSpecies(),
+         code + QStringLiteral(", ") +
+             shell::generalNumber(money.carbonParameters.gravityOf(species)) +
+             QStringLiteral(" t/m³")},
+        {text::carbonRotation(), economics::describeTableRotation(*harvests)},
+        {text::carbonPeriod(), text::carbonPeriodText(harvests->presentAge, harvests->rotation)},
+        {text::carbonMoney(), pricing},
+    };
+    double productsAtEnd = 0.0;
+    for (const double pool : account.poolsAtEnd) {
+        productsAtEnd += pool;
+    }
+    page.totalsTitle = text::carbonTotals();
+    page.totals = {
+        {text::carbonAtFinalCut(), tonnesText(cut.trees + cut.harvested)},
+        {text::carbonAverage(), tonnesText(account.longTermAverage)},
+        {text::carbonNetRemoval(), tonnesText(cut.cumulativeNetRemoval)},
+        {text::carbonUnits(), tonnesText(account.unitsTotal)},
+        {text::carbonProductsAtEnd(), tonnesText(productsAtEnd)},
+        {text::carbonNpv(), money.carbon.counts() ? economics::euroPerHaText(value->npvCarbon)
+                                                  : economics::carbontext::notCounted()},
+    };
+    page.constantsTitle = text::carbonConstants();
+    page.constants = fromGrid(
+        economics::constantsGrid(carbon::Settings{money.carbon, money.carbonParameters}), {});
+    page.yearlyTitle = text::carbonYearly();
+    page.yearly.captions = text::carbonAccountCaptions();
+    for (const carbon::AccountYear &y : account.years) {
+        page.yearly.rows.push_back(
+            {QString::number(y.age), tonnesText(y.trees), tonnesText(y.products),
+             tonnesText(y.sequestration), tonnesText(y.harvested), tonnesText(y.emissions),
+             tonnesText(y.netRemoval), tonnesText(y.cumulativeNetRemoval), tonnesText(y.units)});
+    }
+    page.yearlyNote = text::carbonYearlyNote();
+    page.chart = carbonAccountChart(account);
+    return page;
+}
+
 } // namespace
 
 RotationCharts rotationCharts(work::StandWork &work) {
     const ComputedCashFlow computed = computedCashFlow(work);
     return {standDevelopment(work.table()), increments(work.table()),
-            cashFlowChart(computed.flow, computed.years)};
+            cashFlowChart(computed.flow, computed.years), carbonChart(work)};
 }
 
 ReportContent reportContent(work::StandWork &work) {
@@ -169,6 +255,7 @@ ReportContent reportContent(work::StandWork &work) {
     content.standChart = standDevelopment(work.table());
     content.incrementChart = increments(work.table());
     content.cashFlowChart = cashFlowChart(computed.flow, computed.years);
+    content.carbon = carbonPage(work, content);
     return content;
 }
 

@@ -51,6 +51,23 @@ struct EconomicsPage {
     QString regimesNote;
 };
 
+/// The carbon account of the rotation the table holds, as a validator reads
+/// it: what it is of, its totals, the constants with their sources, the
+/// account year by year and its chart.
+struct CarbonPage {
+    QString title;
+    /// The sub-compartment, model, species, rotation and carbon money.
+    std::vector<std::pair<QString, QString>> identification;
+    QString totalsTitle;
+    std::vector<std::pair<QString, QString>> totals;
+    QString constantsTitle;
+    ReportTable constants;
+    QString yearlyTitle;
+    ReportTable yearly;
+    QString yearlyNote;
+    ChartData chart;
+};
+
 struct ReportContent {
     /// Identification of the sub-compartment (the document's); empty fields
     /// are left out.
@@ -80,6 +97,8 @@ struct ReportContent {
     /// The economics of the rotation; none unless the economics window has
     /// valued the table as it stands.
     std::optional<EconomicsPage> economics;
+    /// The carbon account of the rotation; none before the final cut.
+    std::optional<CarbonPage> carbon;
 };
 
 /// The report of the work as it stands: its summary made afresh, and the
@@ -92,11 +111,12 @@ ReportContent reportContent(work::StandWork &work);
 /// before the window has valued the table, nor after the table has changed.
 ReportContent reportContent(work::StandWork &work, economics::EconomicsWindowLogic &economics);
 
-/// The three charts of the main window now (the panel beside the table).
+/// The charts of the main window now (the panel beside the table).
 struct RotationCharts {
     ChartData stand;
     ChartData increments;
     ChartData cashFlow;
+    ChartData carbon;
 };
 RotationCharts rotationCharts(work::StandWork &work);
 

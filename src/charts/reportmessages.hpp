@@ -3,6 +3,7 @@
 // Every text of the printed report, in one place: a changed caption is one edit.
 
 #include <QString>
+#include <QStringList>
 
 namespace arbolex::charts::text {
 
@@ -103,6 +104,77 @@ inline QString writeFailed(const QString &path) {
 }
 inline QString printFailed() {
     return QStringLiteral("ERROR - The report could not be sent to the printer.");
+}
+
+// ---- The carbon page ----------------------------------------------------------------------
+
+inline QString carbonTitle() {
+    return QStringLiteral("Carbon account of the rotation");
+}
+inline QString carbonSubCompartment() {
+    return QStringLiteral("Sub-compartment");
+}
+inline QString carbonSpecies() {
+    return QStringLiteral("Species, specific gravity");
+}
+inline QString carbonRotation() {
+    return QStringLiteral("Rotation");
+}
+inline QString carbonPeriod() {
+    return QStringLiteral("Account");
+}
+/// The account's years, and how the years before the table's first are taken.
+inline QString carbonPeriodText(int presentAge, int finalCut) {
+    return QStringLiteral("from planting (age 0) to the final cut at %2 years; the stand is "
+                          "grown from age %1, and the carbon in its trees before that rises "
+                          "in a straight line from planting")
+        .arg(presentAge)
+        .arg(finalCut);
+}
+inline QString carbonMoney() {
+    return QStringLiteral("Carbon money");
+}
+inline QString carbonTotals() {
+    return QStringLiteral("Totals, t CO₂e/ha");
+}
+inline QString carbonAtFinalCut() {
+    return QStringLiteral("In the trees at the final cut (before felling)");
+}
+inline QString carbonAverage() {
+    return QStringLiteral("Long-term average stock");
+}
+inline QString carbonNetRemoval() {
+    return QStringLiteral("Total net removal to the final cut");
+}
+inline QString carbonUnits() {
+    return QStringLiteral("Units issued (after the buffer)");
+}
+inline QString carbonProductsAtEnd() {
+    return QStringLiteral("In products in use at the final cut");
+}
+inline QString carbonNpv() {
+    return QStringLiteral("Carbon revenue NPV");
+}
+inline QString carbonConstants() {
+    return QStringLiteral("Constants of the account and their sources (Carbon.qdm)");
+}
+inline QString carbonYearly() {
+    return QStringLiteral("The account year by year, t CO₂e/ha");
+}
+/// Captions of the yearly account, in order.
+inline QStringList carbonAccountCaptions() {
+    return {QStringLiteral("Age"),         QStringLiteral("In the trees"),
+            QStringLiteral("In products"), QStringLiteral("Sequestration"),
+            QStringLiteral("Harvested"),   QStringLiteral("Emissions"),
+            QStringLiteral("Net removal"), QStringLiteral("Cumulative net removal"),
+            QStringLiteral("Units issued")};
+}
+inline QString carbonYearlyNote() {
+    return QStringLiteral(
+        "Stocks at the end of each year, after its harvest. Net removal: sequestration less "
+        "emissions (what a harvest leaves in the forest and the mill loses, and the decay of "
+        "the products in use). Units are issued at each verification on the net removal "
+        "since the last, less the buffer, and capped at the long-term average stock.");
 }
 
 } // namespace arbolex::charts::text

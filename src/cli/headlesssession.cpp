@@ -26,7 +26,7 @@ bool PrintingInteractive::askYesNo(const QString &title, const QString &text) {
 HeadlessSession::HeadlessSession(const QString &dataFolder, QTextStream &out)
     : m_interactive(out),
       m_session(dataFolder, {m_mainView, m_thinView, m_assortView, m_assortUserView, m_npvView,
-                             m_timberPricesView, m_economicsView, m_assortPricesView, m_estateView,
-                             m_interactive, m_clipboard}) {}
+                             m_timberPricesView, m_economicsView, m_assortPricesView,
+                             m_carbonPriceView, m_estateView, m_interactive, m_clipboard}) {}
 
 } // namespace arbolex::cli

@@ -6,6 +6,7 @@
 #include "assortments/headlessassortview.hpp"
 #include "cli/scripttarget.hpp"
 #include "economics/headlessassortpricesview.hpp"
+#include "economics/headlesscarbonpriceview.hpp"
 #include "economics/headlesstimberpricesview.hpp"
 #include "economics/ieconomicsview.hpp"
 #include "economics/inpvview.hpp"
@@ -75,6 +76,8 @@ public:
     economics::HeadlessEconomicsView &economicsView() { return m_economicsView; }
     economics::AssortPricesWindowLogic &assortPrices() { return m_session.assortPrices(); }
     economics::HeadlessAssortPricesView &assortPricesView() { return m_assortPricesView; }
+    economics::CarbonPriceWindowLogic &carbonPrice() { return m_session.carbonPrice(); }
+    economics::HeadlessCarbonPriceView &carbonPriceView() { return m_carbonPriceView; }
 
 private:
     PrintingInteractive m_interactive;
@@ -87,6 +90,7 @@ private:
     assortments::HeadlessAssortUserView m_assortUserView;
     economics::HeadlessEconomicsView m_economicsView;
     economics::HeadlessAssortPricesView m_assortPricesView;
+    economics::HeadlessCarbonPriceView m_carbonPriceView;
     estatewindow::HeadlessEstateView m_estateView;
     session::Session m_session;
 };

@@ -94,6 +94,9 @@ Command reportCommand() {
                 "valued the rotation in the economics window (press cmdEconomics or\n"
                 "frmEconomics.cmdCompute), a last page holds its figures, NPV, LEV and MAI\n"
                 "by rotation age and, once it ran the optimiser, the best regimes.\n"
+                "Once the rotation has a final cut, its carbon account follows: what it\n"
+                "is of, its totals, the constants with their sources, its chart and the\n"
+                "account year by year.\n"
                 "Nothing in the data folder is changed. Prints REPORT.pdf<TAB>N pages.\n"
                 "Exit status: 0 written, 1 the PDF cannot be written, 2 the command line,\n"
                 "the document or the script is wrong.\n"),

@@ -2,6 +2,7 @@
 
 #include "cli/assortpricescript.hpp"
 #include "cli/assortscript.hpp"
+#include "cli/carbonpricescript.hpp"
 #include "cli/documentscript.hpp"
 #include "cli/economicsscript.hpp"
 #include "cli/gridoutput.hpp"
@@ -262,6 +263,9 @@ QString ScriptRunner::set(const QString &control, const QString &text) {
     if (const auto asmtPrices = setAssortPricesControl(m_session, control, text)) {
         return *asmtPrices;
     }
+    if (const auto carbonPrice = setCarbonPriceControl(m_session, control, text)) {
+        return *carbonPrice;
+    }
     if (const auto thin = thinControl(control)) {
         if (!thinning::isThinField(*thin)) {
             return QStringLiteral("no field named '") + control + QLatin1Char('\'');
@@ -297,6 +301,9 @@ QString ScriptRunner::press(const QString &control) {
     }
     if (const auto asmtPrices = pressAssortPricesControl(m_session, control)) {
         return *asmtPrices;
+    }
+    if (const auto carbonPrice = pressCarbonPriceControl(m_session, control)) {
+        return *carbonPrice;
     }
     if (const auto thin = thinControl(control)) {
         if (!m_session.thinning().press(*thin)) {
@@ -336,6 +343,9 @@ QString ScriptRunner::print(const QString &control) {
     if (const auto asmtPrices = printAssortPricesControl(m_session, control, m_out)) {
         return *asmtPrices;
     }
+    if (const auto carbonPrice = printCarbonPriceControl(m_session, control, m_out)) {
+        return *carbonPrice;
+    }
     if (control == QLatin1String("flxMain")) {
         TextOutput text(Format::kTsv);
         text.table(gridTable(m_session.main().table(), true));
@@ -344,6 +354,14 @@ QString ScriptRunner::print(const QString &control) {
     }
     if (control == QLatin1String("flxSummary")) {
         m_out << shell::tabSeparated(m_session.main().summaryGrid());
+        return {};
+    }
+    if (control == QLatin1String("flxSummaryCarbon")) {
+        const workflow::CarbonSummary &carbon = m_session.main().summaryCarbon();
+        m_out << carbon.heading << '\n';
+        for (const auto &[caption, value] : carbon.figures) {
+            m_out << caption << '\t' << value << '\n';
+        }
         return {};
     }
     if (control == QLatin1String("clipboard")) {

@@ -11,7 +11,8 @@
 //   time LINE                runs LINE, then prints "TIME<TAB>LINE<TAB>ms", the windows drawn
 //   quit                     ends the desktop program once the script has run
 //   print flxMain | CONTROL  the grid (header row first) or the text of a control;
-//                            flxSummary, frmNPV.NPV_Grid and clipboard print tab-separated
+//                            flxSummary, frmNPV.NPV_Grid and clipboard print tab-separated;
+//                            flxSummaryCarbon the carbon block under the summary
 //   set frmNPV.NPV_Grid(ROW,COL) TEXT  types TEXT into a cell of the cash flow
 // A switched-off button cannot be pressed. `set CONTROL` alone empties the field.
 //   save FILE | open FILE | new | print caption   the File menu (cli/documentscript.hpp)

@@ -44,6 +44,7 @@ public:
     assortments::AssortUserLogic &assortUser() { return session().assortUser(); }
     economics::EconomicsWindowLogic &economics() { return session().economics(); }
     economics::AssortPricesWindowLogic &assortPrices() { return session().assortPrices(); }
+    economics::CarbonPriceWindowLogic &carbonPrice() { return session().carbonPrice(); }
     estatewindow::EstateWindowLogic &estate() { return session().estate(); }
 
     workflow::IMainView &mainView() { return session().views().main; }
@@ -54,6 +55,7 @@ public:
     assortments::IAssortUserView &assortUserView() { return session().views().assortUser; }
     economics::IEconomicsView &economicsView() { return session().views().economics; }
     economics::IAssortPricesView &assortPricesView() { return session().views().assortPrices; }
+    economics::ICarbonPriceView &carbonPriceView() { return session().views().carbonPrice; }
 };
 
 } // namespace arbolex::cli

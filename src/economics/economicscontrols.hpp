@@ -21,6 +21,7 @@ enum class EconomicsControl {
     txtRateLow,
     txtRateHigh,
     txtCostSpread,
+    txtCarbonSpread,
     // how the harvests are valued: by the mean tree's standing price or by assortments
     cboValuation,
     // what the window tells
@@ -38,6 +39,16 @@ enum class EconomicsControl {
     lblEconomic,
     lblMAI,
     lblYieldClass,
+    // timber and carbon side by side: the carbon money named, NPV and LEV of
+    // each and their total, and what carbon does to the economic rotation
+    lblCarbon,
+    lblNpvTimber,
+    lblNpvCarbon,
+    lblNpvTotal,
+    lblLevTimber,
+    lblLevCarbon,
+    lblLevTotal,
+    lblCarbonRotation,
     lblOptimiser,
     lblMonteCarlo,
     // commands

@@ -70,6 +70,13 @@ inline QString labelRateTo() {
 inline QString labelCostSpread() {
     return QStringLiteral("Cost spread (%):");
 }
+inline QString labelCarbonSpread() {
+    return QStringLiteral("Carbon price spread (%):");
+}
+inline QString hintCarbonSpread() {
+    return QStringLiteral("Standard deviation of the logarithm of the carbon price level, "
+                          "drawn only when carbon is paid.");
+}
 inline QString buttonCompute() {
     return QStringLiteral("Compute");
 }
@@ -148,6 +155,58 @@ inline QString figureNotes() {
 }
 inline QString figureYieldClass() {
     return QStringLiteral("Yield class");
+}
+
+// ---- Timber and carbon ------------------------------------------------------------------
+
+inline QString columnTimber() {
+    return QStringLiteral("Timber");
+}
+inline QString columnCarbon() {
+    return QStringLiteral("Carbon");
+}
+inline QString columnTotal() {
+    return QStringLiteral("Total");
+}
+inline QString rowNpv() {
+    return QStringLiteral("NPV");
+}
+inline QString rowLev() {
+    return QStringLiteral("LEV");
+}
+/// The carbon money named, over the side-by-side figures.
+inline QString carbonHeading(const QString &pricing) {
+    return QStringLiteral("Timber and ") + pricing;
+}
+inline QString carbonNotPaid() {
+    return QStringLiteral("not paid");
+}
+/// What paying carbon does to the economic rotation.
+inline QString carbonMovesRotation(const QString &pricing, int without, int with) {
+    return QStringLiteral("%1 moves the economic rotation from %2 to %3 years.")
+        .arg(pricing)
+        .arg(without)
+        .arg(with);
+}
+inline QString carbonKeepsRotation(const QString &pricing, int age) {
+    return QStringLiteral("%1 leaves the economic rotation at %2 years.").arg(pricing).arg(age);
+}
+inline QString carbonNotCounted() {
+    return QStringLiteral("Carbon is not paid: every figure is the timber's. Choose a payment "
+                          "in the carbon price window (Timber Prices → Carbon Price...).");
+}
+/// The side-by-side figures as one line each on the report's economics page.
+inline QString figureNpvSplit() {
+    return QStringLiteral("NPV: timber + carbon");
+}
+inline QString figureLevSplit() {
+    return QStringLiteral("LEV: timber + carbon");
+}
+inline QString figureCarbon() {
+    return QStringLiteral("Carbon");
+}
+inline QString markEconomicWithoutCarbon() {
+    return QStringLiteral("Timber alone");
 }
 inline QString noFigure() {
     return QStringLiteral("—");

@@ -3,6 +3,9 @@
 // away from the window's thread.
 #include "economics/economicswindowlogic.hpp"
 
+#include "carbon/carbonfile.hpp"
+#include "economics/carbonformat.hpp"
+#include "economics/carbonpricemessages.hpp"
 #include "economics/economicsformat.hpp"
 #include "economics/economicsmessages.hpp"
 #include "prices/prices.hpp"
@@ -20,6 +23,7 @@
 #include <cmath>
 #include <exception>
 #include <limits>
+#include <utility>
 
 namespace arbolex::economics {
 
@@ -54,7 +58,9 @@ QString pricesText(const rotation::Economics &e) {
 bool sameMoney(const rotation::Economics &a, const rotation::Economics &b) {
     return a.ratePercent == b.ratePercent && a.establishmentCost == b.establishmentCost &&
            a.annualCost == b.annualCost && a.entries == b.entries && a.prices == b.prices &&
-           a.valuation == b.valuation && a.assortmentPrices == b.assortmentPrices;
+           a.valuation == b.valuation && a.assortmentPrices == b.assortmentPrices &&
+           carbon::Settings{a.carbon, a.carbonParameters} ==
+               carbon::Settings{b.carbon, b.carbonParameters};
 }
 
 /// What the cash flow typed into the net present value window adds, for the
@@ -76,6 +82,11 @@ QString entriesText(const std::vector<rotation::CashFlowEntry> &entries) {
     return parts.isEmpty()
                ? QString()
                : QStringLiteral(" · the cash flow's ") + parts.join(QStringLiteral(" and "));
+}
+
+/// The carbon money, for the line of the money: "" when carbon is not paid.
+QString carbonText(const carbon::Pricing &pricing) {
+    return pricing.counts() ? QStringLiteral(" · ") + pricingText(pricing) : QString();
 }
 
 /// A cost as its field shows it.
@@ -173,6 +184,7 @@ void EconomicsWindowLogic::Form_Load() {
         fill(C::txtRateLow, percentText(draws.rateLow));
         fill(C::txtRateHigh, percentText(draws.rateHigh));
         fill(C::txtCostSpread, shell::generalNumber(draws.costSpread * 100.0));
+        fill(C::txtCarbonSpread, shell::generalNumber(draws.carbonSpread * 100.0));
         m_view.setEnabled(C::cmdCancel, false);
         m_view.setEnabled(C::cmdApply, !m_best.empty());
     });
@@ -185,7 +197,10 @@ bool EconomicsWindowLogic::readEconomics() {
         message(economicstext::faultRate(), C::txtInterestRate);
         return false;
     }
-    rotation::Economics e;
+    // The work's money (its cash flow's costs and other revenues, the
+    // long-term average prices, the carbon settings), at the rate and costs
+    // of the fields.
+    rotation::Economics e = m_standWork.economics();
     e.ratePercent = shell::val(rate);
     for (const C c : {C::txtEstablishmentCost, C::txtAnnualCost}) {
         const QString typed = m_view.text(c).trimmed();
@@ -195,20 +210,14 @@ bool EconomicsWindowLogic::readEconomics() {
         }
         (c == C::txtEstablishmentCost ? e.establishmentCost : e.annualCost) = shell::val(typed);
     }
-    // The costs and other revenues typed into the net present value window.
-    e.entries = m_standWork.cashFlowEntries();
-    // The cash flow's own prices: the long-term averages, as their absolute values.
-    prices::Prices longTerm;
-    longTerm.data() = m_standWork.prices().data();
-    longTerm.selectPriceSet(prices::kLongTermPrices);
-    e.prices = longTerm.pricesInUse();
-    // Or every harvest divided into the assortment report's classes and sold
-    // at the assortment prices.
+    // Every harvest at the standing price of its mean tree, or divided into
+    // the assortment report's classes and sold at the assortment prices.
     if (m_view.text(C::cboValuation)
             .trimmed()
             .startsWith(QStringLiteral("assortment"), Qt::CaseInsensitive)) {
         e.valuation = rotation::Valuation::kAssortments;
-        e.assortmentPrices = m_standWork.prices().data().assortmentPrices;
+    } else {
+        e.assortmentPrices = {};
     }
     // One interest rate for the program: the cash flow's; the costs are the work's.
     m_standWork.cashFlow().setInterestRate(e.ratePercent);
@@ -247,6 +256,7 @@ void EconomicsWindowLogic::clearFigures(const QString &why) {
     m_value.reset();
     m_yours.reset();
     m_explorer = {};
+    m_economicWithoutCarbon = 0;
     m_tornado.clear();
     m_monteCarlo.reset();
     for (int c = static_cast<int>(C::lblNPV); c <= static_cast<int>(C::lblMonteCarlo); ++c) {
@@ -283,6 +293,14 @@ void EconomicsWindowLogic::cmdCompute_Click() {
                 return;
             }
             m_explorer = rotation::exploreRotations(*m_path, m_table.regime, m_economics);
+            m_economicWithoutCarbon = 0;
+            if (m_economics.carbon.counts()) {
+                // The same explorer with the timber's money alone.
+                rotation::Economics timber = m_economics;
+                timber.carbon.payment = carbon::Payment::kNone;
+                m_economicWithoutCarbon =
+                    rotation::exploreRotations(*m_path, m_table.regime, timber).economicRotation;
+            }
             m_own = harvestsFromTable(m_standWork.table(), m_path->model, m_path->volumeRatio);
             if (m_own) {
                 valueTable();
@@ -365,7 +383,8 @@ void EconomicsWindowLogic::showFigures() {
                                    euroText(m_economics.establishmentCost) +
                                    QStringLiteral(" €/ha · annual cost ") +
                                    euroText(m_economics.annualCost) + QStringLiteral(" €/ha/yr") +
-                                   entriesText(m_economics.entries));
+                                   entriesText(m_economics.entries) +
+                                   carbonText(m_economics.carbon));
     m_view.setText(C::lblNPV, euroPerHaText(v.npv));
     m_view.setText(C::lblLEV, euroPerHaText(v.lev));
     m_view.setText(C::lblEAA, v.eaa ? euroText(*v.eaa) + QStringLiteral(" €/ha/yr")
@@ -404,7 +423,35 @@ void EconomicsWindowLogic::showFigures() {
     m_view.setText(C::lblYieldClass, v.yieldClass > 0
                                          ? QString::number(v.yieldClass)
                                          : QStringLiteral("not reached: the MAI still rises"));
+    showCarbon();
     m_view.figuresChanged();
+}
+
+void EconomicsWindowLogic::showCarbon() {
+    namespace et = economicstext;
+    const rotation::RotationValue &v = *m_value;
+    const carbon::Pricing &pricing = m_economics.carbon;
+    QString named = pricingText(pricing);
+    named[0] = named[0].toUpper();
+    m_view.setText(C::lblCarbon, et::carbonHeading(pricingText(pricing)));
+    const bool counts = pricing.counts();
+    const QString notCounted = carbontext::notCounted();
+    m_view.setText(C::lblNpvTimber, euroPerHaText(v.npvTimber));
+    m_view.setText(C::lblNpvCarbon, counts ? euroPerHaText(v.npvCarbon) : notCounted);
+    m_view.setText(C::lblNpvTotal, euroPerHaText(v.npv));
+    m_view.setText(C::lblLevTimber, euroPerHaText(v.levTimber));
+    m_view.setText(C::lblLevCarbon, counts ? euroPerHaText(v.levCarbon) : notCounted);
+    m_view.setText(C::lblLevTotal, euroPerHaText(v.lev));
+    QString rotationText;
+    if (!counts) {
+        rotationText = et::carbonNotCounted();
+    } else if (m_economicWithoutCarbon > 0 && m_explorer.economicRotation > 0) {
+        rotationText = m_economicWithoutCarbon == m_explorer.economicRotation
+                           ? et::carbonKeepsRotation(named, m_explorer.economicRotation)
+                           : et::carbonMovesRotation(named, m_economicWithoutCarbon,
+                                                     m_explorer.economicRotation);
+    }
+    m_view.setText(C::lblCarbonRotation, rotationText);
 }
 
 void EconomicsWindowLogic::cmdMonteCarlo_Click() {
@@ -427,14 +474,16 @@ void EconomicsWindowLogic::cmdMonteCarlo_Click() {
                 return;
             }
             s.seed = static_cast<std::uint64_t>(*seed);
-            for (const C c : {C::txtPriceSpread, C::txtCostSpread}) {
+            for (const auto &[c, spread] : {std::pair{C::txtPriceSpread, &s.priceSpread},
+                                            std::pair{C::txtCostSpread, &s.costSpread},
+                                            std::pair{C::txtCarbonSpread, &s.carbonSpread}}) {
                 const QString typed = m_view.text(c).trimmed();
                 const double percent = shell::val(typed);
                 if (!shell::isNumeric(typed) || percent < 0.0 || percent > 100.0) {
                     message(economicstext::faultSpread(), c);
                     return;
                 }
-                (c == C::txtPriceSpread ? s.priceSpread : s.costSpread) = percent / 100.0;
+                *spread = percent / 100.0;
             }
             const QString low = m_view.text(C::txtRateLow).trimmed();
             const QString high = m_view.text(C::txtRateHigh).trimmed();

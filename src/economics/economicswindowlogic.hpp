@@ -85,6 +85,9 @@ public:
     const rotation::Economics &economics() const { return m_economics; }
     const std::optional<rotation::RotationValue> &value() const { return m_value; }
     const rotation::RotationExplorer &explorer() const { return m_explorer; }
+    /// The economic rotation of the same explorer without carbon money,
+    /// years; 0 unless carbon is paid (or no LEV could be computed).
+    int economicRotationWithoutCarbon() const { return m_economicWithoutCarbon; }
     const std::vector<rotation::TornadoBar> &tornado() const { return m_tornado; }
     const std::optional<rotation::MonteCarloResult> &monteCarlo() const { return m_monteCarlo; }
     /// The optimiser's regimes, best first, and the user's own as it scores.
@@ -113,6 +116,9 @@ private:
     /// Values the regime felled at the economic rotation; false (the figures
     /// cleared) when that rotation cannot be valued.
     bool valueEconomicRotation();
+    /// Timber and carbon side by side, and what carbon does to the economic
+    /// rotation.
+    void showCarbon();
 
     work::StandWork &m_standWork;
     workflow::IMainCommands &m_main;
@@ -131,6 +137,7 @@ private:
     std::optional<rotation::RotationHarvests> m_own;
     std::optional<rotation::RotationValue> m_value;
     rotation::RotationExplorer m_explorer;
+    int m_economicWithoutCarbon = 0;
     std::vector<rotation::TornadoBar> m_tornado;
     std::optional<rotation::MonteCarloResult> m_monteCarlo;
 

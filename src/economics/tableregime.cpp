@@ -1,6 +1,8 @@
 #include "economics/tableregime.hpp"
 
+#include "engine/grow.hpp"
 #include "work/projectiontable.hpp"
+#include "work/standwork.hpp"
 
 #include <QLocale>
 
@@ -167,6 +169,18 @@ harvestsFromTable(const work::ProjectionTable &table, std::int16_t model,
         h.standing = standingByAge(shown);
     }
     return h;
+}
+
+std::optional<rotation::RotationValue> valueTableRotation(const work::StandWork &work,
+                                                          const rotation::Economics &economics) {
+    // The engine holds the model in use, whose volume-ratio function divides
+    // the harvests as the economics window's path does.
+    const engine::Grow &grow = work.grow();
+    const auto harvests = harvestsFromTable(work.table(), grow.modelId(), grow.volumeRatio());
+    if (!harvests) {
+        return std::nullopt;
+    }
+    return rotation::valueHarvests(*harvests, economics, rotation::Appraisal::kWithoutRates);
 }
 
 QString describeTableRotation(const rotation::RotationHarvests &h) {

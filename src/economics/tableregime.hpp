@@ -13,7 +13,8 @@
 
 namespace arbolex::work {
 class ProjectionTable;
-}
+class StandWork;
+} // namespace arbolex::work
 
 namespace arbolex::economics {
 
@@ -48,6 +49,13 @@ TableRegime regimeFromTable(const work::ProjectionTable &table);
 std::optional<rotation::RotationHarvests>
 harvestsFromTable(const work::ProjectionTable &table, std::int16_t model,
                   const engine::VolumeRatioCoefficients &volumeRatio);
+
+/// The rotation the work's table holds (harvestsFromTable, for the model in
+/// use), valued with `economics` as the economics window values it, without
+/// the searches of the rates (IRR, break-even); std::nullopt for a table
+/// without a final cut. Its carbon account and carbon money are the window's.
+std::optional<rotation::RotationValue> valueTableRotation(const work::StandWork &work,
+                                                          const rotation::Economics &economics);
 
 /// "Thinnings of 30 to 50 m³/ha at 20, 25 and 32 years; final cut at 45 years."
 QString describeTableRotation(const rotation::RotationHarvests &harvests);

@@ -25,7 +25,8 @@ constexpr std::array<const char *, kTimberPricesControlCount> kNames = {"txtTimb
                                                                         "lblNote_OVRA2",
                                                                         "cmdChangePrices",
                                                                         "cmdClosePricesList",
-                                                                        "cmdAssortPrices"};
+                                                                        "cmdAssortPrices",
+                                                                        "cmdCarbonPrice"};
 } // namespace
 
 int elementCount(TimberPricesControl control) {

@@ -32,10 +32,12 @@ enum class TimberPricesControl {
     cmdClosePricesList,
     /// Opens the assortment prices window.
     cmdAssortPrices,
+    /// Opens the carbon price window.
+    cmdCarbonPrice,
 };
 
 inline constexpr int kTimberPricesControlCount =
-    static_cast<int>(TimberPricesControl::cmdAssortPrices) + 1;
+    static_cast<int>(TimberPricesControl::cmdCarbonPrice) + 1;
 
 /// Price fields: four blocks of 13, one per list.
 inline constexpr int kPriceFieldCount = 52;

@@ -2,6 +2,8 @@
 
 #include "economics/assortpricesmessages.hpp"
 #include "economics/assortpriceswindowlogic.hpp"
+#include "economics/carbonpricemessages.hpp"
+#include "economics/carbonpricewindowlogic.hpp"
 #include "economics/pricefieldkeys.hpp"
 #include "economics/timberpricesmessages.hpp"
 #include "prices/pricelookup.hpp"
@@ -81,7 +83,8 @@ void TimberPricesWindowLogic::Form_Load() {
             {C::lblNote_OVRA1, text::lblNote_OVRA1()},
             {C::lblNote_OVRA2, text::lblNote_OVRA2()},
             {C::cmdClosePricesList, text::closePricesList()},
-            {C::cmdAssortPrices, text::assortPricesButton()}};
+            {C::cmdAssortPrices, text::assortPricesButton()},
+            {C::cmdCarbonPrice, carbontext::carbonPriceButton()}};
         for (const auto &[control, caption] : texts) {
             m_view.setText(single(control), caption);
         }
@@ -180,6 +183,14 @@ void TimberPricesWindowLogic::cmdAssortPrices_Click() {
     });
 }
 
+void TimberPricesWindowLogic::cmdCarbonPrice_Click() {
+    shell::guard(m_log, windowLabel("cmdCarbonPrice_Click"), [&] {
+        if (m_carbonPrice != nullptr) {
+            m_carbonPrice->show();
+        }
+    });
+}
+
 bool TimberPricesWindowLogic::txtTimbVal_KeyPress(int f, QChar key) const {
     if (!m_prices.priceChanges() || !isUserField(f)) {
         return false;
@@ -216,6 +227,9 @@ bool TimberPricesWindowLogic::press(TimberPricesControl control) {
         return true;
     case TimberPricesControl::cmdAssortPrices:
         cmdAssortPrices_Click();
+        return true;
+    case TimberPricesControl::cmdCarbonPrice:
+        cmdCarbonPrice_Click();
         return true;
     default:
         return false;

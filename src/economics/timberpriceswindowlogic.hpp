@@ -17,6 +17,7 @@ class ErrorLog;
 namespace arbolex::economics {
 
 class AssortPricesWindowLogic;
+class CarbonPriceWindowLogic;
 
 class TimberPricesWindowLogic {
 public:
@@ -41,6 +42,9 @@ public:
     /// Opens the assortment prices window, once one is attached.
     void cmdAssortPrices_Click();
     void attachAssortmentPrices(AssortPricesWindowLogic *window) { m_assortPrices = window; }
+    /// Opens the carbon price window, once one is attached.
+    void cmdCarbonPrice_Click();
+    void attachCarbonPrice(CarbonPriceWindowLogic *window) { m_carbonPrice = window; }
 
     /// Key filter of price field `field` (0 to 51); `key` is the typed
     /// character, '\b' for Backspace. Only the user fields (13 to 25) take
@@ -71,6 +75,7 @@ private:
     shell::ErrorLog &m_log;
     ITimberPricesView &m_view;
     AssortPricesWindowLogic *m_assortPrices = nullptr;
+    CarbonPriceWindowLogic *m_carbonPrice = nullptr;
 };
 
 } // namespace arbolex::economics

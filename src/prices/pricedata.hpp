@@ -1,5 +1,6 @@
 #pragma once
 
+#include "carbon/carbonfile.hpp"
 #include "rotation/assortmentprices.hpp"
 #include "rotation/priceclasses.hpp"
 
@@ -64,6 +65,13 @@ struct PriceData {
     rotation::AssortmentPriceList assortmentPrices{};
     /// Establishment and yearly cost a new work starts with ("Costs.qdm").
     CostDefaults costs;
+    /// The carbon price, its payment and the constants of the carbon account
+    /// ("Carbon.qdm").
+    carbon::Settings carbon = carbon::defaultSettings();
+    /// The carbon settings as the start-up read them (the defaults when the
+    /// file could not be read): the exit writes the file only when the
+    /// settings differ, so a file the program could not read stays as it is.
+    carbon::Settings carbonAtStart = carbon::defaultSettings();
 };
 
 /// Data file names, joined to the data folder.
@@ -75,6 +83,8 @@ inline constexpr const char *kUserAssortmentsFile = "UD_Assort.qdm";
 inline constexpr const char *kAssortmentPricesFile = "AssortPrices.qdm";
 /// Read only: the program never writes it.
 inline constexpr const char *kCostsFile = "Costs.qdm";
+/// Written at exit only when its settings were changed.
+inline constexpr const char *kCarbonFile = "Carbon.qdm";
 /// The files GetPricesFromFiles reads, in its order: it stops at the first
 /// one missing.
 inline constexpr const char *kFilesReadForPrices[] = {kCurrentPricesFile, kPrivatePricesFile,

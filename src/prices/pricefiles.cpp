@@ -1,6 +1,7 @@
 #include "prices/pricefiles.hpp"
 
 #include "prices/assortmentpricefile.hpp"
+#include "prices/carbonsettingsfile.hpp"
 #include "prices/costfile.hpp"
 #include "prices/pricedata.hpp"
 #include "prices/prices.hpp"
@@ -10,12 +11,16 @@
 
 #include <QDir>
 
+#include <iterator>
+#include <vector>
+
 namespace arbolex::prices {
 
 void readPriceFiles(const QString &dataFolder, Prices &prices, shell::ErrorLog &log) {
     GetPricesFromFiles(dataFolder, prices.data(), log);
     GetAssortmentPricesFromFile(dataFolder, prices.data(), log);
     GetCostsFromFile(dataFolder, prices.data(), log);
+    GetCarbonSettingsFromFile(dataFolder, prices.data(), log);
 }
 
 void rereadPriceFiles(const QString &dataFolder, Prices &prices, shell::ErrorLog &log) {
@@ -28,8 +33,16 @@ void rereadPriceFiles(const QString &dataFolder, Prices &prices, shell::ErrorLog
 void writePriceFilesAtExit(const QString &dataFolder, const Prices &prices,
                            const shell::DataHistory *history, const QString &label,
                            shell::ErrorLog &log) {
+    // The carbon file is written only when its settings changed: a file the
+    // start-up could not read stays for the user to mend.
+    const bool carbonChanged = carbonSettingsChanged(prices.data());
     if (history != nullptr) {
-        for (const char *name : kFilesWrittenAtExit) {
+        std::vector<const char *> kept(std::begin(kFilesWrittenAtExit),
+                                       std::end(kFilesWrittenAtExit));
+        if (carbonChanged) {
+            kept.push_back(kCarbonFile);
+        }
+        for (const char *name : kept) {
             shell::guard(log, label, [&] {
                 if (!history->keep(QDir(dataFolder).filePath(QLatin1String(name)))) {
                     shell::raiseAppFault(shell::RuntimeError::pathFileAccessError());
@@ -40,6 +53,9 @@ void writePriceFilesAtExit(const QString &dataFolder, const Prices &prices,
     WritePricesInFiles(3, dataFolder, prices.data(), log);
     WriteUserDefinedAssortmentsInFile(dataFolder, prices.data(), log);
     WriteAssortmentPricesInFile(dataFolder, prices.data(), log);
+    if (carbonChanged) {
+        WriteCarbonSettingsInFile(dataFolder, prices.data(), log);
+    }
 }
 
 } // namespace arbolex::prices

@@ -15,8 +15,8 @@ namespace arbolex::prices {
 
 class Prices;
 
-/// The price lists, categories, assortment prices and default costs from
-/// `dataFolder`.
+/// The price lists, categories, assortment prices, default costs and carbon
+/// settings from `dataFolder`.
 void readPriceFiles(const QString &dataFolder, Prices &prices, shell::ErrorLog &log);
 
 /// Forgets the prices and reads them from `dataFolder` again (after a file was
@@ -24,7 +24,8 @@ void readPriceFiles(const QString &dataFolder, Prices &prices, shell::ErrorLog &
 void rereadPriceFiles(const QString &dataFolder, Prices &prices, shell::ErrorLog &log);
 
 /// Writes the price lists, the user's categories and the assortment prices
-/// back to `dataFolder`, each file kept in `history` first (when there is one).
+/// back to `dataFolder`, and the carbon settings when the user changed them,
+/// each file kept in `history` first (when there is one).
 /// A failure is logged under `label` and the other files are still written.
 void writePriceFilesAtExit(const QString &dataFolder, const Prices &prices,
                            const shell::DataHistory *history, const QString &label,

@@ -32,6 +32,8 @@ namespace {
 constexpr std::array<QRgb, 6> kPalette = {0x1b6ca8, 0x2e8b57, 0xb8860b,
                                           0x8b3a3a, 0x6a4c93, 0x555555};
 constexpr QRgb kMarkColour = 0xc0392b;
+/// Entries a legend holds in its own type.
+constexpr std::size_t kRoomyLegend = 5;
 /// Room at the ends of a year axis for the half width of a bar, years.
 constexpr double kEndRoom = 0.4;
 /// Width of a line, of a marker's dashes, pixels.
@@ -83,12 +85,19 @@ QChart *newChart(const ChartData &data, ChartLook look) {
                                          "%2</span>")
                               .arg(data.title.toHtmlEscaped(), data.note.toHtmlEscaped()));
     chart->legend()->setAlignment(Qt::AlignBottom);
+    // A crowded legend in smaller type, so its names are not cut short.
+    const bool crowded = data.series.size() + data.markers.size() > kRoomyLegend;
     if (look == ChartLook::Report) {
         chart->setTitleFont(sized(12, true));
-        chart->legend()->setFont(sized(9));
+        chart->legend()->setFont(sized(crowded ? 8 : 9));
         chart->setMargins(QMargins(6, 6, 6, 6));
         chart->setBackgroundRoundness(0);
         return chart;
+    }
+    if (crowded) {
+        QFont small = chart->legend()->font();
+        small.setPointSizeF(small.pointSizeF() * 0.85);
+        chart->legend()->setFont(small);
     }
     QFont font = chart->titleFont();
     font.setBold(true);

@@ -132,6 +132,21 @@ QString reportHtml(const charts::ReportContent &content, const QString &printed)
     return styled(html);
 }
 
+CarbonHtml carbonHtml(const charts::CarbonPage &page) {
+    CarbonHtml html;
+    html.head = styled(QStringLiteral("<h2>%1</h2><table width=\"100%\" cellspacing=\"0\"><tr>"
+                                      "<td width=\"58%\">%2</td><td width=\"42%\"><b>%3</b>%4"
+                                      "</td></tr></table>")
+                           .arg(esc(page.title), factsHtml(page.identification),
+                                esc(page.totalsTitle), factsHtml(page.totals)));
+    html.constants = styled(QStringLiteral("<p><b>%1</b></p>").arg(esc(page.constantsTitle)) +
+                            tableHtml(page.constants));
+    html.yearly =
+        styled(QStringLiteral("<h2>%1</h2>").arg(esc(page.yearlyTitle)) + tableHtml(page.yearly) +
+               QStringLiteral("<p class=\"note\">%1</p>").arg(esc(page.yearlyNote)));
+    return html;
+}
+
 EconomicsHtml economicsHtml(const charts::EconomicsPage &page) {
     EconomicsHtml html;
     html.head =

@@ -24,6 +24,16 @@ struct EconomicsHtml {
 };
 EconomicsHtml economicsHtml(const charts::EconomicsPage &page);
 
+/// The text of the carbon page: the head (title, identification and totals)
+/// across the page, the constants beside the chart, and the account year by
+/// year on the pages after it.
+struct CarbonHtml {
+    QString head;
+    QString constants;
+    QString yearly;
+};
+CarbonHtml carbonHtml(const charts::CarbonPage &page);
+
 /// One table as HTML: the groups (when any) over the captions in the header,
 /// then the rows.
 QString tableHtml(const charts::ReportTable &table);

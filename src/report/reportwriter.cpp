@@ -31,6 +31,8 @@ constexpr qreal kMarginMm = 12.0;
 constexpr qreal kFiguresShare = 0.38;
 /// Space between the parts of the economics page, layout units.
 constexpr qreal kGap = 12.0;
+/// Share of the carbon page's width the constants take beside the chart.
+constexpr qreal kConstantsShare = 0.5;
 
 void paintFooter(QPainter &painter, const QRectF &page, const QString &left, int number,
                  int count) {
@@ -101,6 +103,22 @@ void paintEconomics(QPainter &painter, const QSizeF &body, const charts::Economi
     }
 }
 
+/// The carbon page: its head across the top, the constants with their
+/// sources on the left and the chart of the account beside them.
+void paintCarbon(QPainter &painter, const QSizeF &body, const charts::CarbonPage &page,
+                 const CarbonHtml &html) {
+    QTextDocument head;
+    layOut(head, html.head, body.width());
+    QTextDocument constants;
+    const qreal constantsWidth = body.width() * kConstantsShare;
+    layOut(constants, html.constants, constantsWidth);
+    const qreal top = head.size().height() + kGap;
+    drawAt(painter, head, QPointF(0.0, 0.0));
+    drawAt(painter, constants, QPointF(0.0, top));
+    paintChart(page.chart, painter,
+               QRectF(QPointF(constantsWidth + kGap, top), QPointF(body.width(), body.height())));
+}
+
 } // namespace
 
 int paintReport(QPagedPaintDevice &device, const charts::ReportContent &content,
@@ -127,8 +145,20 @@ int paintReport(QPagedPaintDevice &device, const charts::ReportContent &content,
         }
     }
     const int textPages = document.pageCount();
-    const int pages =
-        textPages + static_cast<int>(charts.size()) + (content.economics.has_value() ? 1 : 0);
+    // The carbon page, then its account year by year on pages of their own.
+    CarbonHtml carbon;
+    QTextDocument yearly;
+    int yearlyPages = 0;
+    if (content.carbon) {
+        carbon = carbonHtml(*content.carbon);
+        yearly.setDocumentMargin(0.0);
+        yearly.setPageSize(body);
+        yearly.setHtml(carbon.yearly);
+        yearlyPages = yearly.pageCount();
+    }
+    const int pages = textPages + static_cast<int>(charts.size()) +
+                      (content.economics.has_value() ? 1 : 0) +
+                      (content.carbon.has_value() ? 1 + yearlyPages : 0);
     const QString footer = footerText(content);
 
     for (int p = 0; p < textPages; ++p) {
@@ -146,10 +176,24 @@ int paintReport(QPagedPaintDevice &device, const charts::ReportContent &content,
         paintChart(*charts[c], painter, QRectF(QPointF(0.0, 0.0), body));
         paintFooter(painter, page, footer, textPages + static_cast<int>(c) + 1, pages);
     }
+    int number = textPages + static_cast<int>(charts.size());
     if (content.economics) {
         device.newPage();
         paintEconomics(painter, body, *content.economics);
-        paintFooter(painter, page, footer, pages, pages);
+        paintFooter(painter, page, footer, ++number, pages);
+    }
+    if (content.carbon) {
+        device.newPage();
+        paintCarbon(painter, body, *content.carbon, carbon);
+        paintFooter(painter, page, footer, ++number, pages);
+        for (int p = 0; p < yearlyPages; ++p) {
+            device.newPage();
+            painter.save();
+            painter.translate(0.0, -p * body.height());
+            yearly.drawContents(&painter, QRectF(QPointF(0.0, p * body.height()), body));
+            painter.restore();
+            paintFooter(painter, page, footer, ++number, pages);
+        }
     }
     painter.end();
     return pages;

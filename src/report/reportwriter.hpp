@@ -1,8 +1,9 @@
 #pragma once
 
 // The report on paper: the text pages (tables repeat their header on every
-// page) followed by one page per chart, drawn as vectors, and the economics
-// page when the rotation was valued, each page with a footer. The same
+// page) followed by one page per chart, drawn as vectors, the economics page
+// when the rotation was valued and the carbon account once the rotation has
+// a final cut, each page with a footer. The same
 // painting serves the PDF file and the printer.
 
 #include "charts/reportcontent.hpp"

@@ -13,10 +13,18 @@ Session::Session(const QString &dataFolder, const SessionViews &views)
       m_assortUser(m_prices.data(), m_assort.session(), views.assortUser, views.interactive),
       m_economics(m_work, m_main, views.economics, views.interactive),
       m_assortPrices(m_prices.data(), m_log, views.assortPrices, views.interactive),
+      m_carbonPrice(m_prices.data(), m_log, views.carbonPrice, views.interactive),
       m_documents(m_work, m_main, views.interactive, views.settings, views.documentDialogs),
       m_estate(m_work, m_main, m_documents, views.estate, views.interactive) {
     m_main.attachClipboard(&views.clipboard);
     m_timberPrices.attachAssortmentPrices(&m_assortPrices);
+    m_timberPrices.attachCarbonPrice(&m_carbonPrice);
+    // New carbon money: an open economics window values its rotation again.
+    m_carbonPrice.onChanged([this] {
+        if (m_views.economics.isShown()) {
+            m_economics.cmdCompute_Click();
+        }
+    });
     m_thin.attachAssortments(&m_assort);
 }
 

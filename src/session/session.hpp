@@ -9,6 +9,7 @@
 #include "assortments/assortwindowlogic.hpp"
 #include "document/documentcontroller.hpp"
 #include "economics/assortpriceswindowlogic.hpp"
+#include "economics/carbonpricewindowlogic.hpp"
 #include "economics/economicswindowlogic.hpp"
 #include "economics/npvwindowlogic.hpp"
 #include "economics/timberpriceswindowlogic.hpp"
@@ -43,6 +44,7 @@ struct SessionViews {
     economics::ITimberPricesView &timberPrices;
     economics::IEconomicsView &economics;
     economics::IAssortPricesView &assortPrices;
+    economics::ICarbonPriceView &carbonPrice;
     estatewindow::IEstateView &estate;
     shell::IInteractive &interactive;
     shell::IClipboard &clipboard;
@@ -77,6 +79,7 @@ public:
     assortments::AssortUserLogic &assortUser() { return m_assortUser; }
     economics::EconomicsWindowLogic &economics() { return m_economics; }
     economics::AssortPricesWindowLogic &assortPrices() { return m_assortPrices; }
+    economics::CarbonPriceWindowLogic &carbonPrice() { return m_carbonPrice; }
     document::DocumentController &documents() { return m_documents; }
     estatewindow::EstateWindowLogic &estate() { return m_estate; }
 
@@ -104,6 +107,7 @@ private:
     assortments::AssortUserLogic m_assortUser;
     economics::EconomicsWindowLogic m_economics;
     economics::AssortPricesWindowLogic m_assortPrices;
+    economics::CarbonPriceWindowLogic m_carbonPrice;
     document::DocumentController m_documents;
     estatewindow::EstateWindowLogic m_estate;
 };

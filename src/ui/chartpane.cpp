@@ -57,7 +57,7 @@ void ChartPane::refresh() {
     }
     m_stale = false;
     const charts::RotationCharts drawn = charts::rotationCharts(m_logic->work());
-    m_panel->showCharts(drawn.stand, drawn.increments, drawn.cashFlow);
+    m_panel->showCharts(drawn);
 }
 
 void ChartPane::showEvent(QShowEvent *event) {

@@ -29,15 +29,36 @@ QString tabCaption(ChartPanel::Chart chart) {
         return charts::text::titleStand();
     case ChartPanel::kIncrements:
         return charts::text::titleIncrements();
+    case ChartPanel::kCarbon:
+        return charts::text::titleCarbon();
     default:
         return charts::text::titleCashFlow();
     }
 }
 
+QString tabLabel(ChartPanel::Chart chart) {
+    switch (chart) {
+    case ChartPanel::kStand:
+        return charts::text::tabStand();
+    case ChartPanel::kIncrements:
+        return charts::text::tabIncrements();
+    case ChartPanel::kCarbon:
+        return charts::text::tabCarbon();
+    default:
+        return charts::text::tabCashFlow();
+    }
+}
+
 /// What an empty tab says.
 QString emptyText(ChartPanel::Chart chart) {
-    return chart == ChartPanel::kCashFlow ? charts::text::emptyCashFlow()
-                                          : charts::text::emptyStand();
+    switch (chart) {
+    case ChartPanel::kCashFlow:
+        return charts::text::emptyCashFlow();
+    case ChartPanel::kCarbon:
+        return charts::text::emptyCarbon();
+    default:
+        return charts::text::emptyStand();
+    }
 }
 
 std::size_t slot(ChartPanel::Chart chart) {
@@ -68,7 +89,7 @@ ChartPanel::ChartPanel(QWidget *parent) : QWidget(parent) {
         stack->addWidget(view);
         m_views.at(slot(chart)) = view;
         m_empty.at(slot(chart)) = empty;
-        m_tabs->addTab(page, tabCaption(chart));
+        m_tabs->addTab(page, tabLabel(chart));
     }
     layout->addWidget(m_tabs, 1);
 
@@ -92,9 +113,8 @@ ChartPanel::ChartPanel(QWidget *parent) : QWidget(parent) {
     });
 }
 
-void ChartPanel::showCharts(const charts::ChartData &stand, const charts::ChartData &increments,
-                            const charts::ChartData &cashFlow) {
-    m_data = {stand, increments, cashFlow};
+void ChartPanel::showCharts(const charts::RotationCharts &drawn) {
+    m_data = {drawn.stand, drawn.increments, drawn.cashFlow, drawn.carbon};
     m_drawn.fill(false);
     draw(current());
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "charts/chartdata.hpp"
+#include "charts/reportcontent.hpp"
 
 #include <QWidget>
 
@@ -15,19 +16,18 @@ class QTabWidget;
 namespace arbolex::ui {
 
 /// The charts beside the projection table, one tab each: stand development,
-/// increments and cash flow. Values show on hover; the chart in view exports
+/// increments, cash flow and carbon. Values show on hover; the chart in view exports
 /// to PNG and SVG.
 class ChartPanel : public QWidget {
     Q_OBJECT
 public:
-    enum Chart : int { kStand = 0, kIncrements = 1, kCashFlow = 2, kChartCount = 3 };
+    enum Chart : int { kStand = 0, kIncrements = 1, kCashFlow = 2, kCarbon = 3, kChartCount = 4 };
 
     explicit ChartPanel(QWidget *parent = nullptr);
 
-    /// Takes the three charts' data and draws the chart in view; the others
-    /// are drawn when their tab is first shown.
-    void showCharts(const charts::ChartData &stand, const charts::ChartData &increments,
-                    const charts::ChartData &cashFlow);
+    /// Takes the charts' data and draws the chart in view; the others are
+    /// drawn when their tab is first shown.
+    void showCharts(const charts::RotationCharts &drawn);
     const charts::ChartData &data(Chart chart) const;
     QChartView *view(Chart chart) const;
     QTabWidget *tabs() const { return m_tabs; }

@@ -35,9 +35,10 @@ Desktop::Desktop(const QString &dataFolder, const QString &programFolder,
       m_documentMenu(m_window.fileMenu(), &m_window),
       // Copies of the data files the exit writes over, in the user's data location.
       m_history(shell::DataHistory::folderIn(shell::programDataPlaces(programFolder).userFolder)),
-      m_session(dataFolder, {m_window, m_thinWindow, m_assortWindow, m_assortUserWindow,
-                             m_npvWindow, m_pricesWindow, m_economicsWindow, m_assortPricesWindow,
-                             m_estateWindow, m_asking, m_clipboard, m_settings, &m_documentMenu}) {
+      m_session(dataFolder,
+                {m_window, m_thinWindow, m_assortWindow, m_assortUserWindow, m_npvWindow,
+                 m_pricesWindow, m_economicsWindow, m_assortPricesWindow, m_carbonPriceWindow,
+                 m_estateWindow, m_asking, m_clipboard, m_settings, &m_documentMenu}) {
     session::Session &s = m_session;
     m_interactive.setParentWidget(&m_window);
     m_window.attach(s.main(), *m_settings);
@@ -51,6 +52,7 @@ Desktop::Desktop(const QString &dataFolder, const QString &programFolder,
     m_economicsWindow.attach(s.economics());
     m_window.reportMenu()->attachEconomics(s.economics());
     m_assortPricesWindow.attach(s.assortPrices());
+    m_carbonPriceWindow.attach(s.carbonPrice());
     m_estateWindow.attach(s.estate());
     // The charts beside the table follow the cash flow typed in its window.
     QObject::connect(&s.work(), &work::StandWork::cashFlowChanged, &m_window,
@@ -109,8 +111,8 @@ QString Desktop::show(const QString &window, const QString &page) {
         return pages.indexOf(page);
     };
     if (window == QLatin1String("charts")) {
-        const auto chart = pick(
-            {QStringLiteral("stand"), QStringLiteral("increments"), QStringLiteral("cashflow")});
+        const auto chart = pick({QStringLiteral("stand"), QStringLiteral("increments"),
+                                 QStringLiteral("cashflow"), QStringLiteral("carbon")});
         if (chart >= 0) {
             m_window.chartPane()->panel()->setCurrent(static_cast<ChartPanel::Chart>(chart));
             return {};

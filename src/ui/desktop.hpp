@@ -12,6 +12,7 @@
 #include "ui/assortpriceswindow.hpp"
 #include "ui/assortuserwindow.hpp"
 #include "ui/assortwindow.hpp"
+#include "ui/carbonpricewindow.hpp"
 #include "ui/documentmenu.hpp"
 #include "ui/economicswindow.hpp"
 #include "ui/estatewindow.hpp"
@@ -63,7 +64,7 @@ public:
     void waitForWork() override;
     void settle() override;
     void quitAfterScript() override { m_quitAfterScript = true; }
-    /// "charts stand|increments|cashflow", "frmEconomics rotation|optimiser|
+    /// "charts stand|increments|cashflow|carbon", "frmEconomics rotation|optimiser|
     /// sensitivity|montecarlo", "frmEstate table|chart|closed".
     QString show(const QString &window, const QString &page) override;
 
@@ -75,6 +76,7 @@ public:
     AssortUserWindow &assortUserWindow() { return m_assortUserWindow; }
     EconomicsWindow &economicsWindow() { return m_economicsWindow; }
     AssortPricesWindow &assortPricesWindow() { return m_assortPricesWindow; }
+    CarbonPriceWindow &carbonPriceWindow() { return m_carbonPriceWindow; }
     EstateWindow &estateWindow() { return m_estateWindow; }
     QSettings &settings() { return *m_settings; }
 
@@ -92,6 +94,7 @@ private:
     AssortUserWindow m_assortUserWindow{&m_window};
     EconomicsWindow m_economicsWindow{&m_window};
     AssortPricesWindow m_assortPricesWindow{&m_window};
+    CarbonPriceWindow m_carbonPriceWindow{&m_window};
     EstateWindow m_estateWindow{&m_window};
     DocumentMenu m_documentMenu;
     shell::DataHistory m_history;

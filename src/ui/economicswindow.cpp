@@ -14,6 +14,7 @@
 #include <QChartView>
 #include <QComboBox>
 #include <QFormLayout>
+#include <QGridLayout>
 #include <QGroupBox>
 #include <QHBoxLayout>
 #include <QHeaderView>
@@ -119,7 +120,7 @@ EconomicsWindow::EconomicsWindow(QWidget *main) : QDialog(main) {
         });
     }
     for (const C c : {C::txtDraws, C::txtSeed, C::txtPriceSpread, C::txtRateLow, C::txtRateHigh,
-                      C::txtCostSpread}) {
+                      C::txtCostSpread, C::txtCarbonSpread}) {
         connect(qobject_cast<QLineEdit *>(control(c)), &QLineEdit::returnPressed, this, [this] {
             if (m_logic != nullptr) {
                 m_logic->cmdMonteCarlo_Click();
@@ -165,6 +166,7 @@ QWidget *EconomicsWindow::buildRotationTab() {
         }
         form->addRow(new QLabel(caption + QLatin1Char(':')), value);
     }
+    form->addRow(buildCarbonFigures());
     auto *notes = new QLabel(et::figureNotes());
     notes->setWordWrap(true);
     notes->setStyleSheet(QStringLiteral("color: #4a4a4a;"));
@@ -174,6 +176,49 @@ QWidget *EconomicsWindow::buildRotationTab() {
     m_rotationChart = chartView(tab);
     row->addWidget(m_rotationChart, 1);
     return tab;
+}
+
+QWidget *EconomicsWindow::buildCarbonFigures() {
+    auto *box = new QWidget;
+    auto *grid = new QGridLayout(box);
+    grid->setContentsMargins(0, 8, 0, 4);
+    grid->setHorizontalSpacing(14);
+    grid->setVerticalSpacing(5);
+    QLabel *heading = label(C::lblCarbon);
+    QFont bold = heading->font();
+    bold.setBold(true);
+    heading->setFont(bold);
+    heading->setWordWrap(true);
+    grid->addWidget(heading, 0, 0, 1, 4);
+    const QString columns[] = {et::columnTimber(), et::columnCarbon(), et::columnTotal()};
+    for (int c = 0; c < 3; ++c) {
+        auto *caption = new QLabel(columns[c]);
+        caption->setStyleSheet(QStringLiteral("color: #4a4a4a;"));
+        grid->addWidget(caption, 1, c + 1, Qt::AlignRight);
+    }
+    const std::pair<QString, std::array<C, 3>> rows[] = {
+        {et::rowNpv(), {C::lblNpvTimber, C::lblNpvCarbon, C::lblNpvTotal}},
+        {et::rowLev(), {C::lblLevTimber, C::lblLevCarbon, C::lblLevTotal}}};
+    int r = 2;
+    for (const auto &[caption, values] : rows) {
+        grid->addWidget(new QLabel(caption + QLatin1Char(':')), r, 0);
+        for (int c = 0; c < 3; ++c) {
+            QLabel *value = label(values.at(static_cast<std::size_t>(c)));
+            value->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
+            if (c == 2) {
+                value->setFont(bold);
+            }
+            grid->addWidget(value, r, c + 1);
+        }
+        ++r;
+    }
+    grid->setColumnStretch(1, 1);
+    grid->setColumnStretch(2, 1);
+    grid->setColumnStretch(3, 1);
+    QLabel *moves = label(C::lblCarbonRotation);
+    moves->setWordWrap(true);
+    grid->addWidget(moves, r, 0, 1, 4);
+    return box;
 }
 
 QWidget *EconomicsWindow::buildOptimiserTab() {
@@ -249,7 +294,9 @@ QWidget *EconomicsWindow::buildMonteCarloTab() {
                                     {et::labelPriceSpread(), field(C::txtPriceSpread, 4)},
                                     {et::labelRateFrom(), field(C::txtRateLow, 5)},
                                     {et::labelRateTo(), field(C::txtRateHigh, 5)},
-                                    {et::labelCostSpread(), field(C::txtCostSpread, 4)}});
+                                    {et::labelCostSpread(), field(C::txtCostSpread, 4)},
+                                    {et::labelCarbonSpread(), field(C::txtCarbonSpread, 4)}});
+    control(C::txtCarbonSpread)->setToolTip(et::hintCarbonSpread());
     inputs->addWidget(button(C::cmdMonteCarlo, et::buttonRun()));
     inputs->addStretch(1);
     column->addLayout(inputs);

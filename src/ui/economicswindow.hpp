@@ -61,6 +61,8 @@ public:
 
 private:
     QWidget *buildRotationTab();
+    /// Timber and carbon side by side, under the figures of the rotation tab.
+    QWidget *buildCarbonFigures();
     QWidget *buildOptimiserTab();
     QWidget *buildSensitivityTab();
     QWidget *buildMonteCarloTab();

@@ -108,7 +108,19 @@ MainWindow::MainWindow(QWidget *parent) : QMainWindow(parent) {
     buildSummaryGrid();
     m_tables = new QStackedWidget(this);
     m_tables->addWidget(m_grid);
-    m_tables->addWidget(m_summaryGrid);
+    // The summary with its carbon block under it.
+    m_summaryPage = new QWidget(this);
+    auto *summaryColumn = new QVBoxLayout(m_summaryPage);
+    summaryColumn->setContentsMargins(0, 0, 0, 0);
+    summaryColumn->setSpacing(6);
+    summaryColumn->addWidget(m_summaryGrid, 1);
+    m_summaryCarbon = new QLabel(m_summaryPage);
+    m_summaryCarbon->setObjectName(QStringLiteral("flxSummaryCarbon"));
+    m_summaryCarbon->setTextFormat(Qt::RichText);
+    m_summaryCarbon->setTextInteractionFlags(Qt::TextSelectableByMouse);
+    m_summaryCarbon->setContentsMargins(4, 2, 4, 4);
+    summaryColumn->addWidget(m_summaryCarbon);
+    m_tables->addWidget(m_summaryPage);
     // The charts beside the table; the splitter sets their share of the width.
     auto *beside = new QSplitter(Qt::Horizontal, this);
     beside->setChildrenCollapsible(false);
@@ -498,11 +510,33 @@ void MainWindow::showSummary(bool summary) {
     if (summary) {
         fitSummary();
     }
-    m_tables->setCurrentWidget(summary ? m_summaryGrid : m_grid);
+    m_tables->setCurrentWidget(summary ? m_summaryPage : m_grid);
+}
+
+void MainWindow::showSummaryCarbon() {
+    const workflow::CarbonSummary &carbon = m_logic->summaryCarbon();
+    m_summaryCarbon->setVisible(!carbon.empty());
+    if (carbon.empty()) {
+        return;
+    }
+    // The captions over their values, one column each, as the summary reads.
+    QString captions;
+    QString values;
+    for (const auto &[caption, value] : carbon.figures) {
+        captions += QStringLiteral("<td style=\"padding: 2px 14px 2px 0\">") +
+                    caption.toHtmlEscaped() + QStringLiteral("</td>");
+        values += QStringLiteral("<td style=\"padding: 2px 14px 2px 0\"><b>") +
+                  value.toHtmlEscaped() + QStringLiteral("</b></td>");
+    }
+    m_summaryCarbon->setText(QStringLiteral("<b>") + carbon.heading.toHtmlEscaped() +
+                             QStringLiteral("</b><table style=\"margin-top: 4px\"><tr>") +
+                             captions + QStringLiteral("</tr><tr>") + values +
+                             QStringLiteral("</tr></table>"));
 }
 
 void MainWindow::fitSummary() {
     m_summaryModel->refresh();
+    showSummaryCarbon();
     // The rotation's totals stand out below the rows it copied.
     m_summaryModel->setBoldFrom(m_logic->summaryTotalsFrom());
     const QFontMetrics metrics = m_summaryGrid->horizontalHeader()->fontMetrics();

@@ -105,6 +105,8 @@ private:
     void buildSummaryGrid();
     /// Reads the summary again and sizes its columns to captions and values.
     void fitSummary();
+    /// The carbon block under the summary, as its logic last filled it.
+    void showSummaryCarbon();
     QLineEdit *addField(workflow::MainControl control);
     QLabel *addResult(workflow::MainControl control);
     QPushButton *addButton(workflow::MainControl control, const QString &caption);
@@ -135,6 +137,8 @@ private:
     QTableView *m_grid = nullptr;
     ProjectionModel *m_model = nullptr;
     QTableView *m_summaryGrid = nullptr;
+    QWidget *m_summaryPage = nullptr;
+    QLabel *m_summaryCarbon = nullptr;
     StringGridModel *m_summaryModel = nullptr;
     QStackedWidget *m_tables = nullptr;
     /// Set while the grid follows the logic, so the change is not sent back.

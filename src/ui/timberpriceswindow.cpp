@@ -221,11 +221,14 @@ QLayout *TimberPricesWindow::buildCommands() {
         return button;
     };
     QPushButton *assortPrices = add(TimberPricesControl::cmdAssortPrices);
+    QPushButton *carbonPrice = add(TimberPricesControl::cmdCarbonPrice);
     row->addStretch(1);
     QPushButton *change = add(TimberPricesControl::cmdChangePrices);
     QPushButton *closeList = add(TimberPricesControl::cmdClosePricesList);
     connect(assortPrices, &QPushButton::clicked, this,
             [this] { run(&TimberPricesWindowLogic::cmdAssortPrices_Click); });
+    connect(carbonPrice, &QPushButton::clicked, this,
+            [this] { run(&TimberPricesWindowLogic::cmdCarbonPrice_Click); });
     connect(change, &QPushButton::clicked, this,
             [this] { run(&TimberPricesWindowLogic::cmdChangePrices_Click); });
     connect(closeList, &QPushButton::clicked, this,

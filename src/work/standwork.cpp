@@ -217,6 +217,23 @@ void StandWork::setCosts(double establishment, double annual) {
     emit changed();
 }
 
+rotation::Economics StandWork::economics() const {
+    rotation::Economics e;
+    e.ratePercent = m_cashFlow.interestRate();
+    e.establishmentCost = m_establishmentCost;
+    e.annualCost = m_annualCost;
+    e.entries = cashFlowEntries();
+    // The cash flow's own prices: the long-term averages, as their absolute values.
+    prices::Prices longTerm;
+    longTerm.data() = m_prices.data();
+    longTerm.selectPriceSet(prices::kLongTermPrices);
+    e.prices = longTerm.pricesInUse();
+    e.assortmentPrices = m_prices.data().assortmentPrices;
+    e.carbon = m_prices.data().carbon.pricing;
+    e.carbonParameters = m_prices.data().carbon.parameters;
+    return e;
+}
+
 double StandWork::defaultEstablishmentCost() const {
     return m_prices.data().costs.establishment;
 }

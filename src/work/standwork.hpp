@@ -54,6 +54,7 @@ public:
     StandWork(engine::Grow &grow, prices::Prices &prices, shell::ErrorLog &log);
 
     engine::Grow &grow() { return m_grow; }
+    const engine::Grow &grow() const { return m_grow; }
     prices::Prices &prices() { return m_prices; }
     shell::ErrorLog &errorLog() { return m_log; }
 
@@ -164,6 +165,13 @@ public:
     double defaultAnnualCost() const;
     /// Puts the costs back to the data folder's.
     void resetCosts();
+
+    /// What the money of the work is counted with: the cash flow's interest
+    /// rate, the work's costs and the costs and other revenues typed into the
+    /// cash flow, the long-term average prices (as their absolute values) for
+    /// the mean tree, and the carbon price, payment and constants of the data
+    /// folder ("Carbon.qdm"). The economics window reads its own fields over it.
+    rotation::Economics economics() const;
 
     // ---- The sub-compartment as a document -------------------------------------------------
 

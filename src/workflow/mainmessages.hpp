@@ -145,6 +145,29 @@ inline QString standProjections() {
 inline QString summary() {
     return QStringLiteral("Summary");
 }
+/// Heading of the summary's carbon block, naming the carbon money.
+inline QString summaryCarbonHeading(const QString &pricing) {
+    return QStringLiteral("Carbon, t CO\u2082e/ha \u00b7 ") + pricing;
+}
+inline QString summaryCarbonAtFinalCut() {
+    return QStringLiteral("Stock at the final cut (trees, before felling)");
+}
+inline QString summaryCarbonAverage() {
+    return QStringLiteral("Long-term average stock");
+}
+inline QString summaryCarbonNetRemoval() {
+    return QStringLiteral("Total net removal");
+}
+inline QString summaryCarbonUnits() {
+    return QStringLiteral("Units issued");
+}
+inline QString summaryCarbonNpv() {
+    return QStringLiteral("Carbon revenue NPV");
+}
+/// Before a final cut: the stock of the last stand.
+inline QString summaryCarbonInTrees(int age) {
+    return QStringLiteral("In the trees at %1 years (no final cut yet)").arg(age);
+}
 inline QString gotoStandProjections() {
     return QStringLiteral("GoTo Stand Projections");
 }

@@ -117,6 +117,8 @@ public:
     std::vector<QStringList> summaryGrid() const { return m_summary.grid(); }
     QStringList summaryGroups() const { return m_summary.groups(); }
     bool showingSummary() const { return m_summary.showing(); }
+    /// The carbon block under the summary, as last filled.
+    const CarbonSummary &summaryCarbon() const { return m_summary.carbon(); }
 
     /// The clipboard that the copy commands fill.
     void attachClipboard(shell::IClipboard *clipboard) { m_clipboard = clipboard; }

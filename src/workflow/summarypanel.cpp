@@ -1,8 +1,14 @@
 #include "workflow/summarypanel.hpp"
 
+#include "carbon/account.hpp"
+#include "economics/tableregime.hpp"
+#include "engine/grow.hpp"
+#include "engine/modeldescription.hpp"
 #include "shell/apperror.hpp"
 #include "shell/interactive.hpp"
 #include "workflow/mainmessages.hpp"
+
+#include <cmath>
 
 namespace arbolex::workflow {
 
@@ -18,6 +24,7 @@ bool SummaryPanel::fill() {
             return;
         }
         m_summary = {};
+        m_carbon = {};
         show(true);
         const auto summary = m_work.summary();
         if (!summary) {
@@ -25,10 +32,25 @@ bool SummaryPanel::fill() {
             return;
         }
         m_summary = *summary;
+        fillCarbon();
         filled = true;
     });
     m_view.tableChanged(1);
     return filled;
+}
+
+void SummaryPanel::fillCarbon() {
+    // The rotation as the economics window values it, with the work's money.
+    const rotation::Economics money = m_work.economics();
+    std::optional<std::pair<int, double>> lastStand;
+    if (const int last = m_work.lastStandRow(); last > 0) {
+        const work::RowRecord &r = m_work.table().row(last).record;
+        const carbon::Parameters &p = money.carbonParameters;
+        lastStand = {static_cast<int>(std::lround(r.age)),
+                     carbon::liveTrees(
+                         r.volume, p.gravityOf(engine::speciesCode(m_work.grow().modelId())), p)};
+    }
+    m_carbon = carbonSummary(economics::valueTableRotation(m_work, money), money, lastStand);
 }
 
 void SummaryPanel::toggle() {

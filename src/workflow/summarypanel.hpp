@@ -4,6 +4,7 @@
 // shown in place of the projection table, and toggled with it.
 
 #include "work/standwork.hpp"
+#include "workflow/carbonsummary.hpp"
 #include "workflow/imainview.hpp"
 
 #include <QStringList>
@@ -37,12 +38,17 @@ public:
     std::vector<QStringList> grid() const { return m_work.summaryGrid(m_summary); }
     /// The group above each column of the summary ("Thinning" …).
     QStringList groups() const { return m_work.summaryGroups(); }
+    /// The carbon block under the summary, as last filled.
+    const CarbonSummary &carbon() const { return m_carbon; }
 
 private:
+    void fillCarbon();
+
     work::StandWork &m_work;
     IMainView &m_view;
     shell::IInteractive &m_interactive;
     work::Summary m_summary;
+    CarbonSummary m_carbon;
     bool m_showing = false;
 };
 

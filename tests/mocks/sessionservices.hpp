@@ -8,6 +8,7 @@
 
 #include "assortments/headlessassortview.hpp"
 #include "economics/headlessassortpricesview.hpp"
+#include "economics/headlesscarbonpriceview.hpp"
 #include "economics/headlesstimberpricesview.hpp"
 #include "economics/ieconomicsview.hpp"
 #include "economics/inpvview.hpp"
@@ -37,11 +38,13 @@ struct SessionServices {
     economics::HeadlessTimberPricesView pricesView;
     economics::HeadlessEconomicsView economicsView;
     economics::HeadlessAssortPricesView assortPricesView;
+    economics::HeadlessCarbonPriceView carbonPriceView;
     estatewindow::HeadlessEstateView estateView;
     shell::HeadlessClipboard clipboard;
     session::Session session{dataFolder,
                              {view, thinView, assortView, userView, npvView, pricesView,
-                              economicsView, assortPricesView, estateView, interactive, clipboard}};
+                              economicsView, assortPricesView, carbonPriceView, estateView,
+                              interactive, clipboard}};
     shell::ErrorLog &log = session.errorLog();
     engine::Grow &grow = session.grow();
     prices::Prices &prices = session.prices();

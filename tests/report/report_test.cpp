@@ -108,11 +108,15 @@ TEST_F(ReportTest, EconomicsPageOnlyWhileTheEconomicsWindowShowsTheTablesFigures
     const charts::EconomicsPage &page = *content.economics;
     EXPECT_EQ(page.title, QStringLiteral("Economics of the rotation at 5.00 % a year"));
     // The figures as the window shows them, in its order.
-    ASSERT_EQ(page.figures.size(), 11U);
+    // The figures as the window shows them, in its order, then timber and carbon.
+    const std::size_t valueFigures = economics::valueFigures().size();
+    ASSERT_EQ(page.figures.size(), valueFigures + 3);
     EXPECT_EQ(page.figures.front().first, economics::economicstext::figureNpv());
     EXPECT_EQ(page.figures.front().second, economicsView.text(economics::EconomicsControl::lblNPV));
-    EXPECT_EQ(page.figures.back().second,
+    EXPECT_EQ(page.figures[valueFigures - 1].second,
               economicsView.text(economics::EconomicsControl::lblYieldClass));
+    EXPECT_EQ(page.figures.back().second,
+              economicsView.text(economics::EconomicsControl::lblCarbonRotation));
     EXPECT_FALSE(page.rotations.empty());
     EXPECT_TRUE(page.regimes.empty()) << "the optimiser has not run";
 
@@ -272,15 +276,30 @@ TEST_F(ReportCommandTest, ScriptThatValuedTheRotationAddsTheEconomicsPage) {
     const int pages = pdfPages(valued);
     ASSERT_EQ(pages, pdfPages(plain) + 1);
     EXPECT_FALSE(pdfText(plain, 1, pdfPages(plain)).contains(QStringLiteral("Economics of")));
-    const QString last = pdfText(valued, pages, pages);
+    // The economics page follows the charts; the carbon account of the felled
+    // rotation comes after it, in both reports.
+    int economicsPage = 0;
+    for (int p = 1; p <= pages && economicsPage == 0; ++p) {
+        if (pdfText(valued, p, p).contains(QStringLiteral("Economics of the rotation at"))) {
+            economicsPage = p;
+        }
+    }
+    ASSERT_GT(economicsPage, 0);
+    const QString shownPage = pdfText(valued, economicsPage, economicsPage);
+    for (const QString &shown : {QStringLiteral("Economics of the rotation at 3.00 % a year"),
+                                 QStringLiteral("Land expectation value"),
+                                 QStringLiteral("NPV, LEV and MAI by rotation age"),
+                                 QStringLiteral("regimes of the largest LEV at 3.00 % a year"),
+                                 economics::economicstext::regimeYours(),
+                                 QStringLiteral("Page %1 of %2").arg(economicsPage).arg(pages)}) {
+        EXPECT_TRUE(shownPage.contains(shown)) << shown.toStdString() << " not in\n"
+                                               << shownPage.toStdString();
+    }
+    const QString carbon = pdfText(valued, economicsPage + 1, pages);
     for (const QString &shown :
-         {QStringLiteral("Economics of the rotation at 3.00 % a year"),
-          QStringLiteral("Land expectation value"),
-          QStringLiteral("NPV, LEV and MAI by rotation age"),
-          QStringLiteral("regimes of the largest LEV at 3.00 % a year"),
-          economics::economicstext::regimeYours(), QStringLiteral("Page %1 of %1").arg(pages)}) {
-        EXPECT_TRUE(last.contains(shown)) << shown.toStdString() << " not in\n"
-                                          << last.toStdString();
+         {QStringLiteral("Carbon account of the rotation"), QStringLiteral("IPCC 2006"),
+          QStringLiteral("Units issued"), QStringLiteral("Page %1 of %1").arg(pages)}) {
+        EXPECT_TRUE(carbon.contains(shown)) << shown.toStdString() << " not in the carbon pages";
     }
 }
 #endif
