@@ -127,6 +127,10 @@ QString breakEvenText(const std::optional<double> &factor) {
         return economicstext::breakEvenNone();
     }
     const double k = *factor;
+    if (k <= 0.0) {
+        // Carbon and other revenues alone pay for the land.
+        return QStringLiteral("none: the land pays without timber revenue");
+    }
     const QString times = quantityText(k, 2) + QStringLiteral(" × today's prices");
     if (k <= 1.0) {
         return times + QStringLiteral(" (prices may fall ") + quantityText((1.0 - k) * 100.0, 0) +
