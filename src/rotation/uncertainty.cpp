@@ -7,6 +7,7 @@
 #include <cmath>
 #include <numbers>
 #include <random>
+#include <span>
 
 namespace arbolex::rotation {
 
@@ -66,8 +67,9 @@ public:
                 m_net[a] += carbonFactor * m_carbon[a];
             }
         }
-        const std::vector<double> fromPresent(m_net.begin() + m_presentAge, m_net.end());
-        return {valuation::netPresentValue(fromPresent, ratePercent),
+        const std::span<const double> fromPresent =
+            std::span<const double>(m_net).subspan(static_cast<std::size_t>(m_presentAge));
+        return {valuation::netPresentValueOf(fromPresent, ratePercent),
                 valuation::landExpectationValue(m_net, ratePercent)};
     }
 

@@ -63,6 +63,21 @@ double power(double ratePercent, int years) {
     return table.factor(ratePercent, years);
 }
 
+/// std::nearbyint in the default rounding mode (to the nearest, halves to
+/// even), without a call into the library for every year of every NPV: below
+/// 2^52, adding 2^52 and taking it away again leaves the whole number that
+/// mode rounds to; from 2^52 on a double is whole already (and NaN and the
+/// infinities stay what they are, as with nearbyint).
+double nearestWhole(double x) {
+    constexpr double kWholeFrom = 0x1p52;
+    const double magnitude = std::fabs(x);
+    if (!(magnitude < kWholeFrom)) {
+        return x;
+    }
+    const double rounded = (magnitude + kWholeFrom) - kWholeFrom;
+    return std::copysign(rounded, x);
+}
+
 std::optional<double> checkedFactor(double factor) {
     if (!std::isfinite(factor) || factor <= 0.0) {
         return std::nullopt;
@@ -73,8 +88,8 @@ std::optional<double> checkedFactor(double factor) {
 } // namespace
 
 double roundToCents(double euro) {
-    // nearbyint rounds halves to even in the default rounding mode.
-    return std::nearbyint(euro * 100.0) / 100.0;
+    // Halves to even, as nearbyint in the default rounding mode.
+    return nearestWhole(euro * 100.0) / 100.0;
 }
 
 std::optional<double> discountFactor(double ratePercent, int years) {
@@ -111,7 +126,7 @@ std::optional<double> netPresentValueOf(std::span<const double> cashFlows, doubl
         }
         if (product > kSureFactorLow && product < kSureFactorHigh) {
             const double cents = cashFlows[i] / product * 100.0;
-            const double whole = std::nearbyint(cents);
+            const double whole = nearestWhole(cents);
             const double margin = 0.5 - std::fabs(cents - whole);
             const double drift = std::fabs(cents) * static_cast<double>(i + 8) * kUnitLastPlace;
             if (margin > drift) {

@@ -4,7 +4,9 @@
 
 #include <gtest/gtest.h>
 
+#include <bit>
 #include <cmath>
+#include <cstdint>
 #include <limits>
 #include <random>
 #include <thread>
@@ -19,6 +21,15 @@ TEST(DiscountingTest, CentsRoundHalfToEven) {
     EXPECT_EQ(roundToCents(0.375), 0.38);
     EXPECT_EQ(roundToCents(-0.125), -0.12);
     EXPECT_EQ(roundToCents(2.5), 2.5);
+    // Whole cents past 2^52 stay as they are; a value that rounds to no cent
+    // keeps its sign, as nearbyint leaves it.
+    for (const double euro : {0x1p52 / 100.0, 0x1p53 / 100.0 + 0.5, -0x1p51 / 100.0 - 0.005, 1e300,
+                              -0.004, 0.004, 12345.675, -12345.685}) {
+        const double expected = std::nearbyint(euro * 100.0) / 100.0;
+        EXPECT_EQ(std::bit_cast<std::uint64_t>(roundToCents(euro)),
+                  std::bit_cast<std::uint64_t>(expected))
+            << euro;
+    }
 }
 
 TEST(DiscountingTest, AnnualCompoundFactorFromTheFirstYear) {
