@@ -3,13 +3,13 @@
 #include "carbon/carbonfile.hpp"
 #include "cli/command.hpp"
 #include "prices/assortmentpricefile.hpp"
+#include "prices/carbonsettingsfile.hpp"
 #include "prices/costfile.hpp"
 #include "prices/prices.hpp"
 #include "shell/errorlog.hpp"
 #include "shell/settings.hpp"
 
 #include <QDir>
-#include <QFile>
 #include <QFileInfo>
 #include <QJsonArray>
 #include <QJsonObject>
@@ -183,22 +183,15 @@ rotation::Regime readRegime(const Options &options) {
 /// file that is refused stops the command; without a file the constants are
 /// the defaults. True when the file was read.
 bool readCarbon(const Options &options, const QString &dataFolder, rotation::Economics &economics) {
-    const QString path = QDir(dataFolder).filePath(QLatin1String(carbon::kCarbonFile));
-    bool read = false;
-    if (QFile file(path); file.exists()) {
-        if (!file.open(QIODevice::ReadOnly)) {
-            throw UsageError{QStringLiteral("cannot read the carbon file ") + path};
-        }
-        const QByteArray text = file.readAll();
-        const carbon::CarbonReading reading =
-            carbon::readCarbonText(std::string_view(text.constData(), text.size()));
-        if (!reading.settings) {
-            throw UsageError{QStringLiteral("the carbon file ") + path + QStringLiteral(", ") +
-                             QString::fromStdString(reading.fault)};
-        }
-        economics.carbonParameters = reading.settings->parameters;
-        read = true;
+    const prices::CarbonSettingsReading reading =
+        prices::readCarbonSettings(QDir(dataFolder).filePath(QLatin1String(prices::kCarbonFile)));
+    if (!reading.settings && !reading.missing) {
+        throw UsageError{QStringLiteral("carbon ") + reading.fault};
     }
+    if (reading.settings) {
+        economics.carbonParameters = reading.settings->parameters;
+    }
+    const bool read = reading.settings.has_value();
     carbon::Payment payment = carbon::Payment::kFlow;
     if (options.has("carbon-money") &&
         !carbon::paymentFromName(options.text("carbon-money").toStdString(), payment)) {
@@ -302,8 +295,8 @@ rotation::Economics readEconomics(const Options &options, const QString &dataFol
                      QDir(dataFolder).filePath(QLatin1String(prices::kCostsFile)));
     }
     if (carbonFile) {
-        run.fileRead(QLatin1String(carbon::kCarbonFile),
-                     QDir(dataFolder).filePath(QLatin1String(carbon::kCarbonFile)));
+        run.fileRead(QLatin1String(prices::kCarbonFile),
+                     QDir(dataFolder).filePath(QLatin1String(prices::kCarbonFile)));
     }
     run.inputs({{QStringLiteral("carbon_price"),
                  options.has("carbon-price") ? Value::exact(economics.carbon.price) : Value()},

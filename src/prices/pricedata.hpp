@@ -84,7 +84,7 @@ inline constexpr const char *kAssortmentPricesFile = "AssortPrices.qdm";
 /// Read only: the program never writes it.
 inline constexpr const char *kCostsFile = "Costs.qdm";
 /// Written at exit only when its settings were changed.
-inline constexpr const char *kCarbonFile = "Carbon.qdm";
+inline constexpr const char *kCarbonFile = carbon::kCarbonFile;
 /// The files GetPricesFromFiles reads, in its order: it stops at the first
 /// one missing.
 inline constexpr const char *kFilesReadForPrices[] = {kCurrentPricesFile, kPrivatePricesFile,
