@@ -157,26 +157,6 @@ TEST_F(CarbonPriceWindowTest, PriceAboveTheHighestIsRefusedAndNothingChanges) {
     EXPECT_EQ(prices.data().carbon.pricing.payment, carbon::Payment::kFlow);
 }
 
-TEST_F(CarbonPriceWindowTest, ConstantsShowTheFileValuesWithTheirSources) {
-    prices.data().carbon.parameters.halfLife[1] = 30.0;
-    window.show();
-    const std::vector<QStringList> &grid = view.constants();
-    ASSERT_EQ(grid.size(), carbon::constantEntries(prices.data().carbon).size() + 1);
-    const auto row = [&grid](const QString &name) {
-        for (const QStringList &r : grid) {
-            if (r.value(0) == name) {
-                return r;
-            }
-        }
-        return QStringList();
-    };
-    EXPECT_EQ(row(QStringLiteral("half_life.panels")).value(1), QStringLiteral("30"));
-    EXPECT_TRUE(row(QStringLiteral("half_life.paper")).value(2).contains(QStringLiteral("IPCC")));
-    EXPECT_TRUE(row(QStringLiteral("half_life.panels")).value(2).isEmpty())
-        << "a source shows once for the names under it";
-    EXPECT_TRUE(row(QStringLiteral("price")).isEmpty()) << "the price is a field, not a constant";
-}
-
 // ---- A run to the next ------------------------------------------------------------------------
 
 TEST(CarbonSettingsRun, AcceptedSettingsAreTheWorksMoneyAndTheNextRunsSettings) {

@@ -1,6 +1,6 @@
 // The assortment prices window wired to its logic: opened from the timber
 // prices window, keys reach the prices only after Allow Changes, and pasting
-// never does; Escape and the close button close each price list alone.
+// never does (closing is the tool window base's, tested with it).
 #include "guifixture.hpp"
 
 #include "economics/assortpriceswindowlogic.hpp"
@@ -64,28 +64,6 @@ TEST_F(AssortPricesGuiTest, OpenedFromTheTimberPricesAndEditedThroughTheKeyFilte
 
     press(AssortPricesControl::cmdCloseAsmtPrices);
     EXPECT_FALSE(assortWindow.isVisible());
-}
-
-TEST_F(AssortPricesGuiTest, EscapeAndTheCloseButtonCloseEachPriceListAlone) {
-    logic.cmdShowTimberPrice_Click();
-    assortLogic.show();
-    ASSERT_TRUE(pricesWindow.isVisible());
-    ASSERT_TRUE(assortWindow.isVisible());
-    pressKey(&assortWindow, Qt::Key_Escape);
-    EXPECT_FALSE(assortWindow.isVisible());
-    EXPECT_TRUE(pricesWindow.isVisible());
-
-    assortLogic.show();
-    static_cast<QWidget &>(pricesWindow).close(); // the title bar's close button
-    EXPECT_FALSE(pricesWindow.isVisible());
-    EXPECT_TRUE(assortWindow.isVisible());
-    static_cast<QWidget &>(assortWindow).close();
-    EXPECT_FALSE(assortWindow.isVisible());
-
-    logic.cmdShowTimberPrice_Click();
-    pressKey(&pricesWindow, Qt::Key_Escape);
-    EXPECT_FALSE(pricesWindow.isVisible());
-    EXPECT_TRUE(interactive.messages.isEmpty());
 }
 
 } // namespace
