@@ -32,8 +32,12 @@
 #include <QPushButton>
 #include <QSplitter>
 #include <QStackedWidget>
+#include <QStyle>
 #include <QTableView>
 #include <QVBoxLayout>
+
+#include <cmath>
+#include <vector>
 
 namespace arbolex::ui {
 
@@ -415,10 +419,58 @@ void MainWindow::fitColumns() {
             header->resizeSection(c, kSeparatorWidth);
         } else {
             header->setSectionResizeMode(c, QHeaderView::Interactive);
-            m_grid->resizeColumnToContents(c);
-            header->resizeSection(c, std::max(header->sectionSize(c), minimum));
+            const int fitted = std::max(contentWidth(c), header->sectionSizeHint(c));
+            header->resizeSection(c, std::max(fitted, minimum));
         }
     }
+}
+
+int MainWindow::contentWidth(int column) const {
+    // The cells are one line of plain text each: their advance in the row's
+    // font is the width the item delegate asks for. Shaping every cell costs
+    // more than the grow itself, so each text is first estimated by the sum of
+    // its characters' advances, and only those that may be the widest are
+    // shaped.
+    QFont boldFont = m_grid->font();
+    boldFont.setBold(true);
+    const QFontMetricsF plain(m_grid->font());
+    const QFontMetricsF bold(boldFont);
+    struct Cell {
+        QString text;
+        const QFontMetricsF *metrics;
+        qreal estimate;
+    };
+    std::vector<Cell> cells;
+    qreal widestEstimate = 0;
+    for (int r = 0; r < m_model->rowCount(); ++r) {
+        if (m_model->isTextRow(r)) {
+            continue; // the report spans the row and asks for no width
+        }
+        const QModelIndex index = m_model->index(r, column);
+        QString text = m_model->data(index, Qt::DisplayRole).toString();
+        if (text.isEmpty()) {
+            continue;
+        }
+        const QFontMetricsF *metrics =
+            m_model->data(index, Qt::FontRole).value<QFont>().bold() ? &bold : &plain;
+        qreal estimate = 0;
+        for (const QChar c : text) {
+            estimate += metrics->horizontalAdvance(c);
+        }
+        widestEstimate = std::max(widestEstimate, estimate);
+        cells.push_back({std::move(text), metrics, estimate});
+    }
+    qreal widest = 0;
+    for (const Cell &cell : cells) {
+        // Kerning moves a text by a fraction of a pixel at most.
+        if (cell.estimate >= widestEstimate - 2.0) {
+            widest = std::max(widest, cell.metrics->horizontalAdvance(cell.text));
+        }
+    }
+    // The delegate's text margins on each side, and the grid line.
+    const int margin =
+        m_grid->style()->pixelMetric(QStyle::PM_FocusFrameHMargin, nullptr, m_grid) + 1;
+    return static_cast<int>(std::ceil(widest)) + 2 * margin + (m_grid->showGrid() ? 1 : 0);
 }
 
 // ---- IMainView --------------------------------------------------------------------------

@@ -111,6 +111,8 @@ private:
     QLabel *addResult(workflow::MainControl control);
     QPushButton *addButton(workflow::MainControl control, const QString &caption);
     void fitColumns();
+    /// Width the cells of item column `column` need.
+    int contentWidth(int column) const;
     /// Tells the logic the grid's current row and the end of its selection.
     void selectionToLogic();
     /// Shows the logic's current row and selection in the grid.

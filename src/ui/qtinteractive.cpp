@@ -68,6 +68,10 @@ bool QtInteractive::askYesNo(const QString &title, const QString &text) {
 
 shell::UnsavedChoice QtInteractive::askSaveDiscardCancel(const QString &title,
                                                          const QString &text) {
+    // A queued yes saves and a queued no discards, as in the headless session.
+    if (!m_answers.isEmpty()) {
+        return m_answers.takeFirst() ? shell::UnsavedChoice::Save : shell::UnsavedChoice::Discard;
+    }
     QMessageBox box(QMessageBox::Warning, title, lineBreaks(text),
                     QMessageBox::Save | QMessageBox::Discard | QMessageBox::Cancel, m_parent);
     box.setTextFormat(Qt::PlainText);

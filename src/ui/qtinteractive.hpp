@@ -18,7 +18,8 @@ public:
     explicit QtInteractive(QWidget *parent = nullptr) : m_parent(parent) {}
 
     void setParentWidget(QWidget *parent) { m_parent = parent; }
-    /// Answers the next question with `yes` without asking (demonstrations).
+    /// Answers the next question with `yes` without asking (scripts); for the
+    /// question before unsaved work is discarded, yes saves and no discards.
     void queueAnswer(bool yes) { m_answers.append(yes); }
 
     void message(const QString &title, const QString &text, int style) override;

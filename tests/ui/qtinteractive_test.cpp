@@ -1,5 +1,6 @@
 // Message boxes: the style of a message picks its icon and buttons, and the
-// CR LF / LF CR line breaks of the messages show as line breaks.
+// CR LF / LF CR line breaks of the messages show as line breaks; a script's
+// queued answers answer the questions without a box.
 #include "ui/qtinteractive.hpp"
 
 #include <QMessageBox>
@@ -42,6 +43,20 @@ TEST(QtInteractiveTest, StylePicksIconAndButtons) {
         EXPECT_EQ(box->windowTitle(), QStringLiteral("TITLE"));
         EXPECT_EQ(box->text(), QStringLiteral("one\ntwo"));
     }
+}
+
+// A box left open would wait for a click no script can give: a run that
+// quits with unsaved work must be answered from the queue.
+TEST(QtInteractiveTest, QueuedAnswersAnswerEveryKindOfQuestionInOrder) {
+    QtInteractive interactive;
+    interactive.queueAnswer(false);
+    interactive.queueAnswer(true);
+    interactive.queueAnswer(true);
+    EXPECT_EQ(interactive.askSaveDiscardCancel(QStringLiteral("T"), QStringLiteral("unsaved")),
+              shell::UnsavedChoice::Discard);
+    EXPECT_TRUE(interactive.askYesNo(QStringLiteral("T"), QStringLiteral("sure?")));
+    EXPECT_EQ(interactive.askSaveDiscardCancel(QStringLiteral("T"), QStringLiteral("unsaved")),
+              shell::UnsavedChoice::Save);
 }
 
 } // namespace
