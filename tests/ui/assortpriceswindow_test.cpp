@@ -43,7 +43,6 @@ TEST_F(AssortPricesGuiTest, OpenedFromTheTimberPricesAndEditedThroughTheKeyFilte
         pricesWindow.control({economics::TimberPricesControl::cmdAssortPrices, 0}))
         ->click();
     ASSERT_TRUE(assortWindow.isVisible());
-    EXPECT_FALSE(assortWindow.isModal());
     EXPECT_EQ(priceField(2)->text(), QStringLiteral("48.00"));
 
     priceField(2)->selectAll();
