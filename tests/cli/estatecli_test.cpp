@@ -4,7 +4,6 @@
 // and 2 threads; shards merge into the whole; a GeoPackage comes back with its
 // geometry; an input that cannot be read exits with 2.
 #include "cli/clirun.hpp"
-#include "estate/forecast.hpp"
 #include "estateio/gdallayer.hpp"
 #include "mocks/programservices.hpp"
 
@@ -171,31 +170,18 @@ TEST_F(EstateCliTest, OneOrTwoThreadsWriteTheSameFilesAndShardsMergeIntoTheWhole
         EXPECT_EQ(one, bytes(path("t2") + QLatin1String(file))) << file;
     }
 
-    // Three shards: their rows are the whole's, their forecasts add up to it.
+    // Two shards give the whole's rows; that their forecasts add up is the
+    // estate run's (estaterun_test.cpp).
     Table merged;
-    arbolex::estate::Forecast sum;
-    for (int k = 1; k <= 3; ++k) {
-        const QString out = path("shard") + QString::number(k);
-        estate(path("many.csv"), out,
-               {QStringLiteral("--shard"), QString::number(k) + QStringLiteral("/3")});
+    for (const char *shard : {"1/2", "2/2"}) {
+        const QString out = path("shard") + QLatin1String(shard).left(1);
+        estate(path("many.csv"), out, {QStringLiteral("--shard"), QLatin1String(shard)});
         const Table part = read(out + QStringLiteral("/subcompartments.csv"));
         merged.insert(merged.end(), part.begin(), part.end());
-        for (const auto &values : read(out + QStringLiteral("/forecast.csv"))) {
-            const auto line = arbolex::estate::forecastLine(values);
-            ASSERT_TRUE(line.has_value());
-            sum.add(line->year, line->species, line->totals);
-        }
     }
     std::sort(merged.begin(), merged.end(),
               [](const auto &a, const auto &b) { return std::stoi(a[0]) < std::stoi(b[0]); });
     EXPECT_EQ(merged, read(path("t1/subcompartments.csv")));
-    arbolex::estate::Forecast whole;
-    for (const auto &values : read(path("t1/forecast.csv"))) {
-        const auto line = arbolex::estate::forecastLine(values);
-        ASSERT_TRUE(line.has_value());
-        whole.add(line->year, line->species, line->totals);
-    }
-    EXPECT_EQ(sum, whole);
 }
 
 TEST_F(EstateCliTest, AGeoPackageComesBackWithItsGeometryAndTypedResults) {
