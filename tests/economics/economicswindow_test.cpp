@@ -188,18 +188,7 @@ TEST_F(EconomicsWindowTest, CostsAreInputsOfTheWork) {
     EXPECT_EQ(announced, 1);
     economics.cmdCompute_Click();
     EXPECT_EQ(announced, 1) << "the same costs again change nothing";
-
-    // A document written before the work had costs takes the defaults, and
-    // the window shows them.
-    prices.data().costs = {3045.0, 0.0};
-    work::WorkSnapshot older = work.snapshot();
-    older.establishmentCost.reset();
-    older.annualCost.reset();
-    logic.restore(older);
-    EXPECT_EQ(work.establishmentCost(), 3045.0);
-    EXPECT_EQ(work.annualCost(), 0.0);
-    EXPECT_EQ(view.text(EconomicsControl::txtEstablishmentCost), QStringLiteral("3045"));
-    EXPECT_EQ(view.text(EconomicsControl::txtAnnualCost), QStringLiteral("0"));
+    // A document written before the work had costs: document_test.cpp.
 }
 
 TEST_F(EconomicsWindowTest, TypedCashFlowCountsForTheOptimiserAndStaysOnApply) {
@@ -251,15 +240,18 @@ TEST_F(EconomicsWindowTest, BadInputIsRefusedAndKeepsWhatIsShown) {
         QString typed;
         EconomicsControl command;
         QString message;
+        EconomicsControl focus;
     } cases[] = {
         {EconomicsControl::txtInterestRate, QStringLiteral("0"), EconomicsControl::cmdCompute,
-         economics::economicstext::faultRate()},
+         economics::economicstext::faultRate(), EconomicsControl::txtInterestRate},
         {EconomicsControl::txtAnnualCost, QStringLiteral("-5"), EconomicsControl::cmdCompute,
-         economics::economicstext::faultCost()},
+         economics::economicstext::faultCost(), EconomicsControl::txtAnnualCost},
         {EconomicsControl::txtDraws, QStringLiteral("5"), EconomicsControl::cmdMonteCarlo,
-         economics::economicstext::faultDraws()},
+         economics::economicstext::faultDraws(), EconomicsControl::txtDraws},
         {EconomicsControl::txtRateHigh, QStringLiteral("1"), EconomicsControl::cmdMonteCarlo,
-         economics::economicstext::faultRateRange()},
+         economics::economicstext::faultRateRange(), EconomicsControl::txtRateLow},
+        {EconomicsControl::txtCarbonSpread, QStringLiteral("150"), EconomicsControl::cmdMonteCarlo,
+         economics::economicstext::faultSpread(), EconomicsControl::txtCarbonSpread},
     };
     for (const auto &c : cases) {
         const QString before = view.text(c.field);
@@ -268,6 +260,7 @@ TEST_F(EconomicsWindowTest, BadInputIsRefusedAndKeepsWhatIsShown) {
         economics.press(c.command);
         ASSERT_EQ(interactive.messages.size(), 1) << c.typed.toStdString();
         EXPECT_EQ(interactive.messages.front().text, c.message);
+        EXPECT_EQ(view.focused(), c.focus);
         EXPECT_EQ(view.text(EconomicsControl::lblNPV), npv);
         EXPECT_EQ(economics.monteCarlo()->histogram.empty() ? 0 : 1, draws);
         economics.typeText(c.field, before);
