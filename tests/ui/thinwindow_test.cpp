@@ -8,7 +8,6 @@
 #include "thinning/thinwindowlogic.hpp"
 #include "ui/projectionmodel.hpp"
 #include "ui/thinwindow.hpp"
-#include "ui/windowtexts.hpp"
 #include "workflow/mainmessages.hpp"
 
 #include <QAction>
@@ -56,8 +55,6 @@ protected:
 TEST_F(ThinWindowGuiTest, MainThinButtonIsOfferedByThinnedModelsOnly) {
     auto *button = qobject_cast<QPushButton *>(window.control(MainControl::cmdThin));
     ASSERT_NE(button, nullptr);
-    EXPECT_EQ(button->text(), ui::text::buttonThin());
-    EXPECT_EQ(button->toolTip(), QStringLiteral("Mark or edit thinning."));
     EXPECT_TRUE(button->isEnabled()); // model 0 is thinned
 
     const QList<QAction *> models = window.modelMenu()->actions();
