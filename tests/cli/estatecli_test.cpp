@@ -1,6 +1,6 @@
 // arbolex-cli estate, run as a user runs it: a spreadsheet with its columns in
 // any order comes back with its carried columns untouched and every row once,
-// bad rows listed; a row agrees with `rotation`; the files are the same for 1
+// bad rows listed; the files are the same for 1
 // and 2 threads; shards merge into the whole; a GeoPackage comes back with its
 // geometry; an input that cannot be read exits with 2.
 #include "cli/clirun.hpp"
@@ -9,8 +9,6 @@
 
 #include <QDir>
 #include <QFile>
-#include <QJsonDocument>
-#include <QJsonObject>
 #include <QTemporaryDir>
 
 #include <cpl_conv.h>
@@ -117,38 +115,8 @@ TEST_F(EstateCliTest, CarriesColumnsKeepsEveryRowInOrderAndListsTheBadOnes) {
     EXPECT_EQ(forecast[0][1], "all");
 }
 
-TEST_F(EstateCliTest, ARowAgreesWithTheRotationCommand) {
-    writeInput("one.csv", "id,model,age,stocking,top_height,basal_area,area_ha\n"
-                          "S,0,15,2500,7,20,2\n");
-    ASSERT_EQ(estate(path("one.csv"), path("out")).exitCode, 0);
-    std::vector<std::string> names;
-    const Table results = read(path("out/subcompartments.csv"), &names);
-    ASSERT_EQ(results.size(), 1U);
-
-    QStringList arguments = QStringLiteral("rotation --model 0 --age 15 --stocking 2500 --height 7 "
-                                           "--basal-area 20 --format json")
-                                .split(QLatin1Char(' '));
-    for (const char *word : kRegime) {
-        arguments << QLatin1String(word);
-    }
-    const Outcome rotation = arbolex::cli::testing::runCli(arguments, m_data.path());
-    ASSERT_EQ(rotation.exitCode, 0) << rotation.err.toStdString();
-    const QJsonObject o =
-        QJsonDocument::fromJson(rotation.out.join(QLatin1Char('\n')).toUtf8()).object();
-    auto number = [&](const char *name) {
-        return std::stod(column(names, results[0], name));
-    };
-    EXPECT_EQ(number("final_cut_age"), o[QStringLiteral("rotation")].toDouble());
-    EXPECT_EQ(number("yield_class"), o[QStringLiteral("yield_class")].toDouble());
-    EXPECT_FLOAT_EQ(static_cast<float>(number("site_index")),
-                    static_cast<float>(o[QStringLiteral("site_index")].toDouble()));
-    for (const auto &[estateName, rotationName] :
-         {std::pair{"npv_ha", "npv"}, {"lev_ha", "lev"}, {"forest_value_ha", "forest_value"}}) {
-        EXPECT_DOUBLE_EQ(number(estateName), o[QLatin1String(rotationName)].toDouble())
-            << estateName;
-    }
-    EXPECT_NEAR(number("npv"), 2.0 * o[QStringLiteral("npv")].toDouble(), 0.01);
-}
+// A row's figures are the rotation library's (rowevaluator_test.cpp) and the
+// rotation command's to the cent (oneforestry_test.cpp).
 
 TEST_F(EstateCliTest, OneOrTwoThreadsWriteTheSameFilesAndShardsMergeIntoTheWhole) {
     QByteArray estateText("id,model,age,stocking,top_height,basal_area,area_ha,rotation\n");
