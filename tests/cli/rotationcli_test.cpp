@@ -1,6 +1,7 @@
 // arbolex-cli rotation, run as a user runs it over the shipped price lists:
-// its JSON figures hold together, the chosen rotation and price list are the
-// ones used, and a command line that names no rotation exits with 2.
+// its JSON figures hold together, the chosen rotation, price list and
+// valuation are the ones used, and a command line that names no rotation
+// exits with 2.
 #include "cli/clirun.hpp"
 #include "mocks/programservices.hpp"
 #include "shell/testfiles.hpp"
@@ -138,6 +139,46 @@ TEST_F(RotationCliTest, CostsAreTheDataFoldersUnlessGiven) {
     std::tie(inputs, files) = record(json(kThinned));
     EXPECT_EQ(inputs[QStringLiteral("establishment_cost")].toDouble(), 0.0);
     EXPECT_FALSE(files.contains(QStringLiteral("Costs.qdm")));
+}
+
+// Valued by assortments: the classes of the final cut are sold at the data
+// folder's assortment prices or at those of --assortment-prices, and optimise
+// and uncertainty say how they valued.
+TEST_F(RotationCliTest, ClassesAreSoldAtTheAssortmentPrices) {
+    const QString felled = kStand + QStringLiteral(" --rotation 50");
+    const auto finalCut = [](const QJsonObject &o) {
+        return o[QStringLiteral("final_cut")].toObject();
+    };
+    const QJsonObject stand = json(felled);
+    EXPECT_EQ(stand[QStringLiteral("valuation")].toString(), QStringLiteral("stand"));
+    EXPECT_FALSE(finalCut(stand).contains(QStringLiteral("assortments")));
+
+    const QJsonObject shipped = json(felled + QStringLiteral(" --valuation assortment"));
+    EXPECT_EQ(shipped[QStringLiteral("valuation")].toString(), QStringLiteral("assortment"));
+    const QJsonObject cut = finalCut(shipped);
+    const QJsonObject classes = cut[QStringLiteral("assortments")].toObject();
+    const double pulp = classes[QStringLiteral("7-14 cm")].toDouble();
+    const double pallet = classes[QStringLiteral("14-20 cm")].toDouble();
+    const double saw = classes[QStringLiteral(">20 cm")].toDouble();
+    EXPECT_NEAR(pulp + pallet + saw, cut[QStringLiteral("volume")].toDouble(), 0.01);
+    // The shipped AssortPrices.qdm: 10, 28 and 48 euro/m3.
+    EXPECT_NEAR(cut[QStringLiteral("revenue")].toDouble(), pulp * 10 + pallet * 28 + saw * 48,
+                0.01);
+
+    const QString own = m_data.filePath(QStringLiteral("sawmill.qdm"));
+    arbolex::testing::writeBytes(own, "0\r\n0\r\n60\r\n");
+    const QJsonObject sawmill =
+        json(felled + QStringLiteral(" --valuation assortment --assortment-prices ") + own);
+    EXPECT_NEAR(finalCut(sawmill)[QStringLiteral("revenue")].toDouble(), saw * 60, 0.01);
+
+    const QString search =
+        QLatin1String(kStandOptions) + QStringLiteral(" --rate 3 --valuation assortment");
+    const QJsonObject best =
+        json(QStringLiteral("optimise ") + search + QStringLiteral(" --top 1"));
+    EXPECT_EQ(best[QStringLiteral("valuation")].toString(), QStringLiteral("assortment"));
+    const QJsonObject drawn =
+        json(QStringLiteral("uncertainty ") + search + QStringLiteral(" --draws 200"));
+    EXPECT_EQ(drawn[QStringLiteral("valuation")].toString(), QStringLiteral("assortment"));
 }
 
 struct BadRotation {

@@ -25,10 +25,6 @@ using assortments::AssortControl;
 using assortments::AssortUserControl;
 using thinning::ThinControl;
 
-void click(QWidget *button) {
-    qobject_cast<QAbstractButton *>(button)->click();
-}
-
 class AssortWindowGuiTest : public MainWindowGuiTest {
 protected:
     AssortWindowGuiTest() { window.show(); }

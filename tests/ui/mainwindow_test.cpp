@@ -21,10 +21,6 @@ namespace {
 
 using work::ProjectionTable;
 
-void click(QWidget *button) {
-    qobject_cast<QPushButton *>(button)->click();
-}
-
 void leave(QWidget *field, Qt::FocusReason reason) {
     QFocusEvent out(QEvent::FocusOut, reason);
     QApplication::sendEvent(field, &out);

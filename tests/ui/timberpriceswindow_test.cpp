@@ -13,10 +13,6 @@ namespace {
 
 using economics::TimberPricesControl;
 
-void click(QWidget *button) {
-    qobject_cast<QAbstractButton *>(button)->click();
-}
-
 class TimberPricesGuiTest : public MainWindowGuiTest {
 protected:
     TimberPricesGuiTest() { window.show(); }
