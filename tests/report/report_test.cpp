@@ -142,7 +142,7 @@ TEST_F(ReportTest, EconomicsPageOnlyWhileTheEconomicsWindowShowsTheTablesFigures
     EXPECT_TRUE(interactive.messages.isEmpty());
 }
 
-TEST_F(ReportTest, UnwritableFilesAreRefused) {
+TEST_F(ReportTest, ChartsExportAsPngAndSvgAndUnwritableFilesAreRefused) {
     closeRotation();
     const charts::ReportContent content = charts::reportContent(work);
     const QString nowhere = path(QStringLiteral("no-such-folder/file"));
@@ -151,11 +151,7 @@ TEST_F(ReportTest, UnwritableFilesAreRefused) {
                                       QSize(400, 300)));
     EXPECT_FALSE(report::saveChartSvg(content.standChart, nowhere + QStringLiteral(".svg"),
                                       QSize(400, 300)));
-}
 
-TEST_F(ReportTest, ChartsExportAsPngAndSvg) {
-    closeRotation();
-    const charts::ReportContent content = charts::reportContent(work);
     const QString png = path(QStringLiteral("stand.png"));
     ASSERT_TRUE(report::saveChartPng(content.standChart, png, QSize(640, 420)));
     const QImage image(png);
