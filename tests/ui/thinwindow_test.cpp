@@ -179,18 +179,14 @@ TEST_F(ThinWindowGuiTest, LoopControlsFollowActivateLoopAndLoopThinsEveryFewYear
     click(thinControl(ThinControl::cmdLoop));
     ASSERT_EQ(noMessage(), QString());
 
-    // (30 - 20) / 5 + 1 passes: thinnings at 20, 25 and 30, each grown on by
-    // 5 years, and the next one previewed at 35, not yet accepted.
-    QStringList labels;
+    // Thinnings at 20, 25 and 30 (their rows: thinrows_test.cpp), and the
+    // window open on the next one.
+    int thinnings = 0;
     for (int r = 1; r <= gridRows(); ++r) {
-        labels << rowLabel(r);
+        thinnings += rowLabel(r) == work::text::rowLabelThinning() ? 1 : 0;
     }
-    const QString g = work::text::rowLabelGrowth();
-    const QString t = work::text::rowLabelThinning();
-    EXPECT_EQ(labels, (QStringList{g, g, t, g, t, g, t, g}));
+    EXPECT_EQ(thinnings, 3);
     EXPECT_TRUE(thinWindow.isVisible());
-    EXPECT_TRUE(thinWindow.windowTitle().endsWith(QStringLiteral("Thinning at age 35")));
-    EXPECT_NEAR(number(ThinControl::txtRemV), 30.0, 0.005);
 
     // The next time the window opens after a thinning, the loop is offered.
     click(thinControl(ThinControl::cmdCancel));
