@@ -70,7 +70,6 @@ INSTANTIATE_TEST_SUITE_P(
     Refusals, CategoryRefusalTest,
     ::testing::Values(
         BadBounds{"BigEndNotAbove", "14", "14", AssortUserControl::txtBig, &at::bigEndNotAbove},
-        BadBounds{"BigEndBelow", "14", "10", AssortUserControl::txtBig, &at::bigEndNotAbove},
         BadBounds{"Negative", "14", "-20", AssortUserControl::txtBig, &at::negativeDiameter},
         BadBounds{"SmallEndUnder7", "6", "20", AssortUserControl::txtSmall, &at::smallEndUnder7},
         BadBounds{"NotANumber", "x", "20", AssortUserControl::txtSmall, &at::notANumber}),

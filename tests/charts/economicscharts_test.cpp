@@ -188,7 +188,8 @@ TEST(HistogramChartTest, BinsSideBySideFromZeroPercentilesMarked) {
 
 // ---- Harvest forecast -------------------------------------------------------------------
 
-TEST(HarvestChartTest, OneBarAYearStackedBySpeciesEachInItsColour) {
+// The bars' sets, values and categories as drawn: chartbuilder_test.cpp.
+TEST(HarvestChartTest, EightSpeciesInEightColoursThenRoundAgain) {
     charts::HarvestForecast forecast;
     forecast.years = {2026, 2027, 2028};
     for (int s = 0; s < 9; ++s) {
@@ -196,20 +197,13 @@ TEST(HarvestChartTest, OneBarAYearStackedBySpeciesEachInItsColour) {
         forecast.volumes.push_back({1.0 * s, 0.0, 10.0});
     }
     const ChartData chart = charts::harvestChart(forecast);
-    EXPECT_EQ(chart.categories, (QStringList{QStringLiteral("2026"), QStringLiteral("2027"),
-                                             QStringLiteral("2028")}));
     ASSERT_EQ(chart.series.size(), 9U);
     std::set<std::uint32_t> colours;
     for (std::size_t s = 0; s < 8; ++s) {
         colours.insert(*chart.series[s].colour);
     }
-    EXPECT_EQ(colours.size(), 8U) << "eight species, eight colours";
-    EXPECT_EQ(chart.series[8].colour, chart.series[0].colour) << "then round again";
-    EXPECT_EQ(chart.series[3].name, QStringLiteral("S3"));
-    EXPECT_EQ(chart.series[3].points[0].y, 3.0);
-    EXPECT_EQ(chart.series[3].points[2].x, 2.0) << "x is the year's index";
-    EXPECT_EQ(chart.axes.at(0).min, 0.0);
-
+    EXPECT_EQ(colours.size(), 8U);
+    EXPECT_EQ(chart.series[8].colour, chart.series[0].colour);
     EXPECT_TRUE(charts::harvestChart({}).empty());
 }
 

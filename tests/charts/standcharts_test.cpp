@@ -92,9 +92,6 @@ TEST(StandChartTest, ThinningAndFinalCutDropTheStandingCropButNotTotalProduction
     EXPECT_EQ(named(chart, charts::text::seriesStocking()).axis, charts::kAxisStocking);
     EXPECT_EQ(named(chart, charts::text::seriesTopHeight()).axis, charts::kAxisHeightBasalArea);
     EXPECT_EQ(chart.axes.size(), 3U);
-}
-
-TEST(StandChartTest, AnEmptyTableDrawsNothing) {
     EXPECT_TRUE(charts::standDevelopment(work::ProjectionTable()).empty());
     EXPECT_TRUE(charts::increments(work::ProjectionTable()).empty());
 }
@@ -170,14 +167,10 @@ TEST_F(CashFlowChartTest, PaysBackWhereTheLineLastRisesThroughZero) {
     EXPECT_EQ(chart.marks[0].label, charts::text::markPayback(24));
 }
 
-TEST_F(CashFlowChartTest, NoPaybackMarkWithoutALossOrWithoutRecovery) {
+TEST_F(CashFlowChartTest, NoPaybackMarkWithoutALossOrARecoveryAndNoChartWithoutARotation) {
     EXPECT_TRUE(chartOf({0, 100, 0, 300}).marks.empty()) << "never below zero";
     EXPECT_TRUE(chartOf({-500, 100, 0, 300}).marks.empty()) << "never back above zero";
-}
-
-TEST_F(CashFlowChartTest, NoRotationNoChart) {
     EXPECT_TRUE(charts::cashFlowChart(flow, 0).empty());
-    EXPECT_TRUE(charts::cashFlowChart(flow, 0).marks.empty());
 }
 
 } // namespace

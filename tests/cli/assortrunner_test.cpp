@@ -21,27 +21,7 @@ constexpr const char *kGrowAndThin =
     "press cmdGrow\n"
     "press cmdThin\nset frmThin.txtRemV 60\npress frmThin.cmdThin\n";
 
-TEST_F(AssortRunnerTest, ThinningReportsBecomeRows) {
-    ASSERT_TRUE(run(QLatin1String(kGrowAndThin) + QStringLiteral("press frmThin.cmdAssort(1)\n"
-                                                                 "print frmAssort.lblDesc\n"
-                                                                 "print frmAssort.lbl714\n"
-                                                                 "press frmAssort.cmdAccept\n"
-                                                                 "press frmThin.cmdAssort(0)\n"
-                                                                 "press frmAssort.cmdOK\n"
-                                                                 "press frmThin.cmdAccept\n"
-                                                                 "print flxMain"))
-                    .ok())
-        << output.toStdString();
-    const QStringList lines = printed();
-    ASSERT_GE(lines.size(), 4);
-    EXPECT_EQ(lines[0], QStringLiteral("Thinning assortment"));
-    EXPECT_EQ(lines[1], QStringLiteral("7-14 cm"));
-    // Header, four growth rows, the thinning row, then pre-thin before thinning.
-    ASSERT_EQ(lines.size(), 2 + 1 + 4 + 1 + 2);
-    EXPECT_TRUE(lines[8].startsWith(QStringLiteral("AC yr\t30\t7-14(%) ")));
-    EXPECT_TRUE(lines[9].startsWith(QStringLiteral("AT yr\t30\t7-14(%) ")));
-}
-
+// The thinning window's reports as rows: outputs_test.py (RunnerTest).
 TEST_F(AssortRunnerTest, CategoriesWindowAndUserReport) {
     ASSERT_TRUE(
         run(QLatin1String(kGrowAndThin) + QStringLiteral("press frmThin.cmdCancel\n"

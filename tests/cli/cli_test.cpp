@@ -211,12 +211,12 @@ TEST_F(CliTest, FailureReportedByTheEngineGoesToStderrAndTheErrorLog) {
     EXPECT_TRUE(log.endsWith(QStringLiteral("\r\n")));
 }
 
-TEST_F(CliTest, HelpDocumentsBothCommands) {
+TEST_F(CliTest, HelpNamesEveryCommandAndEachCommandHasItsOwn) {
     const Outcome overview = run({QStringLiteral("--help")});
     EXPECT_EQ(overview.exitCode, 0);
     const QString text = overview.out.join(QLatin1Char('\n'));
-    for (const char *option : {"project", "thin", "--by", "--dbh", "--residual-volume"}) {
-        EXPECT_TRUE(text.contains(QLatin1String(option))) << option;
+    for (const char *command : {"project", "thin", "rotation", "optimise", "uncertainty"}) {
+        EXPECT_TRUE(text.contains(QLatin1String(command))) << command;
     }
     const Outcome thinHelp = run(words("thin --help"));
     EXPECT_EQ(thinHelp.exitCode, 0);

@@ -1,4 +1,5 @@
-// The timber prices window driven by the headless runner.
+// The price windows driven by the headless runner: what a script may reach
+// in them. What they do is tested with the windows.
 #include "mocks/programservices.hpp"
 
 #include "cli/scriptrunner.hpp"
@@ -81,26 +82,6 @@ TEST_F(RunnerPricesTest, RefusesWhatTheWindowDoesNotHave) {
     for (const Case &c : cases) {
         EXPECT_EQ(runner.runLine(QLatin1String(c.line)), QString::fromUtf8(c.error)) << c.line;
     }
-}
-
-TEST_F(RunnerPricesTest, AssortmentPricesFromTheTimberPricesWindowAreSavedAtExit) {
-    const QStringList lines = run({
-        QStringLiteral("press cmdShowTimberPrice"),
-        QStringLiteral("press frmTimberPrices.cmdAssortPrices"),
-        QStringLiteral("print frmAssortPrices.lblAsmtCat(2)"),
-        QStringLiteral("print frmAssortPrices.txtAsmtVal(2)"),
-        QStringLiteral("press frmAssortPrices.cmdChangeAsmtPrices"),
-        QStringLiteral("set frmAssortPrices.txtAsmtVal(2) 55"),
-        QStringLiteral("press frmAssortPrices.cmdChangeAsmtPrices"),
-        QStringLiteral("press frmAssortPrices.cmdCloseAsmtPrices"),
-    });
-    ASSERT_TRUE(outcome.ok()) << outcome.error.toStdString();
-    EXPECT_EQ(lines, (QStringList{QStringLiteral(">20 cm:"), QStringLiteral("48.00")}));
-    EXPECT_FALSE(session.assortPricesView().isShown());
-    session.main().Form_Unload(settings);
-    QFile file(dir.filePath(QStringLiteral("AssortPrices.qdm")));
-    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
-    EXPECT_EQ(file.readAll(), QByteArray("10\r\n28\r\n55\r\n"));
 }
 
 } // namespace

@@ -88,16 +88,6 @@ protected:
     economics::AssortPricesWindowLogic window{prices.data(), log, view, interactive};
 };
 
-TEST_F(AssortPricesWindowTest, ShowsEachClassBesideItsPrice) {
-    EXPECT_TRUE(view.isShown());
-    EXPECT_EQ(view.caption(), QStringLiteral("Assortment Prices"));
-    EXPECT_EQ(view.text({AssortPricesControl::lblAsmtCat, 0}), QStringLiteral("7-14 cm:"));
-    EXPECT_EQ(view.text({AssortPricesControl::lblAsmtCat, 2}), QStringLiteral(">20 cm:"));
-    EXPECT_EQ(field(1), QStringLiteral("30.50"));
-    EXPECT_EQ(command(), QStringLiteral("Allow Changes"));
-    EXPECT_FALSE(view.pricesEditable());
-}
-
 TEST_F(AssortPricesWindowTest, TypingOnlyBetweenAllowAndAcceptChanges) {
     window.typeText(0, QStringLiteral("99"));
     EXPECT_EQ(field(0), QStringLiteral("12.00")) << "refused before Allow Changes";

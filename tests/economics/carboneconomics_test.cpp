@@ -142,18 +142,5 @@ TEST_F(CarbonEconomicsTest, BeforeTheFinalCutTheTreesOfTheRowsOnly) {
     EXPECT_FALSE(charts::reportContent(work).carbon) << "no account before the final cut";
 }
 
-TEST_F(CarbonEconomicsTest, CarbonPriceSpreadOutOfRangeIsRefused) {
-    prices.data().carbon.pricing = {56.0, carbon::Payment::kUnits};
-    typeRotation();
-    valueAt3Percent();
-    const QString before = shown(EconomicsControl::lblMonteCarlo);
-    economics.typeText(EconomicsControl::txtCarbonSpread, QStringLiteral("150"));
-    economics.cmdMonteCarlo_Click();
-    ASSERT_EQ(interactive.messages.size(), 1);
-    EXPECT_EQ(interactive.messages[0].text, economics::economicstext::faultSpread());
-    EXPECT_EQ(view.focused(), EconomicsControl::txtCarbonSpread);
-    EXPECT_EQ(shown(EconomicsControl::lblMonteCarlo), before);
-}
-
 } // namespace
 } // namespace arbolex::testing

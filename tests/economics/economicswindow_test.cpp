@@ -120,8 +120,7 @@ TEST_F(EconomicsWindowTest, FiguresAreTheRotationLibrarysForTheTablesRotation) {
 TEST_F(EconomicsWindowTest, StandTodayIsWorthWhatTheNetPresentValueWindowSays) {
     // The costs a new work starts with, as shipped.
     work.resetCosts();
-    const double planting = work.establishmentCost();
-    ASSERT_GT(planting, 0.0);
+    ASSERT_GT(work.establishmentCost(), 0.0);
     economics::NpvWindowLogic &npv = session.npv();
     struct Table {
         std::vector<int> ages;
@@ -157,17 +156,8 @@ TEST_F(EconomicsWindowTest, StandTodayIsWorthWhatTheNetPresentValueWindowSays) {
         EXPECT_EQ(shown.irr.outcome, valuation::IrrOutcome::kRoot);
         ASSERT_TRUE(shown.breakEvenPriceFactor.has_value());
         EXPECT_GT(*shown.breakEvenPriceFactor, 0.0);
-
-        // The establishment cost counts in the bare land's figures only.
-        economics.typeText(EconomicsControl::txtEstablishmentCost, QStringLiteral("0"));
-        economics.cmdCompute_Click();
-        EXPECT_EQ(work.establishmentCost(), 0.0) << "the typed cost is the work's";
-        EXPECT_EQ(economics.value()->npv, shown.npv);
-        const double qR = std::pow(1.05, t.finalCut);
-        EXPECT_NEAR(*economics.value()->lev - *shown.lev, planting * qR / (qR - 1.0), 1e-6);
-        EXPECT_EQ(economics.value()->irr.outcome, valuation::IrrOutcome::kRoot)
-            << "the typed cost of age 16 still comes before the revenues";
-        work.resetCosts();
+        // That the establishment cost counts in the bare land's figures only
+        // is the rotation library's (rotation_test.cpp).
     }
 }
 
@@ -188,38 +178,7 @@ TEST_F(EconomicsWindowTest, CostsAreInputsOfTheWork) {
     EXPECT_EQ(announced, 1);
     economics.cmdCompute_Click();
     EXPECT_EQ(announced, 1) << "the same costs again change nothing";
-
-    // A document written before the work had costs takes the defaults, and
-    // the window shows them.
-    prices.data().costs = {3045.0, 0.0};
-    work::WorkSnapshot older = work.snapshot();
-    older.establishmentCost.reset();
-    older.annualCost.reset();
-    logic.restore(older);
-    EXPECT_EQ(work.establishmentCost(), 3045.0);
-    EXPECT_EQ(work.annualCost(), 0.0);
-    EXPECT_EQ(view.text(EconomicsControl::txtEstablishmentCost), QStringLiteral("3045"));
-    EXPECT_EQ(view.text(EconomicsControl::txtAnnualCost), QStringLiteral("0"));
-}
-
-TEST_F(EconomicsWindowTest, TypedCashFlowCountsForTheOptimiserAndStaysOnApply) {
-    typeRotation({20}, {QStringLiteral("40")}, 40);
-    session.npv().Form_Load();
-    session.npv().typeInCell(2, work::kCfCost, QStringLiteral("1200")); // age 16
-    economics.cmdEconomics_Click();
-    ASSERT_EQ(economics.economics().entries.size(), 1u);
-    EXPECT_EQ(economics.economics().entries.front().age, 16);
-    EXPECT_TRUE(view.text(EconomicsControl::lblRate).contains(QStringLiteral("costs 1,200 €/ha")))
-        << view.text(EconomicsControl::lblRate).toStdString();
-    economics.cmdOptimise_Click();
-    ASSERT_FALSE(economics.regimes().empty());
-    const rotation::Candidate best = economics.regimes().front();
-    economics.cmdApply_Click(1);
-    ASSERT_TRUE(work.felled());
-    EXPECT_EQ(work.cashFlow().matrix(work::kCfCost, 1), 1200.0);
-    ASSERT_TRUE(economics.yourRegime());
-    EXPECT_DOUBLE_EQ(economics.yourRegime()->lev, best.lev);
-    EXPECT_EQ(economics.regimes().size(), 5u) << "the same stand and money keep the regimes";
+    // A document written before the work had costs: document_test.cpp.
 }
 
 TEST_F(EconomicsWindowTest, IrregularThinningsAreValuedAsTheirMeansAndSaidSo) {
@@ -251,15 +210,18 @@ TEST_F(EconomicsWindowTest, BadInputIsRefusedAndKeepsWhatIsShown) {
         QString typed;
         EconomicsControl command;
         QString message;
+        EconomicsControl focus;
     } cases[] = {
         {EconomicsControl::txtInterestRate, QStringLiteral("0"), EconomicsControl::cmdCompute,
-         economics::economicstext::faultRate()},
+         economics::economicstext::faultRate(), EconomicsControl::txtInterestRate},
         {EconomicsControl::txtAnnualCost, QStringLiteral("-5"), EconomicsControl::cmdCompute,
-         economics::economicstext::faultCost()},
+         economics::economicstext::faultCost(), EconomicsControl::txtAnnualCost},
         {EconomicsControl::txtDraws, QStringLiteral("5"), EconomicsControl::cmdMonteCarlo,
-         economics::economicstext::faultDraws()},
+         economics::economicstext::faultDraws(), EconomicsControl::txtDraws},
         {EconomicsControl::txtRateHigh, QStringLiteral("1"), EconomicsControl::cmdMonteCarlo,
-         economics::economicstext::faultRateRange()},
+         economics::economicstext::faultRateRange(), EconomicsControl::txtRateLow},
+        {EconomicsControl::txtCarbonSpread, QStringLiteral("150"), EconomicsControl::cmdMonteCarlo,
+         economics::economicstext::faultSpread(), EconomicsControl::txtCarbonSpread},
     };
     for (const auto &c : cases) {
         const QString before = view.text(c.field);
@@ -268,6 +230,7 @@ TEST_F(EconomicsWindowTest, BadInputIsRefusedAndKeepsWhatIsShown) {
         economics.press(c.command);
         ASSERT_EQ(interactive.messages.size(), 1) << c.typed.toStdString();
         EXPECT_EQ(interactive.messages.front().text, c.message);
+        EXPECT_EQ(view.focused(), c.focus);
         EXPECT_EQ(view.text(EconomicsControl::lblNPV), npv);
         EXPECT_EQ(economics.monteCarlo()->histogram.empty() ? 0 : 1, draws);
         economics.typeText(c.field, before);
@@ -291,9 +254,15 @@ TEST_F(EconomicsWindowTest, CancelStopsTheOptimiser) {
     EXPECT_FALSE(view.isEnabled(EconomicsControl::cmdCancel));
 }
 
-TEST_F(EconomicsWindowTest, ApplyWritesTheTableAUserWouldType) {
+TEST_F(EconomicsWindowTest, ApplyWritesTheTableAUserWouldTypeAndKeepsTheTypedCashFlow) {
     typeRotation({20}, {QStringLiteral("40")}, 40);
+    session.npv().Form_Load();
+    session.npv().typeInCell(2, work::kCfCost, QStringLiteral("1200")); // age 16
     economics.cmdEconomics_Click();
+    ASSERT_EQ(economics.economics().entries.size(), 1u);
+    EXPECT_EQ(economics.economics().entries.front().age, 16);
+    EXPECT_TRUE(view.text(EconomicsControl::lblRate).contains(QStringLiteral("costs 1,200 €/ha")))
+        << view.text(EconomicsControl::lblRate).toStdString();
     economics.cmdOptimise_Click();
     ASSERT_EQ(economics.regimes().size(), 5u);
     EXPECT_EQ(view.progress().back(), 1.0);
@@ -309,6 +278,11 @@ TEST_F(EconomicsWindowTest, ApplyWritesTheTableAUserWouldType) {
     const rotation::Candidate chosen = economics.regimes()[static_cast<std::size_t>(rank - 1)];
     economics.cmdApply_Click(rank);
     const std::vector<QStringList> applied = tableCells();
+    // The typed cost stays, and the applied regime scores as the optimiser said.
+    EXPECT_EQ(work.cashFlow().matrix(work::kCfCost, 1), 1200.0);
+    ASSERT_TRUE(economics.yourRegime());
+    EXPECT_DOUBLE_EQ(economics.yourRegime()->lev, chosen.lev);
+    EXPECT_EQ(economics.regimes().size(), 5u) << "the same stand and money keep the regimes";
 
     // The same regime typed by hand.
     std::vector<int> ages;
@@ -322,14 +296,11 @@ TEST_F(EconomicsWindowTest, ApplyWritesTheTableAUserWouldType) {
     EXPECT_EQ(tableCells(), applied);
     EXPECT_TRUE(work.felled());
 
-    // The window now values the applied regime: it scores as the optimiser said.
+    // The window now reads the regime from the table.
     economics.cmdCompute_Click();
     EXPECT_EQ(economics.regime().thinFrom, chosen.regime.thinFrom);
     EXPECT_EQ(economics.regime().thinUntil, chosen.regime.thinUntil);
     EXPECT_EQ(economics.rotationAge(), chosen.rotation);
-    ASSERT_TRUE(economics.yourRegime());
-    EXPECT_DOUBLE_EQ(economics.yourRegime()->lev, chosen.lev);
-    EXPECT_EQ(economics.regimes().size(), 5u) << "the same stand and money keep the regimes";
 }
 
 } // namespace

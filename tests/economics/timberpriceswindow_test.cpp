@@ -1,10 +1,12 @@
 // The timber prices window's logic: the key filter of the price fields,
 // accepting the user's prices, the option buttons, the red of negative prices,
-// and what reaches the files at exit.
+// and what reaches the files at exit. Opening and closing the window are
+// checked through its widgets (tests/ui/timberpriceswindow_test.cpp).
 #include "mocks/programservices.hpp"
 #include "shell/testfiles.hpp"
 #include "workflow/mainwindowfixture.hpp"
 
+#include "economics/assortpriceswindowlogic.hpp"
 #include "economics/headlesstimberpricesview.hpp"
 #include "economics/timberpricesmessages.hpp"
 #include "economics/timberpriceswindowlogic.hpp"
@@ -98,21 +100,6 @@ INSTANTIATE_TEST_SUITE_P(
         KeyCase{"Minus", true, 13, "", u'-', false}, KeyCase{"Letter", true, 13, "", u'e', false},
         KeyCase{"Comma", true, 13, "1", u',', false}, KeyCase{"Blank", true, 13, "1", u' ', false}),
     [](const ::testing::TestParamInfo<KeyCase> &param) { return param.param.name; });
-
-TEST_F(TimberPricesLogicTest, TypingGoesThroughTheFilterOnlyInAllowedFields) {
-    window.typeText(kFirstUserField, QStringLiteral("99"));
-    EXPECT_EQ(field(kFirstUserField), QStringLiteral("20.00")) << "typed before Allow Changes";
-
-    window.cmdChangePrices_Click();
-    window.typeText(kFirstUserField, QStringLiteral("1x2.5.3-"));
-    EXPECT_EQ(field(kFirstUserField), QStringLiteral("12.53"));
-    window.typeText(kFirstUserField + 1, QString());
-    EXPECT_EQ(field(kFirstUserField + 1), QString());
-    window.typeText(0, QStringLiteral("99"));
-    window.typeText(40, QString());
-    EXPECT_EQ(field(0), QStringLiteral("10.00"));
-    EXPECT_EQ(field(40), QStringLiteral("41.00"));
-}
 
 // ---- Allow and accept -----------------------------------------------------------------------
 
@@ -208,13 +195,10 @@ TEST_F(TimberPricesLogicTest, ShowsEveryListWithNegativePricesInRed) {
         red += view.isNegative(f) ? 1 : 0;
     }
     EXPECT_EQ(red, 2);
-
-    EXPECT_EQ(view.text({TimberPricesControl::lblTimbCat, 0}), QStringLiteral("Up to .074:"));
-    EXPECT_EQ(view.text({TimberPricesControl::lblTimbCat, 12}), QStringLiteral("1.000 and Over:"));
+    // The private lists' period is the file's.
     EXPECT_EQ(view.text({TimberPricesControl::lblOVRA_TP, 0}),
               QStringLiteral("Average private sector standing roundwood prices (\u20ac / m3) for "
                              "the period\nJanuary 2025 to December 2025"));
-    EXPECT_EQ(view.caption(), QStringLiteral("Timber Prices"));
 }
 
 TEST_F(TimberPricesLogicTest, AcceptingANegativeUserPriceOverTypedLeavesTheRed) {
@@ -226,14 +210,6 @@ TEST_F(TimberPricesLogicTest, AcceptingANegativeUserPriceOverTypedLeavesTheRed) 
     window.cmdChangePrices_Click();
     EXPECT_FALSE(view.isNegative(kFirstUserField + 2));
     EXPECT_EQ(prices.data().userDefined[2], 3.0);
-}
-
-TEST_F(TimberPricesLogicTest, CloseHidesTheWindow) {
-    window.show();
-    ASSERT_TRUE(view.isShown());
-    ASSERT_TRUE(window.press(TimberPricesControl::cmdClosePricesList));
-    EXPECT_FALSE(view.isShown());
-    EXPECT_FALSE(window.press(TimberPricesControl::lblNote2));
 }
 
 TEST(TimberPricesControlNames, ArraysCarryTheirIndexWithinBounds) {
@@ -264,14 +240,6 @@ protected:
     economics::TimberPricesWindowLogic &window = session.timberPrices();
 };
 
-TEST_F(TimberPricesMainTest, ShowTimberPricesOpensTheWindowOnTheListsRead) {
-    logic.cmdShowTimberPrice_Click();
-    EXPECT_TRUE(pricesView.isShown());
-    EXPECT_EQ(pricesView.text(priceField(0)), QStringLiteral("4.10"));
-    EXPECT_EQ(pricesView.text(priceField(51)), QStringLiteral("51.60"));
-    EXPECT_TRUE(pricesView.isChecked(TimberPricesControl::OptCurentPrices));
-}
-
 TEST_F(TimberPricesMainTest, AnEditWrittenAtExitNeverTheAssociationsPrices) {
     const QByteArray privateBefore = readBytes(file("OVRA_PRIC.qdm"));
     logic.cmdShowTimberPrice_Click();
@@ -281,8 +249,15 @@ TEST_F(TimberPricesMainTest, AnEditWrittenAtExitNeverTheAssociationsPrices) {
     window.typeText(40, QStringLiteral("1")); // a private-sector field: refused
     window.cmdChangePrices_Click();
     writeBytes(file("OVRA_PRIC.qdm"), privateBefore + "tampered");
+    // The assortment prices, opened from this window, are written too.
+    window.press(TimberPricesControl::cmdAssortPrices);
+    economics::AssortPricesWindowLogic &assort = session.assortPrices();
+    assort.cmdChangeAsmtPrices_Click();
+    assort.typeText(2, QStringLiteral("55"));
+    assort.cmdChangeAsmtPrices_Click();
 
     logic.Form_Unload(settings);
+    EXPECT_EQ(readBytes(file("AssortPrices.qdm")), QByteArray("10\r\n28\r\n55\r\n"));
     EXPECT_EQ(readBytes(file("USRPRIC.qdm")),
               QByteArray("12.5\r\n0\r\n12\r\n16\r\n20\r\n24\r\n28\r\n32\r\n36\r\n40\r\n44\r\n48\r\n"
                          "52\r\n"));

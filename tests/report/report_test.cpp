@@ -107,7 +107,6 @@ TEST_F(ReportTest, EconomicsPageOnlyWhileTheEconomicsWindowShowsTheTablesFigures
     ASSERT_TRUE(content.economics.has_value());
     const charts::EconomicsPage &page = *content.economics;
     EXPECT_EQ(page.title, QStringLiteral("Economics of the rotation at 5.00 % a year"));
-    // The figures as the window shows them, in its order.
     // The figures as the window shows them, in its order, then timber and carbon.
     const std::size_t valueFigures = economics::valueFigures().size();
     ASSERT_EQ(page.figures.size(), valueFigures + 3);
@@ -143,7 +142,7 @@ TEST_F(ReportTest, EconomicsPageOnlyWhileTheEconomicsWindowShowsTheTablesFigures
     EXPECT_TRUE(interactive.messages.isEmpty());
 }
 
-TEST_F(ReportTest, UnwritableFilesAreRefused) {
+TEST_F(ReportTest, ChartsExportAsPngAndSvgAndUnwritableFilesAreRefused) {
     closeRotation();
     const charts::ReportContent content = charts::reportContent(work);
     const QString nowhere = path(QStringLiteral("no-such-folder/file"));
@@ -152,11 +151,7 @@ TEST_F(ReportTest, UnwritableFilesAreRefused) {
                                       QSize(400, 300)));
     EXPECT_FALSE(report::saveChartSvg(content.standChart, nowhere + QStringLiteral(".svg"),
                                       QSize(400, 300)));
-}
 
-TEST_F(ReportTest, ChartsExportAsPngAndSvg) {
-    closeRotation();
-    const charts::ReportContent content = charts::reportContent(work);
     const QString png = path(QStringLiteral("stand.png"));
     ASSERT_TRUE(report::saveChartPng(content.standChart, png, QSize(640, 420)));
     const QImage image(png);
@@ -280,27 +275,15 @@ TEST_F(ReportCommandTest, ScriptThatValuedTheRotationAddsTheEconomicsPage) {
     // rotation comes after it, in both reports.
     int economicsPage = 0;
     for (int p = 1; p <= pages && economicsPage == 0; ++p) {
-        if (pdfText(valued, p, p).contains(QStringLiteral("Economics of the rotation at"))) {
+        if (pdfText(valued, p, p)
+                .contains(QStringLiteral("Economics of the rotation at 3.00 % a year"))) {
             economicsPage = p;
         }
     }
     ASSERT_GT(economicsPage, 0);
-    const QString shownPage = pdfText(valued, economicsPage, economicsPage);
-    for (const QString &shown : {QStringLiteral("Economics of the rotation at 3.00 % a year"),
-                                 QStringLiteral("Land expectation value"),
-                                 QStringLiteral("NPV, LEV and MAI by rotation age"),
-                                 QStringLiteral("regimes of the largest LEV at 3.00 % a year"),
-                                 economics::economicstext::regimeYours(),
-                                 QStringLiteral("Page %1 of %2").arg(economicsPage).arg(pages)}) {
-        EXPECT_TRUE(shownPage.contains(shown)) << shown.toStdString() << " not in\n"
-                                               << shownPage.toStdString();
-    }
-    const QString carbon = pdfText(valued, economicsPage + 1, pages);
-    for (const QString &shown :
-         {QStringLiteral("Carbon account of the rotation"), QStringLiteral("IPCC 2006"),
-          QStringLiteral("Units issued"), QStringLiteral("Page %1 of %1").arg(pages)}) {
-        EXPECT_TRUE(carbon.contains(shown)) << shown.toStdString() << " not in the carbon pages";
-    }
+    // Its figures are the window's (ReportTest); the carbon account follows.
+    EXPECT_TRUE(pdfText(valued, economicsPage + 1, pages)
+                    .contains(QStringLiteral("Carbon account of the rotation")));
 }
 #endif
 

@@ -42,14 +42,6 @@ TEST_F(ThinningTest, OnlyTheLastSingleGrowthRowMayBeThinned) {
     EXPECT_TRUE(interactive.questions.isEmpty()) << "no loop offer before the first thinning";
 }
 
-TEST_F(ThinningTest, UnthinnedModelOffersNoThinning) {
-    logic.mnuModel_Click(1);
-    growTo(QStringLiteral("30"));
-    logic.cmdThin_Click();
-    EXPECT_FALSE(thinView.isShown());
-    EXPECT_FALSE(view.isEnabled(MainControl::cmdThin));
-}
-
 struct FieldFault {
     const char *name;
     ThinControl control;

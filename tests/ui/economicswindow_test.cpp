@@ -20,10 +20,6 @@ namespace {
 
 using economics::EconomicsControl;
 
-void click(QWidget *button) {
-    qobject_cast<QAbstractButton *>(button)->click();
-}
-
 /// The stand of the start-up file grown to 45 and the economics window open on it.
 class EconomicsWindowGuiTest : public MainWindowGuiTest {
 protected:

@@ -10,6 +10,7 @@
 #include "ui/mainwindow.hpp"
 #include "workflow/mainwindowlogic.hpp"
 
+#include <QAbstractButton>
 #include <QApplication>
 #include <QDir>
 #include <QFile>
@@ -37,6 +38,11 @@ inline void typeKeys(QWidget *widget, const QString &text) {
     for (const QChar c : text) {
         pressKey(widget, c.toUpper().unicode(), QString(c));
     }
+}
+
+/// Clicks a button of a window.
+inline void click(QWidget *button) {
+    qobject_cast<QAbstractButton *>(button)->click();
 }
 
 /// The desktop program's windows on the screen (offscreen) over one session,

@@ -71,8 +71,6 @@ TEST(ToolWindowTest, EscapeAndTheCloseButtonRunTheLogicsClosingCommandOnly) {
     FakeToolWindow window;
     FakeToolLogic logic;
     logic.view = &window;
-    EXPECT_EQ(window.objectName(), QStringLiteral("frmFake"));
-    EXPECT_FALSE(window.isModal());
 
     // Before there is a logic, Escape is a plain dialog's.
     window.show();
