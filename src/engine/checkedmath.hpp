@@ -48,6 +48,12 @@ inline double finite(double r, unsigned line = __builtin_LINE()) {
 
 /// base^exponent in double precision.
 inline double pow(double base, double exponent, unsigned line = __builtin_LINE()) {
+    // x^0 is exactly 1 for every x (std::pow gives 1 even for a NaN base) and
+    // can fail no check: many models' transforms have terms raised to 0,
+    // which need no call.
+    if (exponent == 0.0) {
+        return 1.0;
+    }
     if (base < 0.0 && exponent != std::trunc(exponent)) {
         raiseFault(kInvalidCall, line);
     }
@@ -100,6 +106,9 @@ inline float single(double x, unsigned line = __builtin_LINE()) {
 class PowerMemo {
 public:
     double operator()(double base, double exponent, unsigned line = __builtin_LINE()) {
+        if (exponent == 0.0) {
+            return 1.0; // as pow gives it, without taking a slot
+        }
         const auto b = std::bit_cast<std::uint64_t>(base);
         const auto x = std::bit_cast<std::uint64_t>(exponent);
         std::size_t oldest = 0;

@@ -2,7 +2,10 @@
 // solve for a residual volume.
 #include "recordingreport.hpp"
 
+#include <bit>
 #include <cmath>
+#include <cstdint>
+#include <limits>
 #include <utility>
 #include <vector>
 
@@ -155,6 +158,22 @@ TEST(PowerMemoTest, KeepsOnlyPowersThatSucceeded) {
     EXPECT_EQ(pow(-0.0, 3.0), std::pow(-0.0, 3.0));
     EXPECT_TRUE(std::signbit(pow(-0.0, 3.0)));
     EXPECT_FALSE(std::signbit(pow(0.0, 3.0)));
+}
+
+// A power to 0 is answered without the library: it must be the library's
+// answer for every base, and fail no check where the library call would not.
+TEST(PowerMemoTest, ZeroExponentIsTheLibrarysOneForEveryBase) {
+    checked::PowerMemo memo;
+    const double inf = std::numeric_limits<double>::infinity();
+    for (const double base :
+         {0.0, -0.0, -2.5, 1e-310, 3.0, inf, -inf, std::numeric_limits<double>::quiet_NaN()}) {
+        for (const double zero : {0.0, -0.0}) {
+            EXPECT_EQ(std::bit_cast<std::uint64_t>(checked::pow(base, zero)),
+                      std::bit_cast<std::uint64_t>(std::pow(base, zero)))
+                << base;
+            EXPECT_EQ(memo(base, zero), std::pow(base, zero)) << base;
+        }
+    }
 }
 
 } // namespace
