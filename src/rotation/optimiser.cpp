@@ -68,8 +68,7 @@ public:
                 growPath(m_quiet, m_stand, regime, failure, &m_limits)) {
             // Valued by assortments or with its carbon, every final cut reads
             // the thinnings' classes: divided once for all of them.
-            if (m_economics.valuation == Valuation::kAssortments || m_economics.carbon.counts() ||
-                m_settings.objective == Objective::kCarbon) {
+            if (readsThinningClasses(m_economics) || m_settings.objective == Objective::kCarbon) {
                 divideThinnings(*path);
             }
             scorePath(*path, regime);

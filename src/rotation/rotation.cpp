@@ -453,11 +453,16 @@ void divideThinnings(GrowthPath &path) {
     path.thinningsDivided = true;
 }
 
+bool readsThinningClasses(const Economics &economics) {
+    return economics.valuation == Valuation::kAssortments || economics.carbon.counts();
+}
+
 RotationHarvests rotationHarvests(const GrowthPath &path, int rotation) {
     RotationHarvests h;
     h.model = path.model;
     h.presentAge = path.presentAge;
     h.rotation = rotation;
+    h.standing.reserve(static_cast<std::size_t>(std::max(0, rotation - path.presentAge + 1)));
     for (int a = path.presentAge; a <= rotation; ++a) {
         h.standing.push_back(path.at(a).volume);
     }
@@ -556,9 +561,17 @@ int firstRotation(const GrowthPath &path, const Regime &regime) {
     return std::max({path.presentAge, last ? *last + 1 : 0, 1});
 }
 
-RotationExplorer exploreRotations(const GrowthPath &path, const Regime &regime,
+RotationExplorer exploreRotations(const GrowthPath &given, const Regime &regime,
                                   const Economics &economics) {
     engine::clearUpperVectorState();
+    // Every final cut reads the thinnings' classes: divided once here, not
+    // again at every age.
+    std::optional<GrowthPath> divided;
+    if (!given.thinningsDivided && !given.thinnings.empty() && readsThinningClasses(economics)) {
+        divided = given;
+        divideThinnings(*divided);
+    }
+    const GrowthPath &path = divided ? *divided : given;
     RotationExplorer e;
     double bestMai = -std::numeric_limits<double>::infinity();
     double bestLev = -std::numeric_limits<double>::infinity();

@@ -251,6 +251,11 @@ int pathYieldClass(const GrowthPath &path);
 /// again for every final-cut age.
 void divideThinnings(GrowthPath &path);
 
+/// True when valuing a final cut under `economics` reads the thinnings'
+/// assortment classes (valued by assortments, or with carbon money): a path
+/// valued at many ages then wants divideThinnings first.
+bool readsThinningClasses(const Economics &economics);
+
 /// One year of the cash flow of a rotation from bare land, euro/ha.
 struct CashFlowYear {
     int age = 0;
