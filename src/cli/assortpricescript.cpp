@@ -8,10 +8,6 @@ namespace {
 
 constexpr QLatin1String kWindow("frmAssortPrices.");
 
-QString noControl(const QString &what, const QString &control) {
-    return QStringLiteral("no ") + what + QStringLiteral(" named '") + control + QLatin1Char('\'');
-}
-
 /// "frmAssortPrices.txtAsmtVal(1)" → the control, if the name is of that window.
 std::optional<std::optional<economics::AssortPricesItem>> item(const QString &control) {
     if (!control.startsWith(kWindow)) {

@@ -11,10 +11,6 @@ namespace {
 constexpr QLatin1String kReportWindow("frmAssort");
 constexpr QLatin1String kUserWindow("frmAssortUser.");
 
-QString noControl(const QString &what, const QString &control) {
-    return QStringLiteral("no ") + what + QStringLiteral(" named '") + control + QLatin1Char('\'');
-}
-
 /// "frmAssortUser.txtName(1)" → the control, if the name is of that window.
 std::optional<std::optional<assortments::AssortUserControlRef>>
 userControl(const QString &control) {

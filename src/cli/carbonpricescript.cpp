@@ -12,10 +12,6 @@ constexpr QLatin1String kWindow("frmCarbonPrice.");
 
 using economics::CarbonPriceControl;
 
-QString noControl(const QString &what, const QString &control) {
-    return QStringLiteral("no ") + what + QStringLiteral(" named '") + control + QLatin1Char('\'');
-}
-
 /// "frmCarbonPrice.txtCarbonPrice" → the control, if the name is of that window.
 std::optional<std::optional<CarbonPriceControl>> item(const QString &control) {
     if (!control.startsWith(kWindow)) {

@@ -13,10 +13,6 @@ constexpr QLatin1String kWindow("frmEconomics");
 
 using economics::EconomicsControl;
 
-QString noControl(const QString &what, const QString &control) {
-    return QStringLiteral("no ") + what + QStringLiteral(" named '") + control + QLatin1Char('\'');
-}
-
 QString windowClosed(const QString &control) {
     return QStringLiteral("'") + control +
            QStringLiteral("': the economics window is not open (press cmdEconomics)");

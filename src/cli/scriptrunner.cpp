@@ -238,7 +238,7 @@ QString ScriptRunner::set(const QString &control, const QString &text) {
         const std::vector<QStringList> &grid = m_session.npv().grid();
         const auto row = static_cast<std::size_t>(cell->first);
         if (row >= grid.size() || cell->second >= grid[row].size()) {
-            return QStringLiteral("no cell named '") + control + QLatin1Char('\'');
+            return noControl(QStringLiteral("cell"), control);
         }
         m_session.npv().typeInCell(cell->first, cell->second, text);
         return {};
@@ -249,7 +249,7 @@ QString ScriptRunner::set(const QString &control, const QString &text) {
     }
     if (const auto prices = timberPricesItem(control)) {
         if (prices->control != economics::TimberPricesControl::txtTimbVal) {
-            return QStringLiteral("no field named '") + control + QLatin1Char('\'');
+            return noControl(QStringLiteral("field"), control);
         }
         m_session.timberPrices().typeText(prices->index, text);
         return {};
@@ -268,14 +268,14 @@ QString ScriptRunner::set(const QString &control, const QString &text) {
     }
     if (const auto thin = thinControl(control)) {
         if (!thinning::isThinField(*thin)) {
-            return QStringLiteral("no field named '") + control + QLatin1Char('\'');
+            return noControl(QStringLiteral("field"), control);
         }
         m_session.thinning().typeText(*thin, text);
         return {};
     }
     const auto main = workflow::mainControlFromName(control);
     if (!main || !workflow::isNumericField(*main)) {
-        return QStringLiteral("no field named '") + control + QLatin1Char('\'');
+        return noControl(QStringLiteral("field"), control);
     }
     m_session.main().typeText(*main, text);
     return {};
@@ -289,7 +289,7 @@ QString ScriptRunner::press(const QString &control) {
     }
     if (const auto prices = timberPricesItem(control)) {
         if (!m_session.timberPrices().press(prices->control)) {
-            return QStringLiteral("no command named '") + control + QLatin1Char('\'');
+            return noControl(QStringLiteral("command"), control);
         }
         return {};
     }
@@ -307,7 +307,7 @@ QString ScriptRunner::press(const QString &control) {
     }
     if (const auto thin = thinControl(control)) {
         if (!m_session.thinning().press(*thin)) {
-            return QStringLiteral("no command named '") + control + QLatin1Char('\'');
+            return noControl(QStringLiteral("command"), control);
         }
         return {};
     }
@@ -316,13 +316,13 @@ QString ScriptRunner::press(const QString &control) {
             return npvWindowClosed(control);
         }
         if (!m_session.npv().press(*npv)) {
-            return QStringLiteral("no command named '") + control + QLatin1Char('\'');
+            return noControl(QStringLiteral("command"), control);
         }
         return {};
     }
     const auto found = m_commands.find(control);
     if (found == m_commands.end()) {
-        return QStringLiteral("no command named '") + control + QLatin1Char('\'');
+        return noControl(QStringLiteral("command"), control);
     }
     // A switched-off button cannot be pressed, on the screen or here.
     const auto main = workflow::mainControlFromName(control);
@@ -396,7 +396,7 @@ QString ScriptRunner::print(const QString &control) {
     }
     const auto main = workflow::mainControlFromName(control);
     if (!main) {
-        return QStringLiteral("no control named '") + control + QLatin1Char('\'');
+        return noControl(QStringLiteral("control"), control);
     }
     m_out << m_session.mainView().text(*main) << '\n';
     return {};

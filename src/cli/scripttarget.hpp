@@ -11,6 +11,11 @@
 
 namespace arbolex::cli {
 
+/// A script's line names no such control: "no field named 'frmThin.txtX'".
+inline QString noControl(const QString &what, const QString &control) {
+    return QStringLiteral("no ") + what + QStringLiteral(" named '") + control + QLatin1Char('\'');
+}
+
 class ScriptTarget {
 public:
     virtual ~ScriptTarget() = default;
