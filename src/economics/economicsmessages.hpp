@@ -225,6 +225,11 @@ inline QString breakEvenNone() {
     return QStringLiteral("none: the timber earns nothing");
 }
 
+/// Carbon and other revenues alone pay for the land.
+inline QString breakEvenLandPays() {
+    return QStringLiteral("none: the land pays without timber revenue");
+}
+
 // ---- Captions of the panels, charts and tables ---------------------------------------
 
 /// "at 3.00 % a year": every panel names the rate its figures used.

@@ -128,8 +128,7 @@ QString breakEvenText(const std::optional<double> &factor) {
     }
     const double k = *factor;
     if (k <= 0.0) {
-        // Carbon and other revenues alone pay for the land.
-        return QStringLiteral("none: the land pays without timber revenue");
+        return economicstext::breakEvenLandPays();
     }
     const QString times = quantityText(k, 2) + QStringLiteral(" × today's prices");
     if (k <= 1.0) {
@@ -295,6 +294,10 @@ void EconomicsWindowLogic::cmdCompute_Click() {
             if (!m_path) {
                 clearFigures(QString::fromStdString(failure.text));
                 return;
+            }
+            if (rotation::readsThinningClasses(m_economics)) {
+                // Once for the explorers, the valuation and the draws.
+                rotation::divideThinnings(*m_path);
             }
             m_explorer = rotation::exploreRotations(*m_path, m_table.regime, m_economics);
             m_economicWithoutCarbon = 0;
