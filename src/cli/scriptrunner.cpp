@@ -161,7 +161,7 @@ QString ScriptRunner::runLine(const QString &rawLine) {
         // drawn: "TIME<TAB>line<TAB>milliseconds".
         QElapsedTimer timer;
         timer.start();
-        const QString error = runLine(rest);
+        QString error = runLine(rest);
         m_session.settle();
         const double ms = static_cast<double>(timer.nsecsElapsed()) / 1e6;
         m_out << "TIME\t" << rest << '\t' << QString::number(ms, 'f', 1) << '\n';
