@@ -46,14 +46,6 @@ protected:
         }
     }
 
-    std::vector<QStringList> tableCells() const {
-        std::vector<QStringList> all;
-        for (int r = 1; r <= logic.table().lastRow(); ++r) {
-            all.push_back(logic.table().row(r).cells);
-        }
-        return all;
-    }
-
     economics::HeadlessEconomicsView &view = economicsView;
     economics::EconomicsWindowLogic &economics = session.economics();
 };

@@ -35,6 +35,13 @@ protected:
         logic.cmdThin_Click();
     }
 
+    /// Opens the thinning window at 30 and previews a removal of `volume` m³/ha.
+    void previewThinning(const QString &volume = QStringLiteral("60")) {
+        openThinning();
+        typeThin(ThinControl::txtRemV, volume);
+        thin.cmdThin_Click();
+    }
+
     void typeThin(ThinControl c, const QString &text) { thin.typeText(c, text); }
     float number(ThinControl c) const { return static_cast<float>(shell::val(thinView.text(c))); }
 
