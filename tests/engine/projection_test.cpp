@@ -275,12 +275,6 @@ TEST_F(ProjectionTest, FailedInversionKeepsTheStatesSoFar) {
     }
 }
 
-} // namespace
-} // namespace arbolex::engine::testing
-
-namespace arbolex::engine::testing {
-namespace {
-
 // One engine keeps its last rate, transition and step factors; whatever it
 // was asked before, it must project as an engine that was never asked
 // anything: a new model (or the same one chosen again, which clears S8) and a

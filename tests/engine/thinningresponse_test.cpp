@@ -121,12 +121,6 @@ TEST_F(ThinningFailureTest, NonPositiveVolumeFailsInAPowerAndIsReportedOnce) {
     }
 }
 
-} // namespace
-} // namespace arbolex::engine::testing
-
-namespace arbolex::engine::testing {
-namespace {
-
 // The thinning response keeps its last powers: a kept power must be the
 // power to the bit, an empty slot must match nothing, and a power that fails
 // must fail every time, on the line that asked for it.
