@@ -44,9 +44,7 @@ protected:
     QString path(const char *name) const { return m_work.filePath(QLatin1String(name)); }
 
     void writeInput(const char *name, const char *text) {
-        QFile file(path(name));
-        ASSERT_TRUE(file.open(QIODevice::WriteOnly));
-        file.write(text);
+        ASSERT_TRUE(arbolex::testing::writeBytes(path(name), text));
     }
 
     Outcome estate(const QString &input, const QString &out, QStringList more = {}) {

@@ -126,13 +126,10 @@ QString cli() {
 TEST(RunnerProcessTest, ExitStatusAndTheSavedStartupFile) {
     QTemporaryDir dir;
     ASSERT_TRUE(copyShippedData(dir.path()));
-    QFile script(dir.filePath(QStringLiteral("s.arb")));
-    ASSERT_TRUE(script.open(QIODevice::WriteOnly));
-    script.write("model 4\nset txtFromA 22\n");
-    script.close();
+    const QString script = dir.filePath(QStringLiteral("s.arb"));
+    ASSERT_TRUE(writeBytes(script, "model 4\nset txtFromA 22\n"));
     QProcess p;
-    p.start(cli(),
-            {QStringLiteral("run"), script.fileName(), QStringLiteral("--data-dir"), dir.path()});
+    p.start(cli(), {QStringLiteral("run"), script, QStringLiteral("--data-dir"), dir.path()});
     ASSERT_TRUE(p.waitForFinished());
     EXPECT_EQ(p.exitCode(), 0) << p.readAllStandardError().toStdString();
     QFile startup(dir.filePath(QStringLiteral("IFPRM1.dat")));
@@ -141,11 +138,8 @@ TEST(RunnerProcessTest, ExitStatusAndTheSavedStartupFile) {
     EXPECT_EQ(values.value(0).trimmed(), QByteArray("4")) << "the unload saved the model";
     EXPECT_EQ(values.value(1).trimmed(), QByteArray("22"));
 
-    script.open(QIODevice::WriteOnly);
-    script.write("model 4\nfrobnicate\n");
-    script.close();
-    p.start(cli(),
-            {QStringLiteral("run"), script.fileName(), QStringLiteral("--data-dir"), dir.path()});
+    ASSERT_TRUE(writeBytes(script, "model 4\nfrobnicate\n"));
+    p.start(cli(), {QStringLiteral("run"), script, QStringLiteral("--data-dir"), dir.path()});
     ASSERT_TRUE(p.waitForFinished());
     EXPECT_EQ(p.exitCode(), 2);
     EXPECT_TRUE(p.readAllStandardError().contains("s.arb:2:"));

@@ -7,6 +7,7 @@
 #include "document/documentcontroller.hpp"
 #include "estateio/gdallayer.hpp"
 #include "estatewindow/estatewindowlogic.hpp"
+#include "shell/testfiles.hpp"
 #include "shell/vbformat.hpp"
 
 #include <QCryptographicHash>
@@ -60,10 +61,8 @@ protected:
     }
 
     QString writeEstate(const char *name, const char *text) {
-        QString path = dir.filePath(QLatin1String(name));
-        QFile f(path);
-        EXPECT_TRUE(f.open(QIODevice::WriteOnly));
-        f.write(text);
+        const QString path = dir.filePath(QLatin1String(name));
+        EXPECT_TRUE(writeBytes(path, text));
         return path;
     }
 

@@ -10,6 +10,7 @@
 #include "prices/pricedata.hpp"
 #include "report/chartexport.hpp"
 #include "report/reportwriter.hpp"
+#include "shell/testfiles.hpp"
 
 #include <QDir>
 #include <QImage>
@@ -177,11 +178,8 @@ protected:
     ReportCommandTest() { EXPECT_TRUE(copyShippedData(dir.path())); }
 
     QString writeScript(const QString &name, const QByteArray &lines) const {
-        const QString script = path(name);
-        QFile file(script);
-        EXPECT_TRUE(file.open(QIODevice::WriteOnly));
-        file.write(lines);
-        return script;
+        EXPECT_TRUE(writeBytes(path(name), lines));
+        return path(name);
     }
 
     /// `arbolex-cli report ARGUMENTS` on the test's data folder: its exit
