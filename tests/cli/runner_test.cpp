@@ -132,9 +132,8 @@ TEST(RunnerProcessTest, ExitStatusAndTheSavedStartupFile) {
     p.start(cli(), {QStringLiteral("run"), script, QStringLiteral("--data-dir"), dir.path()});
     ASSERT_TRUE(p.waitForFinished());
     EXPECT_EQ(p.exitCode(), 0) << p.readAllStandardError().toStdString();
-    QFile startup(dir.filePath(QStringLiteral("IFPRM1.dat")));
-    ASSERT_TRUE(startup.open(QIODevice::ReadOnly));
-    const QList<QByteArray> values = startup.readAll().split('\n');
+    const QList<QByteArray> values =
+        readBytes(dir.filePath(QStringLiteral("IFPRM1.dat"))).split('\n');
     EXPECT_EQ(values.value(0).trimmed(), QByteArray("4")) << "the unload saved the model";
     EXPECT_EQ(values.value(1).trimmed(), QByteArray("22"));
 

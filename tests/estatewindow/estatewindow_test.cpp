@@ -25,10 +25,7 @@ QString exampleEstate() {
 }
 
 QByteArray digestOf(const QString &path) {
-    QFile f(path);
-    return f.open(QIODevice::ReadOnly)
-               ? QCryptographicHash::hash(f.readAll(), QCryptographicHash::Sha256)
-               : QByteArray();
+    return QCryptographicHash::hash(readBytes(path), QCryptographicHash::Sha256);
 }
 
 class EstateWindowTest : public ThinningTest {

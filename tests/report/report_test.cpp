@@ -23,11 +23,7 @@ namespace {
 
 /// Pages of a PDF file: its page objects.
 int pdfPages(const QString &path) {
-    QFile file(path);
-    if (!file.open(QIODevice::ReadOnly)) {
-        return -1;
-    }
-    const QString pdf = QString::fromLatin1(file.readAll());
+    const QString pdf = QString::fromLatin1(readBytes(path));
     if (!pdf.startsWith(QLatin1String("%PDF"))) {
         return -1;
     }
@@ -159,9 +155,7 @@ TEST_F(ReportTest, ChartsExportAsPngAndSvgAndUnwritableFilesAreRefused) {
     EXPECT_EQ(image.size(), QSize(1280, 840)) << "twice the size, sharp in print";
     const QString svg = path(QStringLiteral("cash.svg"));
     ASSERT_TRUE(report::saveChartSvg(content.cashFlowChart, svg, QSize(640, 420)));
-    QFile file(svg);
-    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
-    const QString drawing = QString::fromUtf8(file.readAll());
+    const QString drawing = QString::fromUtf8(readBytes(svg));
     EXPECT_TRUE(drawing.contains(QLatin1String("<svg")));
     EXPECT_TRUE(drawing.contains(QLatin1String("<path"))) << "lines stay vectors";
 }
