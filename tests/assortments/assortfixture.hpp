@@ -15,13 +15,6 @@ using assortments::AssortUserControl;
 /// categories windows attached, the shipped categories loaded.
 class AssortTest : public ThinningTest {
 protected:
-    /// Opens the thinning window at 30 and previews a removal of `volume` m³/ha.
-    void previewThinning(const QString &volume = QStringLiteral("60")) {
-        openThinning();
-        typeThin(ThinControl::txtRemV, volume);
-        thin.cmdThin_Click();
-    }
-
     /// The labels of the rows after the last thinning row.
     QStringList labelsAfterThinning() const {
         QStringList labels;

@@ -16,6 +16,12 @@ double shown(const assortments::HeadlessAssortView &v, AssortControl c) {
     return shell::val(v.text(c));
 }
 
+/// The volumes of the three classes the report shows, added up.
+double shownVolume(const assortments::HeadlessAssortView &v) {
+    return shown(v, AssortControl::lblVol714) + shown(v, AssortControl::lblVol1420) +
+           shown(v, AssortControl::lblVol20);
+}
+
 TEST_F(AssortTest, GrowthRowReportDividesItsVolume) {
     growTo(QStringLiteral("50"));
     logic.select(5, 5);
@@ -24,10 +30,7 @@ TEST_F(AssortTest, GrowthRowReportDividesItsVolume) {
     ASSERT_TRUE(assortView.isShown());
     EXPECT_EQ(assortView.caption(), QStringLiteral("Assortment at age 35"));
     EXPECT_EQ(assort.session().pending, QStringLiteral("0"));
-    const double sum = shown(assortView, AssortControl::lblVol714) +
-                       shown(assortView, AssortControl::lblVol1420) +
-                       shown(assortView, AssortControl::lblVol20);
-    EXPECT_NEAR(sum, logic.table().row(5).record.volume, 0.02);
+    EXPECT_NEAR(shownVolume(assortView), logic.table().row(5).record.volume, 0.02);
     EXPECT_NEAR(shown(assortView, AssortControl::lblPct714) +
                     shown(assortView, AssortControl::lblPct1420) +
                     shown(assortView, AssortControl::lblPct20),
@@ -162,10 +165,7 @@ TEST_F(AssortTest, ReopenedThinningReportsTheActualCropAfter) {
 TEST_F(AssortTest, RemovalRowAddsUpToTheRemovedVolume) {
     previewThinning(QStringLiteral("60"));
     thin.cmdAssort_Click(1);
-    const double sum = shown(assortView, AssortControl::lblVol714) +
-                       shown(assortView, AssortControl::lblVol1420) +
-                       shown(assortView, AssortControl::lblVol20);
-    EXPECT_NEAR(sum, 60.0, 0.02);
+    EXPECT_NEAR(shownVolume(assortView), 60.0, 0.02);
 }
 
 TEST_F(AssortTest, BackwardOrMissingThinningIsRefused) {
@@ -227,17 +227,15 @@ TEST_F(AssortTest, UserCategoriesReportAndDevelopment) {
 }
 
 TEST(AssortRowLabel, TestsRunInOrder) {
-    using assortments::AssortWindowLogic;
-    EXPECT_EQ(AssortWindowLogic::rowLabel(QStringLiteral("Crop assortment")),
-              QStringLiteral("AC yr"));
-    EXPECT_EQ(AssortWindowLogic::rowLabel(QStringLiteral("Pre-[Actual]-Thin Thinning")),
-              QStringLiteral("AC yr"));
-    EXPECT_EQ(AssortWindowLogic::rowLabel(QStringLiteral("Rack-thin assortment")),
-              QStringLiteral("AT yr"));
-    EXPECT_EQ(AssortWindowLogic::rowLabel(QStringLiteral("Thinning assortment")),
-              QStringLiteral("AT yr"));
-    EXPECT_EQ(AssortWindowLogic::rowLabel(QStringLiteral("Post-[Actual]-Thin Crop assortment")),
-              QStringLiteral("AP yr"));
+    for (const auto &[title, label] : {std::pair{"Crop assortment", "AC yr"},
+                                       {"Pre-[Actual]-Thin Thinning", "AC yr"},
+                                       {"Rack-thin assortment", "AT yr"},
+                                       {"Thinning assortment", "AT yr"},
+                                       {"Post-[Actual]-Thin Crop assortment", "AP yr"}}) {
+        EXPECT_EQ(assortments::AssortWindowLogic::rowLabel(QLatin1String(title)),
+                  QLatin1String(label))
+            << title;
+    }
 }
 
 } // namespace

@@ -2,6 +2,7 @@
 // file, and the refusals.
 #include "cli/clirun.hpp"
 #include "mocks/qtprinters.hpp"
+#include "shell/testfiles.hpp"
 
 #include <QFile>
 #include <QTemporaryDir>
@@ -24,9 +25,7 @@ protected:
     /// Writes a category file into the data folder and returns its path.
     QString categoryFile(const char *lines) {
         const QString path = m_data.filePath(QStringLiteral("cats.qdm"));
-        QFile file(path);
-        EXPECT_TRUE(file.open(QIODevice::WriteOnly));
-        file.write(lines);
+        EXPECT_TRUE(arbolex::testing::writeBytes(path, lines));
         return path;
     }
 

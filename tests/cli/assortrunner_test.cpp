@@ -6,36 +6,23 @@
 namespace arbolex::testing {
 namespace {
 
-/// Runs a script given as one text, lines split at line ends.
-class AssortRunnerTest : public RunnerTest {
-protected:
-    cli::ScriptRunner::Outcome run(const QString &script) {
-        return RunnerTest::run(script.split(QLatin1Char('\n')));
-    }
-};
-
-constexpr const char *kGrowAndThin =
-    "model 0\n"
-    "set txtFromA 15\nset txtFromN 2500\nset txtFromH 7\n"
-    "set txtFromB 20\nset txtToA 30\nset txtByA 5\n"
-    "press cmdGrow\n"
-    "press cmdThin\nset frmThin.txtRemV 60\npress frmThin.cmdThin\n";
+using AssortRunnerTest = RunnerTest;
 
 // The thinning window's reports as rows: outputs_test.py (RunnerTest).
 TEST_F(AssortRunnerTest, CategoriesWindowAndUserReport) {
     ASSERT_TRUE(
-        run(QLatin1String(kGrowAndThin) + QStringLiteral("press frmThin.cmdCancel\n"
-                                                         "press mnuAssortUser\n"
-                                                         "set frmAssortUser.txtName(1) Stakes\n"
-                                                         "set frmAssortUser.txtSmall(1) 8\n"
-                                                         "set frmAssortUser.txtBig(1) 12\n"
-                                                         "press frmAssortUser.chkUse(1)\n"
-                                                         "press frmAssortUser.chkUserCategories\n"
-                                                         "press frmAssortUser.cmdOK\n"
-                                                         "print frmAssortUser.chkUse(1)\n"
-                                                         "select 3\n"
-                                                         "press cmdAssort\n"
-                                                         "print frmAssort"))
+        runScript(QLatin1String(kYoungStand) +
+                  QStringLiteral("set txtToA 30\nset txtByA 5\npress cmdGrow\npress cmdThin\n"
+                                 "set frmThin.txtRemV 60\npress frmThin.cmdThin\n"
+                                 "press frmThin.cmdCancel\npress mnuAssortUser\n"
+                                 "set frmAssortUser.txtName(1) Stakes\n"
+                                 "set frmAssortUser.txtSmall(1) 8\n"
+                                 "set frmAssortUser.txtBig(1) 12\n"
+                                 "press frmAssortUser.chkUse(1)\n"
+                                 "press frmAssortUser.chkUserCategories\n"
+                                 "press frmAssortUser.cmdOK\n"
+                                 "print frmAssortUser.chkUse(1)\nselect 3\n"
+                                 "press cmdAssort\nprint frmAssort"))
             .ok())
         << output.toStdString();
     const QStringList lines = printed();
@@ -51,7 +38,7 @@ TEST_F(AssortRunnerTest, UnknownControlsStopTheScript) {
     for (const char *line :
          {"press frmThin.cmdAssort(3)", "press frmAssort.lblDesc", "set frmAssortUser.chkUse(1) 1",
           "set frmAssortUser.txtName(6) x", "print frmAssort.lblNothing"}) {
-        const cli::ScriptRunner::Outcome stopped = run(QLatin1String(line));
+        const cli::ScriptRunner::Outcome stopped = runScript(QLatin1String(line));
         EXPECT_FALSE(stopped.ok()) << line;
         EXPECT_TRUE(stopped.error.startsWith(QStringLiteral("no "))) << line;
     }

@@ -49,6 +49,7 @@ bool nearRel(double expected, double actual, double rel) {
 }
 
 constexpr const char *kStand = "--model 0 --age 15 --stocking 2500 --height 7";
+constexpr const char *kFullStand = "--model 0 --basal-area 20 --age 15 --stocking 2500 --height 7";
 
 TEST_F(CliTest, ProjectionPrintsOneRowPerStep) {
     const Outcome r = run(words("project --basal-area 20 --to 45 --by 7") + words(kStand));
@@ -138,7 +139,10 @@ void PrintTo(const BadCommandLine &c, std::ostream *os) {
 class CliBadArgumentsTest : public CliTest, public ::testing::WithParamInterface<BadCommandLine> {};
 
 TEST_P(CliBadArgumentsTest, ExitsWithTwoAndSaysWhy) {
-    const Outcome r = run(words(GetParam().arguments));
+    // "%S" stands for a whole stand.
+    const QString line = QString::fromLatin1(GetParam().arguments)
+                             .replace(QStringLiteral("%S"), QLatin1String(kFullStand));
+    const Outcome r = run(line.split(QLatin1Char(' '), Qt::SkipEmptyParts));
     EXPECT_EQ(r.exitCode, 2);
     EXPECT_TRUE(r.out.isEmpty());
     EXPECT_TRUE(r.err.contains(QLatin1String(GetParam().complaint))) << r.err.toStdString();
@@ -151,9 +155,7 @@ INSTANTIATE_TEST_SUITE_P(
         BadCommandLine{"grow-all --model 0", "unknown command"},
         BadCommandLine{"project --model 0 --basal-area 20 --colour red --age 15",
                        "unknown option --colour"},
-        BadCommandLine{"project --model 0 --basal-area 20 --age 15 --stocking 2500 --height 7 "
-                       "--to 45 --by",
-                       "missing value for --by"},
+        BadCommandLine{"project %S --to 45 --by", "missing value for --by"},
         BadCommandLine{"project --model 0 --basal-area 20 --age 15 --stocking many --height 7 "
                        "--to 45 --by 5",
                        "--stocking: \"many\" is not a number"},
@@ -163,25 +165,16 @@ INSTANTIATE_TEST_SUITE_P(
         BadCommandLine{"project --model 1.5 --basal-area 20 --age 15 --stocking 2500 --height 7 "
                        "--to 45 --by 5",
                        "--model must be a whole number"},
-        BadCommandLine{"project --model 0 --basal-area 20 --dbh 10 --age 15 --stocking 2500 "
-                       "--height 7 --to 45 --by 5",
+        BadCommandLine{"project %S --dbh 10 --to 45 --by 5",
                        "give only one of --basal-area, --dbh"},
         BadCommandLine{"project --model 0 --age 15 --stocking 2500 --height 7 --to 45 --by 5",
                        "give one of --basal-area, --dbh"},
-        BadCommandLine{"project --model 0 --basal-area 20 --age 15 --stocking 2500 --height 7 "
-                       "--to 45 --by 0",
-                       "--by must be above 0"},
-        BadCommandLine{"project --model 0 --basal-area 20 --age 15 --stocking 2500 --height 7 "
-                       "--by 5",
-                       "--to is required"},
-        BadCommandLine{"thin --model 0 --basal-area 20 --age 15 --stocking 2500 --height 7",
+        BadCommandLine{"project %S --to 45 --by 0", "--by must be above 0"},
+        BadCommandLine{"project %S --by 5", "--to is required"},
+        BadCommandLine{"thin %S",
                        "give one of --residual-ba, --residual-stocking, --residual-volume"},
-        BadCommandLine{"thin --model 0 --basal-area 20 --age 15 --stocking 2500 --height 7 "
-                       "--residual-ba 15 --residual-volume 20",
-                       "give only one of"},
-        BadCommandLine{"thin --model 0 --basal-area 20 --age 15 --stocking 2500 --height 7 "
-                       "15",
-                       "unexpected argument \"15\""}));
+        BadCommandLine{"thin %S --residual-ba 15 --residual-volume 20", "give only one of"},
+        BadCommandLine{"thin %S 15", "unexpected argument \"15\""}));
 
 TEST_F(CliTest, FailedProjectionKeepsItsRowsAndExitsWithOne) {
     // Backwards past the stand's origin the state transform cannot be inverted.

@@ -6,6 +6,7 @@
 #include "cli/clirun.hpp"
 #include "estateio/gdallayer.hpp"
 #include "mocks/programservices.hpp"
+#include "shell/testfiles.hpp"
 
 #include <QDir>
 #include <QFile>
@@ -43,9 +44,7 @@ protected:
     QString path(const char *name) const { return m_work.filePath(QLatin1String(name)); }
 
     void writeInput(const char *name, const char *text) {
-        QFile file(path(name));
-        ASSERT_TRUE(file.open(QIODevice::WriteOnly));
-        file.write(text);
+        ASSERT_TRUE(arbolex::testing::writeBytes(path(name), text));
     }
 
     Outcome estate(const QString &input, const QString &out, QStringList more = {}) {
@@ -62,9 +61,14 @@ protected:
         return arbolex::estateio::readTable(file.toStdString(), columns);
     }
 
-    static QByteArray bytes(const QString &file) {
-        QFile f(file);
-        return f.open(QIODevice::ReadOnly) ? f.readAll() : QByteArray();
+    /// Two runs wrote the same files, and not empty ones.
+    void expectSameFiles(const char *first, const char *second) const {
+        for (const char *file : {"/subcompartments.csv", "/forecast.csv", "/errors.csv"}) {
+            const QByteArray one = arbolex::testing::readBytes(path(first) + QLatin1String(file));
+            EXPECT_FALSE(one.isEmpty()) << first << file;
+            EXPECT_EQ(one, arbolex::testing::readBytes(path(second) + QLatin1String(file)))
+                << first << " and " << second << file;
+        }
     }
 
     static std::string column(const std::vector<std::string> &names,
@@ -132,11 +136,7 @@ TEST_F(EstateCliTest, OneOrTwoThreadsWriteTheSameFilesAndShardsMergeIntoTheWhole
         estate(path("many.csv"), path("t") + QLatin1String(threads),
                {QStringLiteral("--threads"), QLatin1String(threads)});
     }
-    for (const char *file : {"/subcompartments.csv", "/forecast.csv", "/errors.csv"}) {
-        const QByteArray one = bytes(path("t1") + QLatin1String(file));
-        EXPECT_FALSE(one.isEmpty()) << file;
-        EXPECT_EQ(one, bytes(path("t2") + QLatin1String(file))) << file;
-    }
+    expectSameFiles("t1", "t2");
 
     // Two shards give the whole's rows; that their forecasts add up is the
     // estate run's (estaterun_test.cpp).
@@ -233,11 +233,7 @@ TEST_F(EstateCliTest, ASemicolonSpreadsheetWithDecimalCommasGivesItsPlainTwinsFi
                             "B1,0,15,2500,\"7,0\",20,1,\n");
     EXPECT_EQ(estate(path("european.csv"), path("eu")).exitCode, 1);
     EXPECT_EQ(estate(path("plain.csv"), path("plain")).exitCode, 1);
-    for (const char *file : {"/subcompartments.csv", "/forecast.csv", "/errors.csv"}) {
-        const QByteArray european = bytes(path("eu") + QLatin1String(file));
-        EXPECT_FALSE(european.isEmpty()) << file;
-        EXPECT_EQ(european, bytes(path("plain") + QLatin1String(file))) << file;
-    }
+    expectSameFiles("eu", "plain");
     // A value that is no number keeps its row's message and line in both; in
     // the comma-separated twin that is the quoted decimal comma.
     const Table errors = read(path("plain/errors.csv"));

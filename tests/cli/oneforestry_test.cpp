@@ -277,24 +277,15 @@ private:
 };
 
 QStringList standArguments(const Case &c) {
-    QStringList a{QStringLiteral("--model"),
-                  QString::number(c.model),
-                  QStringLiteral("--age"),
-                  QString::number(c.age),
-                  QStringLiteral("--stocking"),
-                  QString::number(c.stocking),
-                  QStringLiteral("--height"),
-                  c.height,
-                  QStringLiteral("--basal-area"),
-                  c.basalArea,
-                  QStringLiteral("--rotation"),
-                  QString::number(c.rotation),
-                  QStringLiteral("--rate"),
-                  c.rate,
-                  QStringLiteral("--establishment-cost"),
-                  QStringLiteral("0"),
-                  QStringLiteral("--annual-cost"),
-                  QStringLiteral("0")};
+    QStringList a = QStringLiteral("--model %1 --age %2 --stocking %3 --height %4 --basal-area %5 "
+                                   "--rotation %6 --rate %7 --establishment-cost 0 --annual-cost 0")
+                        .arg(c.model)
+                        .arg(c.age)
+                        .arg(c.stocking)
+                        .arg(c.height, c.basalArea)
+                        .arg(c.rotation)
+                        .arg(c.rate)
+                        .split(QLatin1Char(' '));
     if (c.regime.thins()) {
         a << QStringLiteral("--thin-from") << QString::number(c.regime.thinFrom)
           << QStringLiteral("--thin-every") << QString::number(c.regime.thinEvery)
@@ -341,13 +332,13 @@ std::map<QString, Valued> estateRows(const std::vector<Case> &cases, const QStri
             if (c.rate != rate) {
                 continue;
             }
-            QStringList cells{QString::number(i),
-                              QString::number(c.model),
-                              QString::number(c.age),
-                              QString::number(c.stocking),
-                              c.height,
-                              c.basalArea,
-                              QStringLiteral("1")};
+            QStringList cells = QStringLiteral("%1,%2,%3,%4,%5,%6,1")
+                                    .arg(i)
+                                    .arg(c.model)
+                                    .arg(c.age)
+                                    .arg(c.stocking)
+                                    .arg(c.height, c.basalArea)
+                                    .split(QLatin1Char(','));
             cells << (c.regime.thins() ? QString::number(c.regime.thinFrom) : QStringLiteral("0"))
                   << (c.regime.thins() ? QString::number(c.regime.thinEvery) : QString())
                   << (c.regime.thins() ? QString::number(double{c.regime.thinVolume}) : QString())

@@ -2,6 +2,7 @@
 // whatever a cell holds, JSON carries the figures the tables print, and the
 // document names the unit of every figure and records what produced it.
 #include "cli/resultdocument.hpp"
+#include "shell/testfiles.hpp"
 
 #include <QDateTime>
 #include <QFile>
@@ -127,12 +128,10 @@ TEST(ResultDocumentTest, AFigureWithoutAUnitIsAFaultOfTheProgram) {
 
 TEST(RunRecordTest, RecordsTheProgramTheStartAndEachFileWithItsChecksum) {
     QTemporaryDir folder;
-    QFile file(folder.filePath(QStringLiteral("CURPRIC.qdm")));
-    ASSERT_TRUE(file.open(QIODevice::WriteOnly));
-    file.write("abc");
-    file.close();
+    const QString prices = folder.filePath(QStringLiteral("CURPRIC.qdm"));
+    ASSERT_TRUE(arbolex::testing::writeBytes(prices, "abc"));
     RunRecord run(QStringLiteral("rotation"));
-    run.fileRead(QStringLiteral("CURPRIC.qdm"), file.fileName());
+    run.fileRead(QStringLiteral("CURPRIC.qdm"), prices);
     run.fileRead(QStringLiteral("USRPRIC.qdm"), folder.filePath(QStringLiteral("USRPRIC.qdm")));
     run.setFormat(Format::kJson);
     const QJsonObject o = run.json();

@@ -153,6 +153,18 @@ class TableChecks:
             self.assertEqual(len(widths), 1,
                              f"{what}: a block of {sorted(widths)} fields from {block[0]}")
 
+    def assertCellsAre(self, header, lines, records, what):
+        """Each line's cells are its JSON record's values: numbers as
+        numbers, null as an empty cell."""
+        self.assertEqual(len(lines), len(records), what)
+        for line, record in zip(lines, records):
+            for column, cell in zip(header, line):
+                value = record[column]
+                if isinstance(value, (int, float)):
+                    self.assertEqual(float(cell), value, f"{what}.{column}")
+                else:
+                    self.assertEqual(cell, "" if value is None else value, f"{what}.{column}")
+
 
 class SchemasTest(DataFolder, unittest.TestCase):
     """Every command's JSON parses strictly, validates and names its units."""
@@ -205,15 +217,7 @@ class TablesTest(DataFolder, TableChecks, unittest.TestCase):
                 start = 0 if title is None else rows.index([f"# {title}"]) + 1
                 table = next(blocks(rows[start:]))
                 document = strict_json(self.run_cli([*COMMANDS[name], "--format", "json"]))
-                header, lines = table[0], table[1:]
-                self.assertEqual(len(lines), len(document[key]))
-                for line, record in zip(lines, document[key]):
-                    for column, cell in zip(header, line):
-                        value = record[column]
-                        if isinstance(value, (int, float)):
-                            self.assertEqual(float(cell), value, f"{key}.{column}")
-                        else:
-                            self.assertEqual(cell, "" if value is None else value)
+                self.assertCellsAre(table[0], table[1:], document[key], key)
 
 
 # A rotation in the main window: grow, thin with both assortment reports
@@ -300,7 +304,7 @@ class RerunTest(DataFolder, unittest.TestCase):
                 self.assertEqual(TIME.sub(b"", again), TIME.sub(b"", first))
 
 
-class EstateTest(DataFolder, unittest.TestCase):
+class EstateTest(DataFolder, TableChecks, unittest.TestCase):
     """The estate's JSON tables against their schemas and the CSV; that every
     format keeps its lines as wide as the header is the writer's
     (tests/estate/tablefile_test.cpp)."""
@@ -328,15 +332,7 @@ class EstateTest(DataFolder, unittest.TestCase):
                 schema_validator("estate-" + table).validate(document)
                 rows = read_csv((plain / f"{table}.csv").read_text(encoding="utf-8"))
                 self.assertEqual(document["columns"], rows[0])
-                self.assertEqual(len(document["rows"]), len(rows) - 1)
-                for line, record in zip(rows[1:], document["rows"]):
-                    for column, cell in zip(rows[0], line):
-                        value = record[column]
-                        expected = "" if value is None else value
-                        if isinstance(value, (int, float)):
-                            self.assertEqual(float(cell), value)
-                        else:
-                            self.assertEqual(cell, expected)
+                self.assertCellsAre(rows[0], rows[1:], document["rows"], table)
                 self.assertEqual(document["run"]["inputs"]["year"], 2030)
                 input_file = document["run"]["files"][-1]
                 self.assertTrue(input_file["name"].endswith("estate.csv"))

@@ -234,10 +234,6 @@ TEST_F(RotationCliTest, UnthinnedModelRefusesARegime) {
     EXPECT_TRUE(r.err.contains(QLatin1String("has no thinning response"))) << r.err.toStdString();
 }
 
-} // namespace
-
-namespace {
-
 TEST_F(RotationCliTest, OptimisedRegimesGiveTheirFiguresBackToRotation) {
     const QJsonObject o = json(QStringLiteral("optimise") + kThinned.mid(8) +
                                QStringLiteral(" --rate 3 --establishment-cost 1500 --top 3"));

@@ -19,13 +19,12 @@ namespace arbolex::testing {
 namespace {
 
 TEST_F(RunnerTest, TypesPressesAndPrintsAsAUserWould) {
-    ASSERT_TRUE(run({QStringLiteral("model 0  # Sitka spruce"), QStringLiteral(""),
-                     QStringLiteral("set txtFromA 1x5"), QStringLiteral("set txtFromN 2500"),
-                     QStringLiteral("set txtFromH 7"), QStringLiteral("set txtFromB 20"),
-                     QStringLiteral("set txtToA 25"), QStringLiteral("set txtByA 5"),
-                     QStringLiteral("press cmdGrow"), QStringLiteral("print txtFromA"),
-                     QStringLiteral("print lblSI"), QStringLiteral("print flxMain")})
-                    .ok());
+    ASSERT_TRUE(
+        runScript(QStringLiteral("model 0  # Sitka spruce\n\n"
+                                 "set txtFromA 1x5\nset txtFromN 2500\nset txtFromH 7\n"
+                                 "set txtFromB 20\nset txtToA 25\nset txtByA 5\n"
+                                 "press cmdGrow\nprint txtFromA\nprint lblSI\nprint flxMain"))
+            .ok());
     const QStringList lines = printed();
     ASSERT_EQ(lines.size(), 2 + 4) << output.toStdString(); // two fields, header, three rows
     EXPECT_EQ(lines[0], QStringLiteral("25")) << "the key filter dropped the x";
@@ -50,19 +49,17 @@ TEST_F(RunnerTest, MessagesAndQuestionsArePrintedInOrder) {
 }
 
 TEST_F(RunnerTest, AWholeThinnedRotationCanBeScripted) {
-    const QStringList script = {
-        QStringLiteral("model 0"), QStringLiteral("set txtFromA 15"),
-        QStringLiteral("set txtFromN 2500"), QStringLiteral("set txtFromH 7"),
-        QStringLiteral("set txtFromB 20"), QStringLiteral("set txtToA 30"),
-        QStringLiteral("set txtByA 5"), QStringLiteral("press cmdGrow"),
-        QStringLiteral("press cmdThin"), QStringLiteral("set frmThin.txtRemV 40"),
-        QStringLiteral("press frmThin.cmdThin"), QStringLiteral("print frmThin.txtRemV"),
-        QStringLiteral("press frmThin.cmdAccept"),
-        // A second thinning window offers the loop: the question needs an answer.
-        QStringLiteral("answer no"), QStringLiteral("press cmdThin"),
-        QStringLiteral("print frmThin.chkActivLoop"), QStringLiteral("press frmThin.cmdCancel"),
-        QStringLiteral("print flxMain")};
-    ASSERT_TRUE(run(script).ok()) << outcome.error.toStdString();
+    ASSERT_TRUE(runScript(QLatin1String(kYoungStand) +
+                          QStringLiteral("set txtToA 30\nset txtByA 5\npress cmdGrow\n"
+                                         "press cmdThin\nset frmThin.txtRemV 40\n"
+                                         "press frmThin.cmdThin\nprint frmThin.txtRemV\n"
+                                         "press frmThin.cmdAccept\n"
+                                         // A second thinning window offers the loop: the
+                                         // question needs an answer.
+                                         "answer no\npress cmdThin\nprint frmThin.chkActivLoop\n"
+                                         "press frmThin.cmdCancel\nprint flxMain"))
+                    .ok())
+        << outcome.error.toStdString();
     const QStringList lines = printed();
     EXPECT_EQ(lines[0], QStringLiteral("40.00"));
     EXPECT_TRUE(lines[1].startsWith(QStringLiteral("ASK\t")));
@@ -100,10 +97,9 @@ TEST_F(RunnerTest, IncrementsOfAStandBeyondItsModelOverflow) {
     // terms no longer fit a whole number. That is the Overflow of the grid's
     // procedure, logged; the conversion it replaces was undefined, which the
     // sanitizer build (make test-asan) stops at.
-    ASSERT_TRUE(run({QStringLiteral("model 8"), QStringLiteral("set txtFromA 15"),
-                     QStringLiteral("set txtFromN 2500"), QStringLiteral("set txtFromH 43"),
-                     QStringLiteral("set txtFromB 20"), QStringLiteral("set txtToA 50"),
-                     QStringLiteral("set txtByA 5"), QStringLiteral("press cmdGrow")})
+    ASSERT_TRUE(runScript(QStringLiteral("model 8\nset txtFromA 15\nset txtFromN 2500\n"
+                                         "set txtFromH 43\nset txtFromB 20\nset txtToA 50\n"
+                                         "set txtByA 5\npress cmdGrow"))
                     .ok());
     const QStringList log = logMessages(dir.path());
     EXPECT_TRUE(std::any_of(log.begin(), log.end(), [](const QString &line) {
@@ -113,20 +109,13 @@ TEST_F(RunnerTest, IncrementsOfAStandBeyondItsModelOverflow) {
 }
 
 TEST_F(RunnerTest, AQuestionWithoutAnAnswerStopsTheScript) {
-    const QStringList script = {QStringLiteral("model 0"),
-                                QStringLiteral("set txtFromA 15"),
-                                QStringLiteral("set txtFromN 2500"),
-                                QStringLiteral("set txtFromH 7"),
-                                QStringLiteral("set txtFromB 20"),
-                                QStringLiteral("set txtToA 30"),
-                                QStringLiteral("set txtByA 5"),
-                                QStringLiteral("press cmdGrow"),
-                                QStringLiteral("press cmdThin"),
-                                QStringLiteral("set frmThin.txtRemV 40"),
-                                QStringLiteral("press frmThin.cmdThin"),
-                                QStringLiteral("press frmThin.cmdAccept"),
-                                QStringLiteral("press cmdThin")};
-    EXPECT_EQ(run(script).line, 13);
+    EXPECT_EQ(runScript(QLatin1String(kYoungStand) +
+                        QStringLiteral("set txtToA 30\nset txtByA 5\npress cmdGrow\n"
+                                       "press cmdThin\nset frmThin.txtRemV 40\n"
+                                       "press frmThin.cmdThin\npress frmThin.cmdAccept\n"
+                                       "press cmdThin"))
+                  .line,
+              13);
     EXPECT_TRUE(outcome.error.contains(QStringLiteral("no answer")));
 }
 
@@ -137,26 +126,19 @@ QString cli() {
 TEST(RunnerProcessTest, ExitStatusAndTheSavedStartupFile) {
     QTemporaryDir dir;
     ASSERT_TRUE(copyShippedData(dir.path()));
-    QFile script(dir.filePath(QStringLiteral("s.arb")));
-    ASSERT_TRUE(script.open(QIODevice::WriteOnly));
-    script.write("model 4\nset txtFromA 22\n");
-    script.close();
+    const QString script = dir.filePath(QStringLiteral("s.arb"));
+    ASSERT_TRUE(writeBytes(script, "model 4\nset txtFromA 22\n"));
     QProcess p;
-    p.start(cli(),
-            {QStringLiteral("run"), script.fileName(), QStringLiteral("--data-dir"), dir.path()});
+    p.start(cli(), {QStringLiteral("run"), script, QStringLiteral("--data-dir"), dir.path()});
     ASSERT_TRUE(p.waitForFinished());
     EXPECT_EQ(p.exitCode(), 0) << p.readAllStandardError().toStdString();
-    QFile startup(dir.filePath(QStringLiteral("IFPRM1.dat")));
-    ASSERT_TRUE(startup.open(QIODevice::ReadOnly));
-    const QList<QByteArray> values = startup.readAll().split('\n');
+    const QList<QByteArray> values =
+        readBytes(dir.filePath(QStringLiteral("IFPRM1.dat"))).split('\n');
     EXPECT_EQ(values.value(0).trimmed(), QByteArray("4")) << "the unload saved the model";
     EXPECT_EQ(values.value(1).trimmed(), QByteArray("22"));
 
-    script.open(QIODevice::WriteOnly);
-    script.write("model 4\nfrobnicate\n");
-    script.close();
-    p.start(cli(),
-            {QStringLiteral("run"), script.fileName(), QStringLiteral("--data-dir"), dir.path()});
+    ASSERT_TRUE(writeBytes(script, "model 4\nfrobnicate\n"));
+    p.start(cli(), {QStringLiteral("run"), script, QStringLiteral("--data-dir"), dir.path()});
     ASSERT_TRUE(p.waitForFinished());
     EXPECT_EQ(p.exitCode(), 2);
     EXPECT_TRUE(p.readAllStandardError().contains("s.arb:2:"));

@@ -16,19 +16,14 @@ protected:
     }
 };
 
-const QStringList kFelledStand = {
-    QStringLiteral("model 0"),           QStringLiteral("set txtFromA 15"),
-    QStringLiteral("set txtFromN 2500"), QStringLiteral("set txtFromH 7"),
-    QStringLiteral("set txtFromB 20"),   QStringLiteral("set txtToA 45"),
-    QStringLiteral("set txtByA 5"),      QStringLiteral("press cmdGrow"),
-    QStringLiteral("answer yes"),        QStringLiteral("press cmdFinalCut"),
-};
-
 // Optimising and applying through the runner: oneforestry_test.cpp.
 TEST_F(RunnerEconomicsTest, ItsControlsWaitForTheWindowAndItsFiguresPrint) {
+    // The stand grown to 45 and felled: ten lines, then the window's command.
     const cli::ScriptRunner::Outcome refused =
-        run(kFelledStand + QStringList{QStringLiteral("press frmEconomics.cmdCompute")});
-    EXPECT_EQ(refused.line, kFelledStand.size() + 1);
+        runScript(QLatin1String(kYoungStand) +
+                  QStringLiteral("set txtToA 45\nset txtByA 5\npress cmdGrow\nanswer yes\n"
+                                 "press cmdFinalCut\npress frmEconomics.cmdCompute"));
+    EXPECT_EQ(refused.line, 11);
     EXPECT_TRUE(refused.error.contains(QStringLiteral("not open")));
 
     for (const char *line : {"press cmdEconomics", "set frmEconomics.txtInterestRate 3",

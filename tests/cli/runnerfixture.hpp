@@ -10,6 +10,11 @@
 
 namespace arbolex::testing {
 
+/// A young Sitka spruce stand typed into the main window: 15 years,
+/// 2500 stems/ha, 7 m, 20 m²/ha.
+constexpr const char *kYoungStand =
+    "model 0\nset txtFromA 15\nset txtFromN 2500\nset txtFromH 7\nset txtFromB 20\n";
+
 class RunnerTest : public ::testing::Test {
 protected:
     /// Runs `lines` against a fresh session; returns what it printed.
@@ -17,6 +22,10 @@ protected:
         outcome = runner.run(lines);
         out.flush();
         return outcome;
+    }
+    /// Runs a script given as one text, its lines split at line ends.
+    cli::ScriptRunner::Outcome runScript(const QString &script) {
+        return run(script.split(QLatin1Char('\n')));
     }
     QStringList printed() const { return output.split(QLatin1Char('\n'), Qt::SkipEmptyParts); }
 

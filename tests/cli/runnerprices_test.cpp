@@ -34,25 +34,20 @@ protected:
 };
 
 TEST_F(RunnerPricesTest, EditsChoosesAndPrintsThePrices) {
-    const QStringList lines = run({
-        QStringLiteral("press cmdShowTimberPrice"),
-        QStringLiteral("set frmTimberPrices.txtTimbVal(13) 9"), // refused: no Allow Changes yet
-        QStringLiteral("print frmTimberPrices.txtTimbVal(13)"),
-        QStringLiteral("press frmTimberPrices.cmdChangePrices"),
-        QStringLiteral("print frmTimberPrices.cmdChangePrices"),
-        QStringLiteral("set frmTimberPrices.txtTimbVal(13) 12.5"),
-        QStringLiteral("set frmTimberPrices.txtTimbVal(14)"),
-        QStringLiteral("set frmTimberPrices.txtTimbVal(0) 1"), // refused: current prices
-        QStringLiteral("press frmTimberPrices.cmdChangePrices"),
-        QStringLiteral("print frmTimberPrices.txtTimbVal(13)"),
-        QStringLiteral("print frmTimberPrices.txtTimbVal(14)"),
-        QStringLiteral("print frmTimberPrices.txtTimbVal(0)"),
-        QStringLiteral("press frmTimberPrices.OptUserPrices"),
-        QStringLiteral("print frmTimberPrices.OptUserPrices"),
-        QStringLiteral("print frmTimberPrices.OptCurentPrices"),
-        QStringLiteral("print frmTimberPrices.lblOVRA_TP"),
-        QStringLiteral("press frmTimberPrices.cmdClosePricesList"),
-    });
+    const QStringList lines =
+        run(QStringLiteral(
+                "press cmdShowTimberPrice\n"
+                "set frmTimberPrices.txtTimbVal(13) 9\n" // refused: no Allow Changes yet
+                "print frmTimberPrices.txtTimbVal(13)\npress frmTimberPrices.cmdChangePrices\n"
+                "print frmTimberPrices.cmdChangePrices\n"
+                "set frmTimberPrices.txtTimbVal(13) 12.5\nset frmTimberPrices.txtTimbVal(14)\n"
+                "set frmTimberPrices.txtTimbVal(0) 1\n" // refused: current prices
+                "press frmTimberPrices.cmdChangePrices\n"
+                "print frmTimberPrices.txtTimbVal(13)\nprint frmTimberPrices.txtTimbVal(14)\n"
+                "print frmTimberPrices.txtTimbVal(0)\npress frmTimberPrices.OptUserPrices\n"
+                "print frmTimberPrices.OptUserPrices\nprint frmTimberPrices.OptCurentPrices\n"
+                "print frmTimberPrices.lblOVRA_TP\npress frmTimberPrices.cmdClosePricesList")
+                .split(QLatin1Char('\n')));
     ASSERT_TRUE(outcome.ok()) << outcome.error.toStdString();
     EXPECT_EQ(lines, (QStringList{QStringLiteral("4.00"), QStringLiteral("Accept Changes"),
                                   QStringLiteral("12.5"), QStringLiteral("0"),

@@ -10,26 +10,13 @@
 namespace arbolex::testing {
 namespace {
 
-const QStringList kRotation = {
-    QStringLiteral("model 0"),
-    QStringLiteral("set txtFromA 15"),
-    QStringLiteral("set txtFromN 2500"),
-    QStringLiteral("set txtFromH 9"),
-    QStringLiteral("set txtFromB 22"),
-    QStringLiteral("set txtNetArea 10"),
-    QStringLiteral("set txtToA 30"),
-    QStringLiteral("set txtByA 5"),
-    QStringLiteral("press cmdGrow"),
-    QStringLiteral("press cmdThin"),
-    QStringLiteral("set frmThin.txtRemV 50"),
-    QStringLiteral("press frmThin.cmdThin"),
-    QStringLiteral("press frmThin.cmdAccept"),
-    QStringLiteral("set txtToA 60"),
-    QStringLiteral("press cmdGrow"),
-    QStringLiteral("answer yes"),
-    QStringLiteral("press cmdFinalCut"),
-    QStringLiteral("press cmdNPV"),
-};
+const QStringList kRotation =
+    QStringLiteral("model 0\nset txtFromA 15\nset txtFromN 2500\nset txtFromH 9\nset txtFromB 22\n"
+                   "set txtNetArea 10\nset txtToA 30\nset txtByA 5\npress cmdGrow\n"
+                   "press cmdThin\nset frmThin.txtRemV 50\npress frmThin.cmdThin\n"
+                   "press frmThin.cmdAccept\nset txtToA 60\npress cmdGrow\nanswer yes\n"
+                   "press cmdFinalCut\npress cmdNPV")
+        .split(QLatin1Char('\n'));
 
 class RunnerRotationTest : public RunnerTest {
 protected:

@@ -3,6 +3,7 @@
 #include "document/documentfixture.hpp"
 
 #include "document/documentwriter.hpp"
+#include "shell/testfiles.hpp"
 
 #include <QJsonArray>
 #include <QJsonDocument>
@@ -52,10 +53,7 @@ TEST_P(DamagedFileTest, IsRefusedAndChangesNothing) {
                                 "set txtFromB 20\nset txtToA 30\nset txtByA 5\npress cmdGrow"));
     const QByteArray good = document::documentToJson(session->work());
     const QString path = file(QStringLiteral("Kilbrack 12b.arbolex"));
-    QFile out(path);
-    ASSERT_TRUE(out.open(QIODevice::WriteOnly));
-    out.write(GetParam().damage(good));
-    out.close();
+    ASSERT_TRUE(writeBytes(path, GetParam().damage(good)));
 
     // Work of another stand is in the window when the file is opened.
     session->run(QStringLiteral("set txtToA 45\npress cmdGrow"));

@@ -3,6 +3,7 @@
 #include "document/documentcontroller.hpp"
 #include "shell/iclipboard.hpp"
 #include "shell/settings.hpp"
+#include "shell/testfiles.hpp"
 
 #include <QDir>
 #include <QSettings>
@@ -73,10 +74,7 @@ TEST_F(DocumentControllerTest, OpenAsksAboutUnsavedWorkOnlyForAFileItCanTake) {
     grow();
     ASSERT_TRUE(documents.saveAs(file(QStringLiteral("a.arbolex"))));
     type(MainControl::txtNetArea, QStringLiteral("4"));
-    QFile broken(file(QStringLiteral("broken.arbolex")));
-    ASSERT_TRUE(broken.open(QIODevice::WriteOnly));
-    broken.write("{");
-    broken.close();
+    ASSERT_TRUE(writeBytes(file(QStringLiteral("broken.arbolex")), "{"));
     EXPECT_FALSE(documents.open(file(QStringLiteral("broken.arbolex"))));
     EXPECT_TRUE(interactive.questions.isEmpty());
     EXPECT_TRUE(documents.isModified());

@@ -27,18 +27,7 @@ using workflow::MainControl;
 class CarbonEconomicsTest : public ThinningTest {
 protected:
     /// The young stand thinned by 40 m³/ha at 25, felled at 50, by one-year steps.
-    void typeRotation() {
-        logic.cmdClear_Click();
-        typeStand(QStringLiteral("25"), QStringLiteral("1"));
-        logic.cmdGrow_Click();
-        logic.cmdThin_Click();
-        typeThin(ThinControl::txtRemV, QStringLiteral("40"));
-        thin.cmdThin_Click();
-        thin.cmdAccept_Click();
-        type(MainControl::txtToA, QStringLiteral("50"));
-        logic.cmdGrow_Click();
-        logic.cmdFinalCut_Click();
-    }
+    void typeRotation() { ThinningTest::typeRotation({25}, {QStringLiteral("40")}, 50); }
 
     void valueAt3Percent() {
         work.cashFlow().setInterestRate(3.0);

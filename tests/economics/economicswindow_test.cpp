@@ -17,50 +17,12 @@ using workflow::MainControl;
 
 class EconomicsWindowTest : public ThinningTest {
 protected:
-    /// Thins `volumes[i]` at `ages[i]` from the young stand grown by 5 years,
-    /// then grows to `finalCut` and fells there (0: no final cut).
-    void typeRotation(const std::vector<int> &ages, const std::vector<QString> &volumes,
-                      int finalCut) {
-        // By one-year steps, as a regime is written into the table.
-        const auto growTo = [&](int /*from*/, int to) {
-            type(MainControl::txtToA, QString::number(to));
-            type(MainControl::txtByA, QStringLiteral("1"));
-            logic.cmdGrow_Click();
-        };
-        logic.cmdClear_Click();
-        typeStand();
-        growTo(15, ages.front());
-        for (std::size_t i = 0; i < ages.size(); ++i) {
-            if (i > 0) {
-                growTo(ages[i - 1], ages[i]);
-                interactive.answers.append(false); // no thinning loop
-            }
-            logic.cmdThin_Click();
-            typeThin(ThinControl::txtRemV, volumes[i]);
-            thin.cmdThin_Click();
-            thin.cmdAccept_Click();
-        }
-        if (finalCut > 0) {
-            growTo(ages.back(), finalCut);
-            logic.cmdFinalCut_Click();
-        }
-    }
-
-    std::vector<QStringList> tableCells() const {
-        std::vector<QStringList> all;
-        for (int r = 1; r <= logic.table().lastRow(); ++r) {
-            all.push_back(logic.table().row(r).cells);
-        }
-        return all;
-    }
-
     economics::HeadlessEconomicsView &view = economicsView;
     economics::EconomicsWindowLogic &economics = session.economics();
 };
 
 TEST_F(EconomicsWindowTest, FiguresAreTheRotationLibrarysForTheTablesRotation) {
-    typeRotation({20, 25, 30}, {QStringLiteral("40"), QStringLiteral("40"), QStringLiteral("40")},
-                 45);
+    typeRotation({20, 25, 30}, {QStringLiteral("40")}, 45);
     work.cashFlow().setInterestRate(3.0);
     economics.cmdEconomics_Click();
     economics.typeText(EconomicsControl::txtEstablishmentCost, QStringLiteral("1800"));
@@ -124,12 +86,12 @@ TEST_F(EconomicsWindowTest, StandTodayIsWorthWhatTheNetPresentValueWindowSays) {
     economics::NpvWindowLogic &npv = session.npv();
     struct Table {
         std::vector<int> ages;
-        std::vector<QString> volumes;
+        QStringList volumes;
         int finalCut;
     };
     // A regular regime, and one the explorer can only take as its means.
     const Table tables[] = {
-        {{20, 25, 30}, {QStringLiteral("40"), QStringLiteral("40"), QStringLiteral("40")}, 45},
+        {{20, 25, 30}, {QStringLiteral("40")}, 45},
         {{20, 25, 32}, {QStringLiteral("30"), QStringLiteral("50"), QStringLiteral("40")}, 48}};
     for (const Table &t : tables) {
         typeRotation(t.ages, t.volumes, t.finalCut);
@@ -286,13 +248,11 @@ TEST_F(EconomicsWindowTest, ApplyWritesTheTableAUserWouldTypeAndKeepsTheTypedCas
 
     // The same regime typed by hand.
     std::vector<int> ages;
-    std::vector<QString> volumes;
     for (int a = chosen.regime.thinFrom; a <= *chosen.regime.thinUntil;
          a += chosen.regime.thinEvery) {
         ages.push_back(a);
-        volumes.push_back(shell::singleText(chosen.regime.thinVolume));
     }
-    typeRotation(ages, volumes, chosen.rotation);
+    typeRotation(ages, {shell::singleText(chosen.regime.thinVolume)}, chosen.rotation);
     EXPECT_EQ(tableCells(), applied);
     EXPECT_TRUE(work.felled());
 

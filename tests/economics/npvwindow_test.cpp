@@ -9,6 +9,7 @@
 #include "economics/npvmessages.hpp"
 #include "economics/npvwindowlogic.hpp"
 #include "shell/iclipboard.hpp"
+#include "shell/testfiles.hpp"
 #include "work/mdlnpv.hpp"
 
 #include <QFile>
@@ -162,9 +163,7 @@ TEST_F(NpvWindowTest, AnOverflowEndsTheComputationAtItsYear) {
     EXPECT_EQ(cashFlow.matrix(kCfCashFlow, 0), -7.0);
     EXPECT_EQ(cell(1, kCfDiscountedCashFlow), QStringLiteral("-7"));
     EXPECT_EQ(view.text(NpvControl::txtNPV), before) << "not summed again";
-    QFile file(log.path());
-    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
-    EXPECT_TRUE(QString::fromLatin1(file.readAll()).contains(QStringLiteral("Overflow in line ")));
+    EXPECT_TRUE(readBytes(log.path()).contains("Overflow in line "));
 }
 
 TEST_F(NpvWindowTest, CopiesTheGridAsTextAndHtml) {

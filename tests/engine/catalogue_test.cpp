@@ -83,11 +83,7 @@ TEST_F(GetModelTest, UnknownIdentifierChangesNothing) {
     const float s8 = grow.S(8);
     for (std::int16_t bad : {std::int16_t{22}, std::int16_t{-1}}) {
         EXPECT_FALSE(grow.GetModel(bad));
-        ASSERT_EQ(report.messages.size(), 1u);
-        EXPECT_EQ(report.messages[0].title, "MODEL SELECTION");
-        EXPECT_EQ(report.messages[0].text, "FAULT - Unknown model selection");
-        EXPECT_EQ(report.messages[0].style, 48);
-        report.clear();
+        report.take("MODEL SELECTION", "FAULT - Unknown model selection", 48);
         EXPECT_EQ(grow.modelId(), 3);
         EXPECT_EQ(grow.label(), "NS - (UnThinned)");
         EXPECT_EQ(grow.S(8), s8);

@@ -150,11 +150,7 @@ TEST_F(ProjectionTest, StateYearReportsAStandThatCannotBeInverted) {
     EXPECT_EQ(g, 1.0f);
     EXPECT_EQ(n, 50.0f);
     EXPECT_EQ(h, 1.0f);
-    ASSERT_EQ(report.messages.size(), 1u);
-    EXPECT_EQ(report.messages[0].title, titles::kOstran);
-    EXPECT_EQ(report.messages[0].text, "ERROR - Unable to invert state transform.");
-    EXPECT_EQ(report.messages[0].style, 49);
-    report.clear();
+    report.take(titles::kOstran, "ERROR - Unable to invert state transform.", 49);
 }
 
 std::vector<float> agesOf(const std::vector<StandState> &states) {
@@ -256,11 +252,7 @@ TEST_F(ProjectionTest, FailedInversionKeepsTheStatesSoFar) {
     // domain at age 1.
     std::vector<StandState> states;
     EXPECT_FALSE(grow.PROJ(5.0f, 20.0f, 100.0f, 7.0f, 1.0f, 1.0f, states));
-    ASSERT_EQ(report.messages.size(), 1u);
-    EXPECT_EQ(report.messages[0].title, titles::kOstran);
-    EXPECT_EQ(report.messages[0].text, "ERROR - Unable to Invert State transform");
-    EXPECT_EQ(report.messages[0].style, 48);
-    report.clear();
+    report.take(titles::kOstran, "ERROR - Unable to Invert State transform", 48);
     EXPECT_EQ(agesOf(states), (std::vector<float>{5, 4, 3, 2}));
 
     // The states kept are those a projection stopping short of the failure gives.
@@ -274,12 +266,6 @@ TEST_F(ProjectionTest, FailedInversionKeepsTheStatesSoFar) {
         EXPECT_EQ(states[k].volume, shorter[k].volume);
     }
 }
-
-} // namespace
-} // namespace arbolex::engine::testing
-
-namespace arbolex::engine::testing {
-namespace {
 
 // One engine keeps its last rate, transition and step factors; whatever it
 // was asked before, it must project as an engine that was never asked

@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <cmath>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace arbolex::engine::testing {
@@ -29,6 +30,15 @@ public:
     void clear() {
         messages.clear();
         logLines.clear();
+    }
+
+    /// Expects this message and no other, then clears what was reported.
+    void take(std::string_view title, std::string_view text, int style) {
+        ASSERT_EQ(messages.size(), 1u);
+        EXPECT_EQ(messages[0].title, title);
+        EXPECT_EQ(messages[0].text, text);
+        EXPECT_EQ(messages[0].style, style);
+        clear();
     }
 
     std::vector<Message> messages;

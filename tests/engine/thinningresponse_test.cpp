@@ -94,12 +94,8 @@ TEST_F(ThinningFailureTest, UnreachableVolumeTripsTheIterationLimit) {
     EXPECT_FALSE(grow.NEWTON(2500.0f, 20.0f, 15.0f, vt, nr, gr));
     EXPECT_EQ(gr, 0.0f);
     EXPECT_EQ(nr, 0.0f);
-    ASSERT_EQ(report.messages.size(), 1u);
-    EXPECT_EQ(report.messages[0].title, titles::kOstran);
-    EXPECT_EQ(report.messages[0].text, "ERROR - Exceed iteration limit in Newton's Algorithm.");
-    EXPECT_EQ(report.messages[0].style, 48);
     EXPECT_TRUE(report.logLines.empty());
-    report.clear();
+    report.take(titles::kOstran, "ERROR - Exceed iteration limit in Newton's Algorithm.", 48);
 }
 
 TEST_F(ThinningFailureTest, NonPositiveVolumeFailsInAPowerAndIsReportedOnce) {
@@ -120,12 +116,6 @@ TEST_F(ThinningFailureTest, NonPositiveVolumeFailsInAPowerAndIsReportedOnce) {
         report.clear();
     }
 }
-
-} // namespace
-} // namespace arbolex::engine::testing
-
-namespace arbolex::engine::testing {
-namespace {
 
 // The thinning response keeps its last powers: a kept power must be the
 // power to the bit, an empty slot must match nothing, and a power that fails

@@ -7,7 +7,9 @@
 
 #include <gtest/gtest.h>
 
+#include <initializer_list>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace arbolex::estate::testing {
@@ -39,6 +41,15 @@ inline RowValues with(RowValues row, const std::string &name, const std::string 
         if (kHeader[i] == name) {
             row[i] = value;
         }
+    }
+    return row;
+}
+
+/// `row` with each named column's value replaced.
+inline RowValues with(RowValues row,
+                      std::initializer_list<std::pair<std::string, std::string>> values) {
+    for (const auto &[name, value] : values) {
+        row = with(std::move(row), name, value);
     }
     return row;
 }

@@ -7,6 +7,7 @@
 #include "document/documentcontroller.hpp"
 #include "estateio/gdallayer.hpp"
 #include "estatewindow/estatewindowlogic.hpp"
+#include "shell/testfiles.hpp"
 #include "shell/vbformat.hpp"
 
 #include <QCryptographicHash>
@@ -24,10 +25,7 @@ QString exampleEstate() {
 }
 
 QByteArray digestOf(const QString &path) {
-    QFile f(path);
-    return f.open(QIODevice::ReadOnly)
-               ? QCryptographicHash::hash(f.readAll(), QCryptographicHash::Sha256)
-               : QByteArray();
+    return QCryptographicHash::hash(readBytes(path), QCryptographicHash::Sha256);
 }
 
 class EstateWindowTest : public ThinningTest {
@@ -60,10 +58,8 @@ protected:
     }
 
     QString writeEstate(const char *name, const char *text) {
-        QString path = dir.filePath(QLatin1String(name));
-        QFile f(path);
-        EXPECT_TRUE(f.open(QIODevice::WriteOnly));
-        f.write(text);
+        const QString path = dir.filePath(QLatin1String(name));
+        EXPECT_TRUE(writeBytes(path, text));
         return path;
     }
 
@@ -208,27 +204,11 @@ TEST_F(EstateWindowTest, AnOpenedRowIsItsRegimeTypedByHandAsANewUnsavedDocument)
     ASSERT_GT(rotation, 30);
 
     // GL-01 by hand: the fixture's stand on 12.4 ha, 40 m³/ha every 5 years from 20.
-    logic.cmdClear_Click();
-    typeStand();
-    type(MainControl::txtNetArea, QStringLiteral("12.4"));
-    const auto growTo = [&](int age) {
-        type(MainControl::txtToA, QString::number(age));
-        type(MainControl::txtByA, QStringLiteral("1"));
-        logic.cmdGrow_Click();
-    };
+    std::vector<int> ages;
     for (int age = 20; age < rotation; age += 5) {
-        growTo(age);
-        if (age > 20) {
-            interactive.answers.append(false); // no thinning loop
-        }
-        logic.cmdThin_Click();
-        typeThin(ThinControl::txtRemV, QStringLiteral("40"));
-        thin.cmdThin_Click();
-        thin.cmdAccept_Click();
+        ages.push_back(age);
     }
-    growTo(rotation);
-    interactive.answers.clear(); // the final cut's offers taken, as in the replay
-    logic.cmdFinalCut_Click();
+    typeRotation(ages, {QStringLiteral("40")}, rotation, QStringLiteral("12.4"));
     ASSERT_TRUE(work.felled());
     const auto byHand = tableCells();
     const QString siteIndexByHand = work.siteIndexText();

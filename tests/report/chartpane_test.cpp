@@ -3,6 +3,7 @@
 #include "ui/guifixture.hpp"
 
 #include "charts/reportmessages.hpp"
+#include "shell/testfiles.hpp"
 #include "ui/chartpane.hpp"
 #include "ui/chartpanel.hpp"
 #include "ui/reportmenu.hpp"
@@ -58,9 +59,7 @@ TEST_F(ChartPaneTest, ReportThatCannotBeWrittenIsToldAndLogged) {
     EXPECT_FALSE(window.reportMenu()->exportReport(nowhere));
     ASSERT_EQ(interactive.messages.size(), 1);
     EXPECT_EQ(interactive.messages[0].text, charts::text::writeFailed(nowhere));
-    QFile errors(log.path());
-    ASSERT_TRUE(errors.open(QIODevice::ReadOnly));
-    EXPECT_TRUE(errors.readAll().contains("in frmMain.mnuExportReport_Click()"));
+    EXPECT_TRUE(readBytes(log.path()).contains("in frmMain.mnuExportReport_Click()"));
 
     EXPECT_TRUE(window.reportMenu()->exportReport(dir.filePath(QStringLiteral("report.pdf"))));
     EXPECT_EQ(interactive.messages.size(), 1);

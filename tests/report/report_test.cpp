@@ -10,6 +10,7 @@
 #include "prices/pricedata.hpp"
 #include "report/chartexport.hpp"
 #include "report/reportwriter.hpp"
+#include "shell/testfiles.hpp"
 
 #include <QDir>
 #include <QImage>
@@ -22,11 +23,7 @@ namespace {
 
 /// Pages of a PDF file: its page objects.
 int pdfPages(const QString &path) {
-    QFile file(path);
-    if (!file.open(QIODevice::ReadOnly)) {
-        return -1;
-    }
-    const QString pdf = QString::fromLatin1(file.readAll());
+    const QString pdf = QString::fromLatin1(readBytes(path));
     if (!pdf.startsWith(QLatin1String("%PDF"))) {
         return -1;
     }
@@ -158,9 +155,7 @@ TEST_F(ReportTest, ChartsExportAsPngAndSvgAndUnwritableFilesAreRefused) {
     EXPECT_EQ(image.size(), QSize(1280, 840)) << "twice the size, sharp in print";
     const QString svg = path(QStringLiteral("cash.svg"));
     ASSERT_TRUE(report::saveChartSvg(content.cashFlowChart, svg, QSize(640, 420)));
-    QFile file(svg);
-    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
-    const QString drawing = QString::fromUtf8(file.readAll());
+    const QString drawing = QString::fromUtf8(readBytes(svg));
     EXPECT_TRUE(drawing.contains(QLatin1String("<svg")));
     EXPECT_TRUE(drawing.contains(QLatin1String("<path"))) << "lines stay vectors";
 }
@@ -177,11 +172,8 @@ protected:
     ReportCommandTest() { EXPECT_TRUE(copyShippedData(dir.path())); }
 
     QString writeScript(const QString &name, const QByteArray &lines) const {
-        const QString script = path(name);
-        QFile file(script);
-        EXPECT_TRUE(file.open(QIODevice::WriteOnly));
-        file.write(lines);
-        return script;
+        EXPECT_TRUE(writeBytes(path(name), lines));
+        return path(name);
     }
 
     /// `arbolex-cli report ARGUMENTS` on the test's data folder: its exit

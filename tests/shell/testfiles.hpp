@@ -11,11 +11,10 @@
 
 namespace arbolex::testing {
 
-inline void writeBytes(const QString &path, const QByteArray &bytes) {
+/// Writes `bytes` as the whole file; false when it could not.
+inline bool writeBytes(const QString &path, const QByteArray &bytes) {
     QFile file(path);
-    if (file.open(QIODevice::WriteOnly)) {
-        file.write(bytes);
-    }
+    return file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size();
 }
 
 inline QByteArray readBytes(const QString &path) {

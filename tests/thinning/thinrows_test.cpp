@@ -25,9 +25,7 @@ TEST_F(ThinningTest, AcceptWithNothingRemovedStoresNothing) {
 }
 
 TEST_F(ThinningTest, AcceptedThinningRowShowsTheThinnedStandAndItsValue) {
-    openThinning();
-    typeThin(ThinControl::txtRemV, QStringLiteral("60"));
-    thin.cmdThin_Click();
+    previewThinning();
     const thinning::ThinningWork w = thin.work();
     thin.cmdAccept_Click();
     ASSERT_TRUE(interactive.messages.isEmpty());
@@ -56,9 +54,7 @@ TEST_F(ThinningTest, AcceptedThinningRowShowsTheThinnedStandAndItsValue) {
 }
 
 TEST_F(ThinningTest, GrowingOnContinuesFromTheThinnedStand) {
-    openThinning();
-    typeThin(ThinControl::txtRemV, QStringLiteral("60"));
-    thin.cmdThin_Click();
+    previewThinning();
     thin.cmdAccept_Click();
     const int thinRow = logic.table().lastRow();
     const RowRecord thinned = lastRow().record;

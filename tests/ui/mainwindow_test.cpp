@@ -5,6 +5,7 @@
 #include "work/worktexts.hpp"
 
 #include "engine/modeldescription.hpp"
+#include "shell/testfiles.hpp"
 #include "shell/vbformat.hpp"
 #include "ui/projectionmodel.hpp"
 #include "ui/windowtexts.hpp"
@@ -200,9 +201,7 @@ TEST_F(MainWindowGuiTest, ClosingTheWindowSavesPlacementAndStartupFile) {
     settings.sync();
     EXPECT_EQ(settings.value(QStringLiteral("Settings/MainWidth")).toInt(), 1160);
     EXPECT_EQ(settings.value(QStringLiteral("Settings/MainHeight")).toInt(), 720);
-    QFile startup(dir.filePath(QStringLiteral("IFPRM1.dat")));
-    ASSERT_TRUE(startup.open(QIODevice::ReadOnly));
-    EXPECT_TRUE(QString::fromLatin1(startup.readAll()).contains(QStringLiteral("22")));
+    EXPECT_TRUE(readBytes(dir.filePath(QStringLiteral("IFPRM1.dat"))).contains("22"));
 }
 
 } // namespace

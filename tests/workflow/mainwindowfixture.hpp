@@ -15,6 +15,10 @@
 #include <QFile>
 #include <QTemporaryDir>
 
+#include <initializer_list>
+#include <utility>
+#include <vector>
+
 #include <gtest/gtest.h>
 
 namespace arbolex::testing {
@@ -32,15 +36,32 @@ protected:
 
     void type(MainControl c, const QString &text) { logic.typeText(c, text); }
 
+    /// Types each field's text into `into`, in order.
+    static void typeFields(workflow::MainWindowLogic &into,
+                           std::initializer_list<std::pair<MainControl, QString>> fields) {
+        for (const auto &[control, text] : fields) {
+            into.typeText(control, text);
+        }
+    }
+
     /// Age 15, 2500 stems/ha, 7 m, 20 m²/ha, to `to` by `by`.
     void typeStand(const QString &to = QStringLiteral("50"),
                    const QString &by = QStringLiteral("5")) {
-        type(MainControl::txtFromA, QStringLiteral("15"));
-        type(MainControl::txtFromN, QStringLiteral("2500"));
-        type(MainControl::txtFromH, QStringLiteral("7"));
-        type(MainControl::txtFromB, QStringLiteral("20"));
-        type(MainControl::txtToA, to);
-        type(MainControl::txtByA, by);
+        typeFields(logic, {{MainControl::txtFromA, QStringLiteral("15")},
+                           {MainControl::txtFromN, QStringLiteral("2500")},
+                           {MainControl::txtFromH, QStringLiteral("7")},
+                           {MainControl::txtFromB, QStringLiteral("20")},
+                           {MainControl::txtToA, to},
+                           {MainControl::txtByA, by}});
+    }
+
+    /// The rows' cells, to compare tables.
+    std::vector<QStringList> tableCells() const {
+        std::vector<QStringList> all;
+        for (int r = 1; r <= logic.table().lastRow(); ++r) {
+            all.push_back(logic.table().row(r).cells);
+        }
+        return all;
     }
 
     QString cell(int row, int column) const { return logic.table().row(row).cells.value(column); }

@@ -20,14 +20,20 @@ class RotationTest : public ThinningTest {
 protected:
     RotationTest() { prices.selectPriceSet(prices::kCurrentPrices); }
 
+    /// The stand, its net area and the age it is grown to, in `into`.
+    static void typeSitka(workflow::MainWindowLogic &into, const QString &netArea,
+                          const QString &to) {
+        typeFields(into, {{MainControl::txtFromA, QStringLiteral("15")},
+                          {MainControl::txtFromN, QStringLiteral("2500")},
+                          {MainControl::txtFromH, QStringLiteral("9")},
+                          {MainControl::txtFromB, QStringLiteral("22")},
+                          {MainControl::txtNetArea, netArea},
+                          {MainControl::txtToA, to},
+                          {MainControl::txtByA, QStringLiteral("5")}});
+    }
+
     void growThinAndGrow(const QString &netArea = QStringLiteral("10")) {
-        type(MainControl::txtFromA, QStringLiteral("15"));
-        type(MainControl::txtFromN, QStringLiteral("2500"));
-        type(MainControl::txtFromH, QStringLiteral("9"));
-        type(MainControl::txtFromB, QStringLiteral("22"));
-        type(MainControl::txtNetArea, netArea);
-        type(MainControl::txtToA, QStringLiteral("30"));
-        type(MainControl::txtByA, QStringLiteral("5"));
+        typeSitka(logic, netArea, QStringLiteral("30"));
         logic.cmdGrow_Click();
         logic.cmdThin_Click();
         typeThin(ThinControl::txtRemV, QStringLiteral("50"));
@@ -35,15 +41,6 @@ protected:
         thin.cmdAccept_Click();
         type(MainControl::txtToA, QStringLiteral("60"));
         logic.cmdGrow_Click();
-    }
-
-    /// The rows' cells, to compare tables.
-    std::vector<QStringList> cells() const {
-        std::vector<QStringList> all;
-        for (int r = 1; r <= logic.table().lastRow(); ++r) {
-            all.push_back(logic.table().row(r).cells);
-        }
-        return all;
     }
 
     economics::NpvWindowLogic &npv = session.npv();
@@ -133,9 +130,7 @@ TEST_F(RotationTest, DecliningTheNetPresentValueLeavesItOff) {
 
 TEST_F(RotationTest, FinalCutAfterAThinningFellsWhatTheThinningLeft) {
     // The MAI is still rising at 30: the felling must not read as culmination.
-    openThinning(QStringLiteral("30"));
-    typeThin(ThinControl::txtRemV, QStringLiteral("50"));
-    thin.cmdThin_Click();
+    previewThinning(QStringLiteral("50"));
     thin.cmdAccept_Click();
     const int thinRow = logic.table().lastRow();
     const QStringList thinCells = logic.table().row(thinRow).cells;
@@ -223,18 +218,12 @@ TEST_F(RotationTest, DeletingRowsReopensTheRotationWhereItWas) {
     // the thinning gives.
     type(MainControl::txtToA, QStringLiteral("60"));
     logic.cmdGrow_Click();
-    const std::vector<QStringList> continued = cells();
+    const std::vector<QStringList> continued = tableCells();
 
     SessionServices freshRun(dir.path());
     MainWindowLogic &fresh = freshRun.logic;
     fresh.mnuModel_Click(0);
-    fresh.typeText(MainControl::txtFromA, QStringLiteral("15"));
-    fresh.typeText(MainControl::txtFromN, QStringLiteral("2500"));
-    fresh.typeText(MainControl::txtFromH, QStringLiteral("9"));
-    fresh.typeText(MainControl::txtFromB, QStringLiteral("22"));
-    fresh.typeText(MainControl::txtNetArea, QStringLiteral("10"));
-    fresh.typeText(MainControl::txtToA, QStringLiteral("60"));
-    fresh.typeText(MainControl::txtByA, QStringLiteral("5"));
+    typeSitka(fresh, QStringLiteral("10"), QStringLiteral("60"));
     fresh.cmdGrow_Click();
     ASSERT_EQ(fresh.table().lastRow(), static_cast<int>(continued.size()));
     for (int r = 1; r <= fresh.table().lastRow(); ++r) {
